@@ -1,0 +1,111 @@
+# Looks for an installed CDF library (see FindCDF.cmake).
+
+set(cdf_usual_places /usr/local/cdf /usr/local /opt/cdf /opt/local /opt/homebrew /usr
+  /Applications/cdf)
+set(cdf_what_to_do "Name a folder that holds include/cdf.h and lib/libcdf.so, libcdf.a or \
+libcdf.dylib of CDF version 3; or name none, and the library is looked for and else provided.")
+
+# Sets VARIABLE to why the header is not one of CDF version 3, or to nothing.
+function(cdf_check_header header variable)
+  file(STRINGS "${header}" version REGEX "^#define[ \t]+CDF_LIBRARY_VERSION[ \t]+3")
+  set(reason "")
+  if(NOT version)
+    set(reason "${header} is not the header of CDF version 3")
+  endif()
+  set(${variable} "${reason}" PARENT_SCOPE)
+endfunction()
+
+# Links and runs a program that asks the library for its version: sets VERSION, or REASON.
+function(cdf_check_library include library version_variable reason_variable)
+  try_run(ran compiled "${CMAKE_BINARY_DIR}/cdf-check"
+    "${PROJECT_SOURCE_DIR}/cmake/provision/cdf_version.c"
+    CMAKE_FLAGS "-DINCLUDE_DIRECTORIES=${include}"
+    LINK_LIBRARIES "${library}" m
+    COMPILE_OUTPUT_VARIABLE build_output
+    RUN_OUTPUT_VARIABLE version)
+  set(reason "")
+  if(NOT compiled)
+    set(reason "a program with ${include}/cdf.h and ${library} does not link:\n${build_output}")
+  elseif(NOT ran EQUAL 0)
+    set(reason "a program linked with ${library} does not run")
+  endif()
+  unset(ran CACHE)
+  unset(compiled CACHE)
+  set(${version_variable} "${version}" PARENT_SCOPE)
+  set(${reason_variable} "${reason}" PARENT_SCOPE)
+endfunction()
+
+# Looks in the given folders: sets cdf_reason to nothing and the results, or to what is wrong.
+function(cdf_look includes libraries)
+  unset(CDF_HEADER_DIR CACHE)
+  unset(CDF_LIBRARY_FILE CACHE)
+  find_path(CDF_HEADER_DIR cdf.h PATHS ${includes} NO_DEFAULT_PATH)
+  find_library(CDF_LIBRARY_FILE cdf PATHS ${libraries} NO_DEFAULT_PATH)
+  mark_as_advanced(CDF_HEADER_DIR CDF_LIBRARY_FILE)
+  if(NOT CDF_HEADER_DIR)
+    set(reason "cdf.h was not found in: ${includes}")
+  elseif(NOT CDF_LIBRARY_FILE)
+    set(reason "libcdf (.so, .a, .dylib) was not found in: ${libraries}")
+  else()
+    cdf_check_header("${CDF_HEADER_DIR}/cdf.h" reason)
+  endif()
+  if(NOT reason)
+    cdf_check_library("${CDF_HEADER_DIR}" "${CDF_LIBRARY_FILE}" version reason)
+  endif()
+  set(cdf_reason "${reason}" PARENT_SCOPE)
+  set(cdf_version "${version}" PARENT_SCOPE)
+endfunction()
+
+# As cdf_look for one installation that the user named; stops when it is not one.
+macro(cdf_look_named name includes libraries)
+  cdf_look("${includes}" "${libraries}")
+  if(cdf_reason)
+    message(FATAL_ERROR "CDF: ${name} does not lead to a usable CDF library: ${cdf_reason}\n"
+      "${cdf_what_to_do}")
+  endif()
+endmacro()
+
+macro(cdf_search)
+  set(cdf_reason "not looked for")
+  if(CDF_ROOT)
+    cdf_look_named("CDF_ROOT (${CDF_ROOT})" "${CDF_ROOT}/include" "${CDF_ROOT}/lib;${CDF_ROOT}/lib64")
+  elseif(DEFINED ENV{CDF_ROOT})
+    set(base "$ENV{CDF_ROOT}")
+    cdf_look_named("CDF_ROOT (${base}, environment)" "${base}/include" "${base}/lib;${base}/lib64")
+  elseif(DEFINED ENV{CDF_INC} AND DEFINED ENV{CDF_LIB})
+    cdf_look_named("CDF_INC and CDF_LIB (environment)" "$ENV{CDF_INC}" "$ENV{CDF_LIB}")
+  elseif(DEFINED ENV{CDF_BASE})
+    set(base "$ENV{CDF_BASE}")
+    cdf_look_named("CDF_BASE (${base}, environment)" "${base}/include" "${base}/lib;${base}/lib64")
+  else()
+    set(places "${cdf_usual_places}")
+    list(TRANSFORM places APPEND /include OUTPUT_VARIABLE includes)
+    list(TRANSFORM places APPEND /include/cdf OUTPUT_VARIABLE subfolders)
+    list(TRANSFORM places APPEND /lib OUTPUT_VARIABLE libraries)
+    list(TRANSFORM places APPEND /lib64 OUTPUT_VARIABLE libraries64)
+    if(CMAKE_LIBRARY_ARCHITECTURE)
+      list(APPEND libraries "/usr/lib/${CMAKE_LIBRARY_ARCHITECTURE}")
+    endif()
+    cdf_look("${includes};${subfolders}" "${libraries};${libraries64}")
+  endif()
+  if(NOT cdf_reason)
+    set(cdf_found TRUE)
+    set(cdf_include "${CDF_HEADER_DIR}")
+    set(cdf_place "${CDF_LIBRARY_FILE}")
+    cdf_import_found()
+  endif()
+endmacro()
+
+# Sets cdf_link to a target for the library that was found, and cdf_samples.
+macro(cdf_import_found)
+  add_library(cdf_installed UNKNOWN IMPORTED GLOBAL)
+  set_target_properties(cdf_installed PROPERTIES
+    IMPORTED_LOCATION "${CDF_LIBRARY_FILE}"
+    IMPORTED_NO_SONAME ON)
+  set(cdf_link cdf_installed m)
+  get_filename_component(cdf_base "${CDF_HEADER_DIR}" DIRECTORY)
+  set(cdf_samples "")
+  if(EXISTS "${cdf_base}/samples/example1.cdf")
+    set(cdf_samples "${cdf_base}/samples")
+  endif()
+endmacro()

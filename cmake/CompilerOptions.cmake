@@ -1,0 +1,46 @@
+# The language, the warnings, the sanitizers and the run paths that every target shares.
+
+set(CMAKE_CXX_STANDARD 20)
+set(CMAKE_CXX_STANDARD_REQUIRED ON)
+set(CMAKE_CXX_EXTENSIONS OFF)
+set(CMAKE_EXPORT_COMPILE_COMMANDS ON)
+if(NOT CMAKE_BUILD_TYPE AND NOT CMAKE_CONFIGURATION_TYPES)
+  set(CMAKE_BUILD_TYPE RelWithDebInfo CACHE STRING "Build type" FORCE)
+endif()
+
+find_program(AMBRIX_CCACHE ccache DOC "Compiler cache, used when it is there")
+mark_as_advanced(AMBRIX_CCACHE)
+foreach(language C CXX)
+  if(AMBRIX_CCACHE AND NOT CMAKE_${language}_COMPILER_LAUNCHER)
+    set(CMAKE_${language}_COMPILER_LAUNCHER "${AMBRIX_CCACHE}")
+  endif()
+endforeach()
+
+# An installation's layout in the build tree, and relative run paths, so that either can be moved.
+set(CMAKE_RUNTIME_OUTPUT_DIRECTORY "${CMAKE_BINARY_DIR}/bin")
+set(CMAKE_LIBRARY_OUTPUT_DIRECTORY "${CMAKE_BINARY_DIR}/lib")
+set(CMAKE_ARCHIVE_OUTPUT_DIRECTORY "${CMAKE_BINARY_DIR}/lib")
+set(CMAKE_BUILD_RPATH_USE_ORIGIN ON)
+set(CMAKE_INSTALL_RPATH "$ORIGIN/../lib;$ORIGIN;$ORIGIN/..")
+set(CMAKE_INSTALL_RPATH_USE_LINK_PATH ON)
+set(CMAKE_INSTALL_LIBDIR lib)
+
+# What our own code is compiled with. The CDF library's sources are not ours and do not get it.
+add_library(ambrix_options INTERFACE)
+target_compile_options(ambrix_options INTERFACE
+  -Wall -Wextra -Wpedantic -Wconversion -Wsign-conversion -Wold-style-cast
+  -Wnon-virtual-dtor -Woverloaded-virtual -Wcast-align -Wcast-qual -Wundef
+  -Wdouble-promotion -Wimplicit-fallthrough -Wextra-semi
+  $<$<CXX_COMPILER_ID:GNU>:-Wduplicated-cond -Wduplicated-branches -Wlogical-op
+    -Wsuggest-override -Wshadow=local>
+  $<$<CXX_COMPILER_ID:Clang,AppleClang>:-Wshadow>)
+if(AMBRIX_WERROR)
+  target_compile_options(ambrix_options INTERFACE -Werror)
+endif()
+
+if(AMBRIX_SANITIZE)
+  add_compile_options(-fsanitize=address -fno-omit-frame-pointer)
+  add_link_options(-fsanitize=address,undefined)
+  target_compile_options(ambrix_options INTERFACE
+    -fsanitize=undefined -fno-sanitize-recover=all)
+endif()
