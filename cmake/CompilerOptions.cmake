@@ -16,14 +16,16 @@ foreach(language C CXX)
   endif()
 endforeach()
 
-# An installation's layout in the build tree, and relative run paths, so that either can be moved.
+# The build tree is laid out like an installation and both use the same relative run paths, so that
+# either can be moved. (The run paths of the build are not padded for a rewrite at installation:
+# the padding would make the loader look in the current directory.)
+set(CMAKE_INSTALL_LIBDIR lib)
 set(CMAKE_RUNTIME_OUTPUT_DIRECTORY "${CMAKE_BINARY_DIR}/bin")
 set(CMAKE_LIBRARY_OUTPUT_DIRECTORY "${CMAKE_BINARY_DIR}/lib")
 set(CMAKE_ARCHIVE_OUTPUT_DIRECTORY "${CMAKE_BINARY_DIR}/lib")
-set(CMAKE_BUILD_RPATH_USE_ORIGIN ON)
-set(CMAKE_INSTALL_RPATH "$ORIGIN/../lib;$ORIGIN;$ORIGIN/..")
+set(CMAKE_BUILD_WITH_INSTALL_RPATH ON)
+set(CMAKE_INSTALL_RPATH "$ORIGIN/../lib")
 set(CMAKE_INSTALL_RPATH_USE_LINK_PATH ON)
-set(CMAKE_INSTALL_LIBDIR lib)
 
 # What our own code is compiled with. The CDF library's sources are not ours and do not get it.
 add_library(ambrix_options INTERFACE)

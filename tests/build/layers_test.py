@@ -1,0 +1,62 @@
+"""A folder of the module can include the folders that it may, and no other: else it cannot compile.
+
+Each include is tried with the very command that compiles a source of the folder.
+usage: layers_test.py BUILD_FOLDER
+"""
+import json
+import pathlib
+import shlex
+import subprocess
+import sys
+import tempfile
+import unittest
+
+BUILD = pathlib.Path(sys.argv.pop())
+COMMANDS = json.loads((BUILD / "compile_commands.json").read_text())
+ROOT = pathlib.Path(__file__).resolve().parents[2]
+MAY_SEE = {
+    "gateway": {"host", "gateway"},
+    "constants": {"host", "gateway", "constants"},
+    "variables": {"host", "gateway", "constants", "variables"},
+    "attributes": {"host", "gateway", "constants", "variables", "attributes"},
+    "file": {"host", "gateway", "constants", "variables", "file"},
+    "epoch": {"host", "gateway", "constants", "epoch"},
+}
+
+
+def header_of(folder):
+    """A header of the folder, as an include names it."""
+    return min((ROOT / folder).rglob("*.h")).relative_to(ROOT)
+
+
+def command_of(folder):
+    """How the first source of the folder is compiled, the command table apart."""
+    for entry in COMMANDS:
+        source = pathlib.Path(entry["file"])
+        if source.parent.name == folder and source.name != "command_table.cc":
+            arguments = shlex.split(entry["command"])
+            return entry["directory"], arguments[:arguments.index("-o")]
+    raise LookupError(f"no source of {folder}/ is compiled")
+
+
+def sees(folder, other):
+    """Whether the compiler, as called for a source of the folder, finds a header of the other."""
+    directory, arguments = command_of(folder)
+    with tempfile.NamedTemporaryFile("w", suffix=".cc") as probe:
+        probe.write(f'#if !__has_include("{header_of(other)}")\n#error\n#endif\n')
+        probe.flush()
+        done = subprocess.run([*arguments, "-fsyntax-only", probe.name], cwd=directory,
+                              stderr=subprocess.DEVNULL, check=False)
+    return done.returncode == 0
+
+
+class LayersTest(unittest.TestCase):
+    def test_each_folder_sees_what_it_may_and_nothing_else(self):
+        for folder, allowed in MAY_SEE.items():
+            with self.subTest(folder=folder):
+                seen = {other for other in ("host", "adapters", *MAY_SEE) if sees(folder, other)}
+                self.assertEqual(seen, allowed)
+
+
+if __name__ == "__main__":
+    unittest.main()

@@ -1,0 +1,15 @@
+# What the tests named in `tests` run under: no setting that the CDF library takes from the
+# environment, and what the sanitizers need to know about that library.
+if(tests)
+  set(supp "${CMAKE_CURRENT_LIST_DIR}/sanitizers")
+  set(environment
+    "ASAN_OPTIONS=suppressions=${supp}/asan.supp:detect_stack_use_after_return=1"
+    "UBSAN_OPTIONS=print_stacktrace=1"
+    "PYTHONDONTWRITEBYTECODE=1")
+  set(unset CDF_VALIDATE=unset: CDF_CHECKSUM=unset: CDF_FILEBACKWARD=unset: CDF_TMP=unset:
+    CDF_LEAPSECONDSTABLE=unset:)
+  set_tests_properties(${tests} PROPERTIES
+    ENVIRONMENT "${environment}"
+    ENVIRONMENT_MODIFICATION "${unset}"
+    TIMEOUT 120)
+endif()
