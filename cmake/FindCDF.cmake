@@ -2,7 +2,7 @@
 #
 # Looked for in this order; a place that was named must hold it, else configuration stops:
 #   1. -DCDF_ROOT=... or the environment variable CDF_ROOT: a folder with include/ and lib/
-#   2. the environment variables CDF_INC and CDF_LIB, or CDF_BASE, as the official distribution's
+#   2. the environment variables CDF_BASE, or CDF_INC and CDF_LIB, as the official distribution's
 #      definition files set them
 #   3. the system's usual places
 #   4. provisioned: 3.9.1 on Linux x86-64, otherwise 3.6.3 built from source
