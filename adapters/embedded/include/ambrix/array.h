@@ -72,12 +72,16 @@ class [[gnu::visibility("default")]] Array : public ArrayView {
   static Array fromNarrow(std::string_view bytes);
 
   /// A cell array with no element set.
-  static Array cell(Sizes sizes) { return zeros(ClassId::kCell, sizes); }
+  static Array cell(Sizes sizes) {
+    return zeros(ClassId::kCell, sizes);
+  }
   /// Puts an array into a cell array, in place of what was there. Throws like `element`.
   void setElement(std::size_t index, Array value);
 
   /// A deep copy.
-  [[nodiscard]] Array clone() const { return copyOf(*this); }
+  [[nodiscard]] Array clone() const {
+    return copyOf(*this);
+  }
   static Array copyOf(ArrayView array);
 
   /// The elements for writing. Throws std::logic_error when the class holds other values.

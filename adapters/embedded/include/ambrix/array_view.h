@@ -64,9 +64,13 @@ class [[gnu::visibility("default")]] ArrayView {
   constexpr explicit ArrayView(const qvArray* array) noexcept : array_(array) {}
 
   /// Whether there is an array.
-  constexpr explicit operator bool() const noexcept { return array_ != nullptr; }
+  constexpr explicit operator bool() const noexcept {
+    return array_ != nullptr;
+  }
   /// The array as the module's interface knows it.
-  [[nodiscard]] constexpr const qvArray* handle() const noexcept { return array_; }
+  [[nodiscard]] constexpr const qvArray* handle() const noexcept {
+    return array_;
+  }
 
   [[nodiscard]] ClassId classId() const noexcept;
   [[nodiscard]] const char* className() const noexcept;
@@ -86,7 +90,9 @@ class [[gnu::visibility("default")]] ArrayView {
 
   /// The units of a character array, first dimension fastest. Throws std::logic_error for others.
   [[nodiscard]] std::u16string_view chars() const;
-  [[nodiscard]] std::u16string text() const { return std::u16string(chars()); }
+  [[nodiscard]] std::u16string text() const {
+    return std::u16string(chars());
+  }
   /// The same as UTF-8; an unpaired surrogate becomes U+FFFD.
   [[nodiscard]] std::string utf8() const;
 

@@ -1,0 +1,147 @@
+#include "adapters/embedded/array_object.h"
+
+#include <algorithm>
+#include <cstdint>
+#include <cstring>
+#include <memory>
+#include <new>
+#include <stdexcept>
+#include <type_traits>
+
+#include "adapters/embedded/allocation.h"
+#include "adapters/embedded/host_errors.h"
+
+static_assert(std::is_standard_layout_v<qvArray>, "an array is found by its place on a list");
+
+namespace ambrix {
+namespace {
+
+constexpr std::size_t kMostInlineBytes = 256;
+constexpr std::size_t kAlignment = alignof(std::max_align_t);
+
+struct Shape {
+  std::span<const std::size_t> sizes;  // without trailing 1s; may be fewer than two
+  std::size_t dimensionCount = 0;
+  std::size_t elementCount = 1;
+  std::size_t bytes = 0;
+};
+
+std::size_t multiply(std::size_t a, std::size_t b) {
+  std::size_t product = 0;
+  if (__builtin_mul_overflow(a, b, &product)) raiseOutOfMemory();
+  return product;
+}
+
+std::size_t countElements(std::span<const std::size_t> sizes) {
+  if (sizes.empty() || std::ranges::find(sizes, 0U) != sizes.end()) return 0;
+  std::size_t count = 1;
+  for (const std::size_t size : sizes)
+    count = multiply(count, size);
+  return count;
+}
+
+Shape shapeOf(qvClassID classId, std::span<const std::size_t> sizes) {
+  if (std::ranges::any_of(sizes, [](std::size_t size) { return size > PTRDIFF_MAX; })) {
+    raiseBadDimension();
+  }
+  Shape shape;
+  while (sizes.size() > 2 && sizes.back() == 1)
+    sizes = sizes.first(sizes.size() - 1);
+  shape.sizes = sizes;
+  shape.dimensionCount = std::max<std::size_t>(sizes.size(), 2);
+  shape.elementCount = countElements(sizes);
+  shape.bytes = multiply(shape.elementCount, elementBytes(classId));
+  requireWithinLimit(shape.bytes);
+  return shape;
+}
+
+/// Sizes that are not given are 1, but no sizes at all make 0-by-0.
+void storeSizes(qvArray& array, const Shape& shape) {
+  std::fill_n(array.sizes(), shape.dimensionCount, shape.sizes.empty() ? 0U : 1U);
+  std::ranges::copy(shape.sizes, array.sizes());
+}
+
+std::size_t roundUp(std::size_t bytes) {
+  return (bytes + kAlignment - 1) / kAlignment * kAlignment;
+}
+
+struct Release {
+  void operator()(void* memory) const noexcept { release(memory); }
+};
+
+}  // namespace
+
+std::size_t elementBytes(qvClassID classId) noexcept {
+  switch (classId) {
+    case qvLOGICAL_CLASS:
+    case qvINT8_CLASS:
+    case qvUINT8_CLASS:
+      return 1;
+    case qvCHAR_CLASS:
+    case qvINT16_CLASS:
+    case qvUINT16_CLASS:
+      return 2;
+    case qvSINGLE_CLASS:
+    case qvINT32_CLASS:
+    case qvUINT32_CLASS:
+      return 4;
+    case qvCELL_CLASS:
+    case qvDOUBLE_CLASS:
+    case qvINT64_CLASS:
+    case qvUINT64_CLASS:
+      return 8;
+    case qvUNKNOWN_CLASS:
+    case qvSTRUCT_CLASS:
+      break;
+  }
+  return 0;
+}
+
+qvArray* makeArray(qvClassID classId, std::span<const std::size_t> sizes, Content content) {
+  if (elementBytes(classId) == 0) throw std::logic_error("no array can have this class");
+  const Shape shape = shapeOf(classId, sizes);
+  const bool zeroed = content == Content::kZero || classId == qvCELL_CLASS;
+  const bool isInline = shape.bytes <= kMostInlineBytes;
+  const std::size_t headBytes =
+      roundUp(sizeof(qvArray) + shape.dimensionCount * sizeof(std::size_t));
+
+  std::unique_ptr<void, Release> block(allocate(headBytes + (isInline ? shape.bytes : 0)));
+  auto* const array = new (block.get()) qvArray;
+  array->classId = classId;
+  array->elementCount = shape.elementCount;
+  array->dimensionCount = shape.dimensionCount;
+  array->ownsElements = !isInline;
+  storeSizes(*array, shape);
+  if (!isInline) {
+    array->elements = zeroed ? allocateZeroed(shape.bytes) : allocate(shape.bytes);
+  } else if (shape.bytes != 0) {
+    array->elements = static_cast<std::byte*>(block.get()) + headBytes;
+    if (zeroed) std::memset(array->elements, 0, shape.bytes);
+  }
+  countArray(1);
+  block.release();
+  return array;
+}
+
+void destroyArray(qvArray* array) noexcept {
+  if (array == nullptr) return;
+  TrackedList::remove(array->place);
+  // Cells nest as deep as anyone likes: what is still to be freed is chained, not recursed into.
+  Tracked* pending = &array->place;
+  while (pending != nullptr) {
+    auto* const next = reinterpret_cast<qvArray*>(pending);
+    pending = next->place.next;
+    if (next->classId == qvCELL_CLASS) {
+      for (qvArray* const cell : next->cells()) {
+        if (cell == nullptr) continue;
+        cell->place.next = pending;
+        pending = &cell->place;
+      }
+    }
+    if (next->ownsElements) release(next->elements);
+    release(next);
+    countArray(-1);
+  }
+}
+
+}  // namespace ambrix

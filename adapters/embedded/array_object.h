@@ -1,0 +1,58 @@
+// The array behind the handle that the module sees.
+#pragma once
+
+#include <cstddef>
+#include <span>
+#include <string_view>
+
+#include "adapters/embedded/exported_interface.h"
+#include "adapters/embedded/tracked_list.h"
+
+/// One block of memory: this, the sizes and, when they are few, the elements. Many elements have
+/// a block of their own.
+struct alignas(std::max_align_t) qvArray {
+  ambrix::Tracked place;  // must stay first: lists hold this
+  qvClassID classId = qvUNKNOWN_CLASS;
+  bool ownsElements = false;  // in a block of their own
+  std::size_t elementCount = 0;
+  std::size_t dimensionCount = 0;
+  void* elements = nullptr;  // null when there are none
+
+  [[nodiscard]] std::size_t* sizes() { return reinterpret_cast<std::size_t*>(this + 1); }
+  [[nodiscard]] const std::size_t* sizes() const {
+    return reinterpret_cast<const std::size_t*>(this + 1);
+  }
+  /// The elements of a cell array.
+  [[nodiscard]] std::span<qvArray*> cells() const {
+    return {static_cast<qvArray**>(elements), elementCount};
+  }
+};
+
+namespace ambrix {
+
+/// Bytes of an element; 0 for a class that arrays cannot have.
+std::size_t elementBytes(qvClassID classId) noexcept;
+
+enum class Content { kZero, kUnset };
+
+/// A new array that is on no list and belongs to the caller. Cells are always unset. Raises the
+/// host's errors; throws std::logic_error for a class that arrays cannot have.
+qvArray* makeArray(qvClassID classId, std::span<const std::size_t> sizes, Content content);
+
+/// A deep copy that is on no list and belongs to the caller.
+qvArray* copyArray(const qvArray& array);
+
+/// A 1-by-N text of these units, or of byte b as the unit b; an empty one is 0-by-0.
+qvArray* makeText(std::u16string_view units);
+qvArray* makeNarrowText(std::string_view bytes);
+
+/// The place of a cell. Throws std::logic_error for other classes and std::out_of_range.
+qvArray*& cellAt(const qvArray& array, std::size_t index);
+/// Makes the cell array the owner of the value, which may be null, and frees what it held there.
+/// Throws like `cellAt`.
+void setCell(const qvArray& array, std::size_t index, qvArray* value);
+
+/// Frees the array with all it holds, taking it off its list. Null is fine.
+void destroyArray(qvArray* array) noexcept;
+
+}  // namespace ambrix

@@ -1,0 +1,55 @@
+#include "ambrix/error.h"
+
+#include "adapters/catalogue/message_catalogue.h"
+#include "adapters/embedded/exported_interface.h"
+#include "adapters/embedded/host_errors.h"
+
+namespace ambrix {
+
+struct Error::Content {
+  explicit Content(const MessageId& from)
+      : id(from), identifier(from.fullIdentifier()), text(catalogue::messageText(from)) {}
+
+  MessageId id;
+  std::string identifier;
+  std::string text;
+};
+
+Error::Error(const MessageId& id) : content_(std::make_shared<const Content>(id)) {}
+Error::~Error() = default;
+
+const char* Error::what() const noexcept {
+  return content_->text.c_str();
+}
+const std::string& Error::identifier() const noexcept {
+  return content_->identifier;
+}
+const std::vector<MessageArg>& Error::values() const noexcept {
+  return content_->id.values;
+}
+const MessageId& Error::id() const noexcept {
+  return content_->id;
+}
+
+LoadError::~LoadError() = default;
+
+std::string messageText(const MessageId& id) {
+  return catalogue::messageText(id);
+}
+
+void raiseBadDimension() {
+  throw Error(MessageId("TOLVEX:host", "badDimension"));
+}
+void raiseOutOfMemory() {
+  throw Error(MessageId("TOLVEX:host", "outOfMemory"));
+}
+
+}  // namespace ambrix
+
+void qvErrMsgId(const TOLVEX::ambrix::MessageId& id) {
+  throw ambrix::Error(id);
+}
+
+void qvGetMessageText(const TOLVEX::ambrix::MessageId& id, std::string& text) {
+  text = ambrix::catalogue::messageText(id);
+}
