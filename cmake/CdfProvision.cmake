@@ -2,7 +2,7 @@
 
 # Fetches part of it (source or library) into AMBRIX_CDF_CACHE unless it is there already.
 function(cdf_fetch part folder)
-  if(EXISTS "${AMBRIX_CDF_CACHE}/${folder}")
+  if(EXISTS "${AMBRIX_CDF_CACHE}/${folder}" AND EXISTS "${AMBRIX_CDF_CACHE}/samples")
     return()
   endif()
   find_program(AMBRIX_PYTHON3 python3)

@@ -7,9 +7,9 @@ libcdf.dylib of CDF version 3; or name none, and the library is looked for and e
 
 # Sets VARIABLE to why the header is not one of CDF version 3, or to nothing.
 function(cdf_check_header header variable)
-  file(STRINGS "${header}" version REGEX "^#define[ \t]+CDF_LIBRARY_VERSION[ \t]+3")
+  file(STRINGS "${header}" added_by_version_3 REGEX "CDF_EPOCH16")
   set(reason "")
-  if(NOT version)
+  if(NOT added_by_version_3)
     set(reason "${header} is not the header of CDF version 3")
   endif()
   set(${variable} "${reason}" PARENT_SCOPE)
@@ -18,7 +18,7 @@ endfunction()
 # Links and runs a program that asks the library for its version: sets VERSION, or REASON.
 function(cdf_check_library include library version_variable reason_variable)
   try_run(ran compiled "${CMAKE_BINARY_DIR}/cdf-check"
-    "${PROJECT_SOURCE_DIR}/cmake/provision/cdf_version.c"
+    "${PROJECT_SOURCE_DIR}/cmake/cdf_version.c"
     CMAKE_FLAGS "-DINCLUDE_DIRECTORIES=${include}"
     LINK_LIBRARIES "${library}" m
     COMPILE_OUTPUT_VARIABLE build_output
@@ -61,7 +61,7 @@ endfunction()
 macro(cdf_look_named name includes libraries)
   cdf_look("${includes}" "${libraries}")
   if(cdf_reason)
-    message(FATAL_ERROR "CDF: ${name} does not lead to a usable CDF library: ${cdf_reason}\n"
+    message(FATAL_ERROR "${name} does not lead to a usable CDF library: ${cdf_reason}\n"
       "${cdf_what_to_do}")
   endif()
 endmacro()
@@ -97,10 +97,17 @@ endmacro()
 
 # Sets cdf_link to a target for the library that was found, and cdf_samples.
 macro(cdf_import_found)
-  add_library(cdf_installed UNKNOWN IMPORTED GLOBAL)
-  set_target_properties(cdf_installed PROPERTIES
-    IMPORTED_LOCATION "${CDF_LIBRARY_FILE}"
-    IMPORTED_NO_SONAME ON)
+  file(REMOVE "${CMAKE_BINARY_DIR}/lib/libcdf.so")  # one provided earlier would be loaded instead
+  set(cdf_kind SHARED)
+  if(CDF_LIBRARY_FILE MATCHES "\\.a$")
+    set(cdf_kind STATIC)
+  endif()
+  add_library(cdf_installed ${cdf_kind} IMPORTED GLOBAL)
+  set_target_properties(cdf_installed PROPERTIES IMPORTED_LOCATION "${CDF_LIBRARY_FILE}")
+  if(cdf_kind STREQUAL "SHARED")
+    # Several of its releases carry no SONAME; their path would then be recorded instead.
+    set_target_properties(cdf_installed PROPERTIES IMPORTED_NO_SONAME ON)
+  endif()
   set(cdf_link cdf_installed m)
   get_filename_component(cdf_base "${CDF_HEADER_DIR}" DIRECTORY)
   set(cdf_samples "")

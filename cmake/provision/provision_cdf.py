@@ -7,6 +7,7 @@ usage: provision_cdf.py CACHE {source,library}
            official installation: the shared library of 3.9.1 with the header of 3.6.3, which fits
            every version of the library from there on
 
+Either way CACHE/samples leads to the sample files.
 Both are pinned by checksum in the requirement files beside this script. A folder that is already
 there is left alone, so only the first run needs the network.
 """
@@ -39,7 +40,7 @@ class ProvisionError(Exception):
 def run(*command, **settings):
     """Runs a command quietly; what it printed becomes part of the error when it fails."""
     done = subprocess.run(command, stdout=subprocess.PIPE, stderr=subprocess.STDOUT, text=True,
-                          **settings)
+                          check=False, **settings)
     if done.returncode != 0:
         raise ProvisionError(f"{' '.join(map(str, command))} failed:\n{done.stdout.strip()}")
 
@@ -68,8 +69,7 @@ def download(python, requirements, folder, *options, **environment):
     return next(folder.iterdir())
 
 
-def fetch_source(work, target):
-    python = make_pip(work / "venv")
+def fetch_source(python, work, target):
     pip(python, "install", "--require-hashes", "-r", HERE / "build-tools.txt")
     archive = download(python, "cdf-3.6.3-source.txt", work / "sdist", "--no-build-isolation",
                        "--no-binary", ":all:", PYTHONPATH=str(HERE))
@@ -79,8 +79,7 @@ def fetch_source(work, target):
     (next((work / "tree").iterdir()) / "cdf36_3-dist").rename(target)
 
 
-def fetch_library(source, work, target):
-    python = make_pip(work / "venv")
+def fetch_library(python, source, work, target):
     wheel = download(python, "cdf-3.9.1-linux-x86_64.txt", work / "wheel", "--only-binary", ":all:")
     library = zipfile.ZipFile(wheel).read("spacepy/libcdf.so")
     if hashlib.sha256(library).hexdigest() != LIBRARY_SHA256:
@@ -96,33 +95,36 @@ def fetch_library(source, work, target):
     (target / "README").write_text(README)
 
 
-def provide(cache, name, fetch):
-    """Makes CACHE/name with fetch(work, target) unless it is there; whole or not at all."""
-    final = cache / name
-    if final.is_dir():
-        return final
-    print(f"Fetching {name} (once)", flush=True)
-    with tempfile.TemporaryDirectory(dir=cache) as work:
-        made = pathlib.Path(work) / "made"
-        fetch(pathlib.Path(work), made)
-        made.rename(final)
-    return final
+def provision(cache, part):
+    """Makes the folders that the part needs and that are not there; each whole or not at all."""
+    source, library = cache / "cdf-3.6.3-source", cache / "cdf-3.9.1"
+    wanted = [source] if part == "source" else [source, library]
+    if all(folder.is_dir() for folder in wanted):
+        return
+    with tempfile.TemporaryDirectory(dir=cache) as name:
+        work = pathlib.Path(name)
+        python = make_pip(work / "venv")
+        if not source.is_dir():
+            fetch_source(python, work, work / "source")
+            (work / "source").rename(source)
+        if library in wanted:
+            fetch_library(python, source, work, work / "library")
+            (work / "library").rename(library)
 
 
 def main():
     if len(sys.argv) != 3 or sys.argv[2] not in ("source", "library"):
         sys.exit(__doc__)
     cache = pathlib.Path(sys.argv[1]).resolve()
-    cache.mkdir(parents=True, exist_ok=True)
-    with open(cache / ".lock", "w") as lock:
-        fcntl.flock(lock, fcntl.LOCK_EX)  # builds that start together download once
-        try:
-            source = provide(cache, "cdf-3.6.3-source", fetch_source)
-            if sys.argv[2] == "library":
-                provide(cache, "cdf-3.9.1",
-                        lambda work, target: fetch_library(source, work, target))
-        except (ProvisionError, OSError) as error:
-            sys.exit(f"provision_cdf: {error}")
+    try:
+        cache.mkdir(parents=True, exist_ok=True)
+        with open(cache / ".lock", "w", encoding="ascii") as lock:
+            fcntl.flock(lock, fcntl.LOCK_EX)  # builds that start together download once
+            provision(cache, sys.argv[2])
+            if not (cache / "samples").exists():
+                (cache / "samples").symlink_to("cdf-3.6.3-source/samples")
+    except (ProvisionError, OSError) as error:
+        sys.exit(f"provision_cdf: {error}")
 
 
 if __name__ == "__main__":
