@@ -1,0 +1,101 @@
+#include "attributes/attribute_entries.h"
+
+#include "attributes/attribute_calls.h"
+#include "gateway/errors.h"
+#include "gateway/open_file_registry.h"
+#include "gateway/outputs.h"
+#include "gateway/raise_error.h"
+#include "gateway/value_buffer.h"
+#include "variables/datatypes.h"
+#include "variables/library_data.h"
+
+namespace TOLVEX::ambrix {
+namespace {
+
+struct EntryAddress {
+  CdfId file;
+  long attribute;
+  long entry;
+};
+
+EntryAddress getEntryAddressArgs(const qvArray* arguments[], const char* attributeLabel) {
+  // Braces convert from left to right.
+  return {getCdfIdArg(arguments[0]), getAttributeArg(arguments[1], attributeLabel),
+          getEntryArg(arguments[2])};
+}
+
+struct EntryDescription {
+  long datatype = 0;
+  long elements = 0;
+};
+
+EntryDescription inquire(const EntryKind& kind, const EntryAddress& at) {
+  EntryDescription found;
+  checkLibraryStatus(CDFinquireAttrEntry(libraryHandle(at.file, kind.inquireRoutine), kind.kind,
+                                         at.attribute, at.entry, &found.datatype, &found.elements),
+                     kind.inquireRoutine);
+  return found;
+}
+
+const EntryKind& kindForScope(long scope) {
+  switch (scope) {
+    case GLOBAL_SCOPE:
+      return kGEntry;
+    case VARIABLE_SCOPE:
+      return kZEntry;
+    default:
+      raiseError(cdflib::unrecognizedValue(scope, "SCOPE"));
+  }
+}
+
+}  // namespace
+
+void getEntry(const EntryKind& kind, qvArray* outputs[], const qvArray* arguments[]) {
+  const EntryAddress at = getEntryAddressArgs(arguments, "ATTRNUM");
+  const EntryDescription entry = inquire(kind, at);
+  validateDatatype(entry.datatype);  // before the library is given a buffer for its values
+  if (entry.elements < 0) raiseLibraryFailure(BAD_NUM_ELEMS, kind.getRoutine);
+  ValueBuffer buffer;
+  resizeValueBuffer(buffer, entry.datatype, entry.elements);
+  unsigned char nothing = 0;
+  checkLibraryStatus(
+      CDFgetAttrEntry(libraryHandle(at.file, kind.getRoutine), kind.kind, at.attribute, at.entry,
+                      buffer.empty() ? &nothing : buffer.data()),
+      kind.getRoutine);
+  outputs[0] = createArrayFromBuffer(buffer, entry.datatype);
+}
+
+void inquireEntry(const EntryKind& kind, qvArray* outputs[], const qvArray* arguments[]) {
+  const EntryAddress at = getEntryAddressArgs(arguments, "ATTRNUM");
+  const EntryDescription entry = inquire(kind, at);
+  setOutputs(outputs, {datatypeNameArray(entry.datatype), makeDoubleScalar(entry.elements)});
+}
+
+void deleteEntry(const EntryKind& kind, const qvArray* arguments[]) {
+  const EntryAddress at = getEntryAddressArgs(arguments, kind.deleteLabel);
+  checkLibraryStatus(CDFdeleteAttrEntry(libraryHandle(at.file, kind.deleteRoutine), kind.kind,
+                                        at.attribute, at.entry),
+                     kind.deleteRoutine);
+}
+
+void putAttrEntry(int, qvArray*[], std::int32_t, const qvArray* arguments[], const CommandEntry*) {
+  const EntryAddress at = getEntryAddressArgs(arguments, "ATTRNUM");
+  const long datatype = getLongScalarArg(arguments[3], "DATATYPE");
+  const qvArray* value = arguments[4];
+  validateDatatype(datatype);
+  if (qvGetClassID(value) != classIdForDatatype(datatype)) {
+    raiseError(cdflib::badPutAttrEntryDatatype(qvGetClassName(value), datatypeName(datatype)));
+  }
+  auto elements = static_cast<long>(qvGetNumberOfElements(value));
+  if (datatype == CDF_EPOCH16) elements /= 2;  // each value is a pair of doubles
+  const LibraryData data(value);
+  long scope = 0;
+  callOnFile("CDFgetAttrScope", at.file, ATTR_, at.attribute, GET_, ATTR_SCOPE_, &scope);
+  const EntryKind& kind = kindForScope(scope);
+  checkLibraryStatus(
+      CDFputAttrEntry(libraryHandle(at.file, kind.putRoutine), kind.kind, at.attribute, at.entry,
+                      datatype, libraryNumber(elements, kBadNumber), data.bytes()),
+      kind.putRoutine);
+}
+
+}  // namespace TOLVEX::ambrix

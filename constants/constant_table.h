@@ -1,0 +1,25 @@
+// The names of the CDF library's constants as users give them, and the two commands over them.
+#pragma once
+
+#include <cstdint>
+#include <map>
+#include <string>
+
+#include "gateway/command.h"
+
+namespace TOLVEX::ambrix {
+
+/// Upper-case name to value, in byte-wise order of the names. 57 entries, built when the module is
+/// loaded.
+extern const std::map<std::string, double> ConstantNameTable;
+
+/// "getConstantNames" (): a 57-by-1 cell array of the names.
+void getConstantNames(int, qvArray* outputs[], std::int32_t, const qvArray* arguments[],
+                      const CommandEntry*);
+
+/// "getConstantValue" (name in any case): a double scalar. Raises `unrecognizedConstantName` with
+/// the upper-case name.
+void getConstantValue(int, qvArray* outputs[], std::int32_t, const qvArray* arguments[],
+                      const CommandEntry*);
+
+}  // namespace TOLVEX::ambrix

@@ -1,0 +1,123 @@
+#include "epoch/epoch.h"
+
+#include <cdf.h>
+
+#include <cstddef>
+#include <vector>
+
+#include "gateway/arguments.h"
+#include "gateway/errors.h"
+#include "gateway/raise_error.h"
+
+namespace TOLVEX::ambrix {
+namespace {
+
+constexpr std::size_t kEpochComponents = 7;
+constexpr std::size_t kEpoch16Components = 10;
+
+/// Number of groups; raises `badEpochVector` for a wrong number of elements and for a wrong class
+/// alike.
+std::size_t requireGroups(const qvArray* components, std::size_t size) {
+  const std::size_t elements = qvGetNumberOfElements(components);
+  if (elements % size != 0 || qvGetClassID(components) != qvDOUBLE_CLASS) {
+    raiseError(cdflib::badEpochVector(static_cast<std::int64_t>(size)));
+  }
+  return elements / size;
+}
+
+qvArray* createDoubles(const std::vector<std::size_t>& sizes) {
+  return qvCreateUninitNumericArray(sizes.size(), sizes.data(), qvDOUBLE_CLASS, qvREAL);
+}
+
+double* doublesOf(qvArray* array) {
+  return static_cast<double*>(qvGetData(array));
+}
+
+const double* doublesOf(const qvArray* array) {
+  return static_cast<const double*>(qvGetReadOnlyData(array));
+}
+
+void requireLegal(double epoch) {
+  if (epoch == ILLEGAL_EPOCH_VALUE) raiseError(cdflib::illegalEpochValue());
+}
+
+/// 10, then the further dimensions of a 2-by-... input, else the number of pairs.
+std::vector<std::size_t> epoch16BreakdownSizes(const qvArray* epochs) {
+  std::vector<std::size_t> sizes{kEpoch16Components};
+  const std::size_t* given = qvGetDimensions(epochs);
+  if (given[0] == 2) {
+    sizes.insert(sizes.end(), given + 1, given + qvGetNumberOfDimensions(epochs));
+  } else {
+    sizes.push_back(qvGetNumberOfElements(epochs) / 2);
+  }
+  return sizes;
+}
+
+}  // namespace
+
+void computeEpoch(int, qvArray* outputs[], std::int32_t, const qvArray* arguments[],
+                  const CommandEntry*) {
+  const std::size_t count = requireGroups(arguments[0], kEpochComponents);
+  qvArray* epochs = createDoubles({1, count});
+  const std::vector<long> components = getLongVectorArg(arguments[0], "TIMEVAL");
+  const long* c = components.data();
+  double* epoch = doublesOf(epochs);
+  for (std::size_t k = 0; k < count; ++k, c += kEpochComponents, ++epoch) {
+    *epoch = computeEPOCH(c[0], c[1], c[2], c[3], c[4], c[5], c[6]);
+    requireLegal(*epoch);
+  }
+  outputs[0] = epochs;
+}
+
+void computeEpoch16(int, qvArray* outputs[], std::int32_t, const qvArray* arguments[],
+                    const CommandEntry*) {
+  const std::size_t count = requireGroups(arguments[0], kEpoch16Components);
+  qvArray* epochs = createDoubles({2, count});
+  const std::vector<long> components = getLongVectorArg(arguments[0], "TIMEVAL");
+  const long* c = components.data();
+  double* epoch = doublesOf(epochs);
+  for (std::size_t k = 0; k < count; ++k, c += kEpoch16Components, epoch += 2) {
+    requireLegal(computeEPOCH16(c[0], c[1], c[2], c[3], c[4], c[5], c[6], c[7], c[8], c[9], epoch));
+  }
+  outputs[0] = epochs;
+}
+
+void epochBreakdown(int, qvArray* outputs[], std::int32_t, const qvArray* arguments[],
+                    const CommandEntry*) {
+  if (qvGetClassID(arguments[0]) != qvDOUBLE_CLASS) {
+    raiseError(validate::argumentNotDoublePrecision("EPOCHTIME"));
+  }
+  const std::size_t count = qvGetNumberOfElements(arguments[0]);
+  qvArray* times = createDoubles({kEpochComponents, count});
+  const double* epoch = doublesOf(arguments[0]);
+  double* time = doublesOf(times);
+  for (std::size_t k = 0; k < count; ++k, ++epoch) {
+    long c[kEpochComponents] = {};
+    EPOCHbreakdown(*epoch, &c[0], &c[1], &c[2], &c[3], &c[4], &c[5], &c[6]);
+    for (const long component : c)
+      *time++ = static_cast<double>(component);
+  }
+  outputs[0] = times;
+}
+
+void epoch16Breakdown(int, qvArray* outputs[], std::int32_t, const qvArray* arguments[],
+                      const CommandEntry*) {
+  const std::size_t elements = qvGetNumberOfElements(arguments[0]);
+  if (elements % 2 != 0) raiseError(cdflib::badEpoch16Modulus());
+  if (qvGetClassID(arguments[0]) != qvDOUBLE_CLASS) {
+    raiseError(validate::argumentNotDoublePrecision("EPOCH16TIME"));
+  }
+  qvArray* times = createDoubles(epoch16BreakdownSizes(arguments[0]));
+  const double* epoch = doublesOf(arguments[0]);
+  double* time = doublesOf(times);
+  for (std::size_t k = 0; k < elements; k += 2) {
+    double pair[] = {epoch[k], epoch[k + 1]};
+    long c[kEpoch16Components] = {};
+    EPOCH16breakdown(pair, &c[0], &c[1], &c[2], &c[3], &c[4], &c[5], &c[6], &c[7], &c[8], &c[9]);
+    for (const long component : c)
+      *time++ = static_cast<double>(component);
+  }
+  outputs[0] = times;
+}
+
+}  // namespace TOLVEX::ambrix

@@ -1,0 +1,142 @@
+#include "file/compression.h"
+
+#include "constants/checked_values.h"
+#include "gateway/arguments.h"
+#include "gateway/errors.h"
+#include "gateway/library.h"
+#include "gateway/open_file_registry.h"
+#include "gateway/outputs.h"
+#include "gateway/raise_error.h"
+
+namespace TOLVEX::ambrix {
+namespace {
+
+struct Compression {
+  long type = 0;
+  long parameters[CDF_MAX_PARMS] = {};  // the first one only is used
+  long percentage = 0;
+};
+
+const char* typeName(long type) {
+  switch (type) {
+    case RLE_COMPRESSION:
+      return "RLE_COMPRESSION";
+    case HUFF_COMPRESSION:
+      return "HUFF_COMPRESSION";
+    case AHUFF_COMPRESSION:
+      return "AHUFF_COMPRESSION";
+    case GZIP_COMPRESSION:
+      return "GZIP_COMPRESSION";
+    default:
+      return "NO_COMPRESSION";
+  }
+}
+
+const char* shortTypeName(long type) {
+  switch (type) {
+    case RLE_COMPRESSION:
+      return "RLE";
+    case HUFF_COMPRESSION:
+      return "HUFF";
+    default:
+      return "AHUFF";
+  }
+}
+
+qvArray* emptyDouble() {
+  return qvCreateNumericMatrix(0, 0, qvDOUBLE_CLASS, qvREAL);
+}
+
+qvArray* fileParameter(const Compression& compression) {
+  switch (compression.type) {
+    case RLE_COMPRESSION:
+      return qvCreateString("RLE_OF_ZEROS");
+    case HUFF_COMPRESSION:
+    case AHUFF_COMPRESSION:
+      return qvCreateString("OPTIMAL_ENCODING_TREES");
+    case GZIP_COMPRESSION:
+      return makeDoubleScalar(compression.parameters[0]);
+    default:
+      return emptyDouble();
+  }
+}
+
+// Unlike the file's, a variable's parameter is looked at, and "RLE_OF_ZEROs" ends in a small s.
+qvArray* variableParameter(const Compression& compression) {
+  const long parameter = compression.parameters[0];
+  if (compression.type == NO_COMPRESSION) return emptyDouble();
+  if (compression.type == GZIP_COMPRESSION) return makeDoubleScalar(parameter);
+  if (parameter != 0) {
+    qvWarningMsgId(cdflib::invalidCompressionParameter(parameter, shortTypeName(compression.type)));
+    return makeDoubleScalar(parameter);
+  }
+  return qvCreateString(compression.type == RLE_COMPRESSION ? "RLE_OF_ZEROs"
+                                                            : "OPTIMAL_ENCODING_TREES");
+}
+
+// Parameters beyond 32 bits become one that no type accepts.
+long libraryParameter(long parameter) {
+  return libraryNumber(parameter, kBadNumber);
+}
+
+}  // namespace
+
+void getCompression(int, qvArray* outputs[], std::int32_t, const qvArray* arguments[],
+                    const CommandEntry*) {
+  const CdfId file = getCdfIdArg(arguments[0]);
+  Compression found;
+  callOnFile("CDFgetCompression", file, GET_,  //
+             CDF_COMPRESSION_, &found.type, found.parameters, &found.percentage);
+  checkCompressionType(found.type);
+  setOutputs(outputs, {qvCreateString(typeName(found.type)), fileParameter(found),
+                       makeDoubleScalar(found.percentage)});
+}
+
+void getVarCompression(int, qvArray* outputs[], std::int32_t, const qvArray* arguments[],
+                       const CommandEntry*) {
+  const CdfId file = getCdfIdArg(arguments[0]);
+  const long variable = getLongScalarArg(arguments[1], "VARNUM");
+  Compression found;
+  callOnVariable("CDFgetzVarCompression", file, variable, GET_,  //
+                 zVAR_COMPRESSION_, &found.type, found.parameters, &found.percentage);
+  checkCompressionType(found.type);
+  setOutputs(outputs, {qvCreateString(typeName(found.type)), variableParameter(found),
+                       makeDoubleScalar(found.percentage)});
+}
+
+void setCompression(int, qvArray*[], std::int32_t argumentCount, const qvArray* arguments[],
+                    const CommandEntry*) {
+  const CdfId file = getCdfIdArg(arguments[0]);
+  const long type = getLongScalarArg(arguments[1], "TYPE");
+  checkCompressionType(type);
+  long parameters[CDF_MAX_PARMS] = {};
+  if (argumentCount > 2) {
+    parameters[0] = getLongScalarArg(arguments[2], "CPARM");
+    if (type == GZIP_COMPRESSION && (parameters[0] < 1 || parameters[0] > 9)) {
+      raiseError(cdflib::invalidCompressionParameter(parameters[0], "GZIP"));
+    }
+  } else if (type == GZIP_COMPRESSION) {
+    raiseError(cdflib::unspecifiedGzipCompressionLevel());
+  }
+  parameters[0] = libraryParameter(parameters[0]);
+  callOnFile("CDFsetCompression", file, PUT_, CDF_COMPRESSION_, type, parameters);
+}
+
+// A gzip level goes to the library as it is: only "setCompression" checks it.
+void setVarCompression(int, qvArray*[], std::int32_t argumentCount, const qvArray* arguments[],
+                       const CommandEntry*) {
+  const CdfId file = getCdfIdArg(arguments[0]);
+  const long variable = getLongScalarArg(arguments[1], "VARNUM");
+  const long type = getLongScalarArg(arguments[2], "CTYPE");
+  checkCompressionType(type);
+  long parameters[CDF_MAX_PARMS] = {};
+  if (argumentCount > 3) {
+    parameters[0] = libraryParameter(getLongScalarArg(arguments[3], "CPARM"));
+  } else if (type == GZIP_COMPRESSION) {
+    raiseError(cdflib::unspecifiedGzipCompressionLevel());
+  }
+  callOnVariable("CDFsetzVarCompression", file, variable, PUT_,  //
+                 zVAR_COMPRESSION_, type, parameters);
+}
+
+}  // namespace TOLVEX::ambrix

@@ -1,0 +1,54 @@
+// The settings of one file. Read-only mode and cache sizes are selections of the current file to
+// the library, so they are read with CONFIRM_ and set without PUT_; the others are stored in the
+// file.
+#pragma once
+
+#include <cstdint>
+
+#include "constants/value_names.h"
+#include "gateway/families.h"
+
+namespace TOLVEX::ambrix {
+
+/// A setting that is returned as its name.
+struct NamedSetting {
+  long operation;
+  long item;
+  const char* routine;
+  const ValueNameTable* names;
+  const char* kindName;
+};
+
+/// A command (identifier) that returns the name of a setting. Raises `unrecognizedValue` for a
+/// value without a name.
+template <const NamedSetting& row>
+void getNamedSetting(int, qvArray* outputs[], std::int32_t, const qvArray* arguments[],
+                     const CommandEntry*) {
+  const CdfId file = getCdfIdArg(arguments[0]);
+  long value = 0;
+  callOnFile(row.routine, file, row.operation, row.item, &value);
+  outputs[0] = qvCreateString(lookupValueName(*row.names, value, row.kindName).c_str());
+}
+
+// clang-format off
+inline constexpr NamedSetting kGetFormat       {GET_,     CDF_FORMAT_,        "CDFgetFormat",       &FormatNames,       "FORMAT"};
+inline constexpr NamedSetting kGetChecksum     {GET_,     CDF_CHECKSUM_,      "CDFgetChecksum",     &ChecksumNames,     "CHECKSUM"};
+inline constexpr NamedSetting kGetMajority     {GET_,     CDF_MAJORITY_,      "CDFgetMajority",     &MajorityNames,     "MAJORITY"};
+inline constexpr NamedSetting kGetReadOnlyMode {CONFIRM_, CDF_READONLY_MODE_, "CDFgetReadOnlyMode", &ReadOnlyModeNames, "READONLY MODE"};
+
+inline constexpr FileNumber kGetCacheSize            {CONFIRM_, CDF_CACHESIZE_,      "CDFgetCacheSize"};
+inline constexpr FileNumber kGetStageCacheSize       {CONFIRM_, STAGE_CACHESIZE_,    "CDFgetStageCacheSize"};
+inline constexpr FileNumber kGetCompressionCacheSize {CONFIRM_, COMPRESS_CACHESIZE_, "CDFgetCompressionCacheSize"};
+
+// "setFormat" labels its argument like a cache size: users know it under that label.
+inline constexpr NumberSetting kSetFormat               {PUT_,    CDF_FORMAT_,         "CDFsetFormat",               "NUMBUFFERS", kBadNumber};
+inline constexpr NumberSetting kSetChecksum             {PUT_,    CDF_CHECKSUM_,       "CDFsetChecksum",             "MODE",       kBadNumber};
+inline constexpr NumberSetting kSetMajority             {PUT_,    CDF_MAJORITY_,       "CDFsetMajority",             "MAJORITY",   kBadNumber};
+inline constexpr NumberSetting kSetReadOnlyMode         {SELECT_, CDF_READONLY_MODE_,  "CDFsetReadOnlyMode",         "MODE",       kNoSuchNumber};
+inline constexpr NumberSetting kSetCacheSize            {SELECT_, CDF_CACHESIZE_,      "CDFsetCacheSize",            "NUMBUFFERS", kBadNumber};
+inline constexpr NumberSetting kSetVarsCacheSize        {SELECT_, zVARs_CACHESIZE_,    "CDFsetzVarsCacheSize",       "NUMBUFFERS", kBadNumber};
+inline constexpr NumberSetting kSetStageCacheSize       {SELECT_, STAGE_CACHESIZE_,    "CDFsetStageCacheSize",       "NUMBUFFERS", kBadNumber};
+inline constexpr NumberSetting kSetCompressionCacheSize {SELECT_, COMPRESS_CACHESIZE_, "CDFsetCompressionCacheSize", "NUMBUFFERS", kBadNumber};
+// clang-format on
+
+}  // namespace TOLVEX::ambrix

@@ -1,0 +1,71 @@
+// Calls of the CDF library, each with its status checked under the name of the routine that it
+// stands for. A call reads as the library's manual writes it, without the selection of the file and
+// the closing NULL_.
+#pragma once
+
+#include <cdf.h>
+
+#include <cstdint>
+#include <limits>
+#include <type_traits>
+
+#include "gateway/cdf_id.h"
+
+namespace TOLVEX::ambrix {
+
+/// Raises `libraryFailure` with the routine and the library's status text.
+[[noreturn]] void raiseLibraryFailure(long status, const char* routine);
+
+/// Passes every status of zero or more; a negative one, warnings of the library included, is
+/// raised.
+inline void checkLibraryStatus(long status, const char* routine) {
+  if (status < 0) [[unlikely]]
+    raiseLibraryFailure(status, routine);
+}
+
+/// The library's handle of a registered file. A file that the library has already freed (its
+/// closing failed) is refused as the library would refuse it, without letting the library look at
+/// it.
+void* libraryHandle(CdfId file, const char* routine);
+CdfId cdfIdOf(void* handle);
+
+// The library reads numbers as long and keeps only 32 bits of them: 2^32 would address variable 0.
+// A number that does not fit is replaced by one of its kind that the library itself refuses.
+inline constexpr long kNoSuchNumber = std::numeric_limits<std::int32_t>::max();
+inline constexpr long kBadNumber = -1;
+
+constexpr bool fitsLibrary(long number) {
+  return number >= std::numeric_limits<std::int32_t>::min() &&
+         number <= std::numeric_limits<std::int32_t>::max();
+}
+constexpr long libraryNumber(long number, long refused) {
+  return fitsLibrary(number) ? number : refused;
+}
+
+/// What `CDFlib` may find in its argument list: it reads longs and pointers and cannot check them.
+template <typename T>
+inline constexpr bool kIsLibraryItem = std::is_same_v<T, long> || std::is_pointer_v<T>;
+
+template <typename... Items>
+void callLibrary(const char* routine, Items... items) {
+  static_assert((kIsLibraryItem<Items> && ...), "CDFlib reads long values and pointers only");
+  checkLibraryStatus(CDFlib(items..., NULL_), routine);
+}
+
+template <typename... Items>
+void callOnFile(const char* routine, CdfId file, Items... items) {
+  callLibrary(routine, SELECT_, CDF_, libraryHandle(file, routine), items...);
+}
+
+template <typename... Items>
+void callOnVariable(const char* routine, CdfId file, long variable, Items... items) {
+  callOnFile(routine, file, zVAR_, libraryNumber(variable, kNoSuchNumber), items...);
+}
+
+/// Selects zVariables in the routines that take either kind.
+inline constexpr int kZVariables = 1;
+
+/// `ROW_MAJOR` files hold their last dimension fastest, the host its first.
+bool isRowMajor(CdfId file);
+
+}  // namespace TOLVEX::ambrix

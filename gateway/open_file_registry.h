@@ -1,0 +1,41 @@
+// The identifiers of the files that the module has opened or created and not yet closed or deleted.
+#pragma once
+
+#include <cstddef>
+#include <set>
+
+#include "gateway/cdf_id.h"
+#include "host/qv.h"
+
+namespace TOLVEX::ambrix {
+
+/// A plain set, not synchronised: the host calls from one thread at a time.
+class OpenFileRegistry {
+ public:
+  /// Registers an identifier that the library has just handed out, which makes it usable (again).
+  void insert(CdfId file);
+  void erase(CdfId file);
+  [[nodiscard]] bool contains(CdfId file) const { return open_.contains(file); }
+  [[nodiscard]] std::size_t size() const { return open_.size(); }
+
+  /// Notes that the library has freed the file although the identifier stays registered.
+  void markFreed(CdfId file) { freed_.insert(file); }
+  [[nodiscard]] bool isFreed(CdfId file) const { return !freed_.empty() && freed_.contains(file); }
+
+  [[nodiscard]] const std::set<CdfId>& files() const { return open_; }
+
+ private:
+  std::set<CdfId> open_;
+  std::set<CdfId> freed_;  // a part of open_ that must not reach the library
+};
+
+OpenFileRegistry& openFileRegistry();
+
+/// Converts the argument "CDFID". Raises `argumentNotUint64Scalar` unless it is one uint64 element,
+/// and `invalidFileId` unless it is registered.
+CdfId getCdfIdArg(const qvArray* argument);
+
+/// The 1-by-1 uint64 array that carries an identifier to the host.
+qvArray* makeCdfIdScalar(CdfId file);
+
+}  // namespace TOLVEX::ambrix

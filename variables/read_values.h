@@ -1,0 +1,57 @@
+// Letting the library write values into a new host array: numbers straight into its data,
+// characters through a byte buffer.
+#pragma once
+
+#include <cstddef>
+#include <cstring>
+
+#include "gateway/scratch.h"
+#include "gateway/sizes.h"
+#include "host/qv.h"
+#include "variables/characters.h"
+#include "variables/datatypes.h"
+#include "variables/host_dimensions.h"
+#include "variables/variable_description.h"
+
+namespace TOLVEX::ambrix {
+
+/// What one read asks of the library.
+struct ReadRequest {
+  const char* routine;
+  long values;       // that the library may write
+  long bufferBytes;  // that characters are read into: at least those of the values
+  bool writesAll;    // else what the library leaves unwritten reads as zeros
+};
+
+/// `read` lets the library write into the buffer that it is given.
+template <typename Read>
+qvArray* readCharacters(const HostDimensions& dimensions, const ReadRequest& request,
+                        const Read& read) {
+  qvArray* array = qvCreateCharArray(dimensions.count(), dimensions.data());
+  const std::size_t bytes = saturatedProduct({request.bufferBytes});
+  const ScratchBuffer buffer(bytes);
+  if (!request.writesAll) std::memset(buffer.data(), 0, bytes);
+  read(buffer.data());
+  widenCharacters(buffer.data(), qvGetNumberOfElements(array), qvGetChars(array));
+  return array;
+}
+
+template <typename Read>
+qvArray* readNumbers(const VariableDescription& variable, const HostDimensions& dimensions,
+                     const ReadRequest& request, const Read& read) {
+  const qvClassID classId = classIdForDatatype(variable.datatype);
+  const auto create = request.writesAll ? qvCreateUninitNumericArray : qvCreateNumericArray;
+  qvArray* array = create(dimensions.count(), dimensions.data(), classId, qvREAL);
+  requireRoom(variable, request.values, bytesOfArray(array, variable.datatype), request.routine);
+  read(qvGetData(array));
+  return array;
+}
+
+template <typename Read>
+qvArray* readValues(const VariableDescription& variable, const HostDimensions& dimensions,
+                    const ReadRequest& request, const Read& read) {
+  return isCharacterDatatype(variable.datatype) ? readCharacters(dimensions, request, read)
+                                                : readNumbers(variable, dimensions, request, read);
+}
+
+}  // namespace TOLVEX::ambrix

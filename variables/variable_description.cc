@@ -1,0 +1,59 @@
+#include "variables/variable_description.h"
+
+#include <algorithm>
+#include <cstddef>
+#include <cstdint>
+#include <limits>
+
+#include "gateway/library.h"
+#include "gateway/sizes.h"
+#include "variables/datatypes.h"
+
+namespace TOLVEX::ambrix {
+
+long VariableDescription::valuesPerRecord() const {
+  return productOf(sizes());
+}
+
+long VariableDescription::elementsPerRecord() const {
+  return multiplySaturated(elements, valuesPerRecord());
+}
+
+bool VariableDescription::allDimensionsVary() const {
+  return std::ranges::all_of(variances(), [](long variance) { return variance == VARY; });
+}
+
+VariableDescription inquireVariable(CdfId file, long variable) {
+  const char* routine = "CDFinquirezVar";
+  VariableDescription found;
+  callOnVariable(routine, file, variable, GET_,                                      //
+                 zVAR_NAME_, found.name,                                             //
+                 zVAR_DATATYPE_, &found.datatype,                                    //
+                 zVAR_NUMELEMS_, &found.elements,                                    //
+                 zVAR_NUMDIMS_, &found.dimensions, zVAR_DIMSIZES_, found.sizeSlots,  //
+                 zVAR_RECVARY_, &found.recordVariance, zVAR_DIMVARYS_, found.varianceSlots);
+  const bool countable = found.dimensions >= 0 && found.dimensions <= CDF_MAX_DIMS;
+  if (!countable) raiseLibraryFailure(BAD_NUM_DIMS, routine);
+  return found;
+}
+
+void requireUsableRecord(const VariableDescription& variable, const char* routine) {
+  if (variable.elements < 1) raiseLibraryFailure(BAD_NUM_ELEMS, routine);
+  if (std::ranges::any_of(variable.sizes(), [](long size) { return size < 1; })) {
+    raiseLibraryFailure(BAD_DIM_SIZE, routine);
+  }
+  const long recordBytes =
+      multiplySaturated(variable.elementsPerRecord(), datatypeSize(variable.datatype));
+  if (recordBytes > std::numeric_limits<std::int32_t>::max()) {
+    raiseLibraryFailure(BAD_DIM_SIZE, routine);
+  }
+}
+
+void requireRoom(const VariableDescription& variable, long values, std::size_t bytes,
+                 const char* routine) {
+  const std::size_t needed =
+      saturatedProduct({values, variable.elements, datatypeSize(variable.datatype)});
+  if (needed > bytes) raiseLibraryFailure(BAD_NUM_ELEMS, routine);
+}
+
+}  // namespace TOLVEX::ambrix

@@ -1,0 +1,49 @@
+// What the library says of a variable, in one inquiry.
+#pragma once
+
+#include <cdf.h>
+
+#include <span>
+
+#include "gateway/cdf_id.h"
+
+namespace TOLVEX::ambrix {
+
+struct VariableDescription {
+  char name[CDF_VAR_NAME_LEN256 + 1] = {};
+  long datatype = 0;
+  long elements = 0;  // characters of one value; 1 for every other datatype of a sane file
+  long dimensions = 0;
+  long recordVariance = 0;
+  long sizeSlots[CDF_MAX_DIMS] = {};
+  long varianceSlots[CDF_MAX_DIMS] = {};
+
+  // In the library's order of dimensions.
+  [[nodiscard]] std::span<const long> sizes() const { return {sizeSlots, count()}; }
+  [[nodiscard]] std::span<const long> variances() const { return {varianceSlots, count()}; }
+
+  /// Product of all dimension sizes, whatever their variances; 1 for a scalar variable.
+  [[nodiscard]] long valuesPerRecord() const;
+  /// The same in elements: characters for text.
+  [[nodiscard]] long elementsPerRecord() const;
+  /// Whether the library stores each value of a record, none standing for a whole dimension.
+  [[nodiscard]] bool allDimensionsVary() const;
+
+ private:
+  [[nodiscard]] std::size_t count() const { return static_cast<std::size_t>(dimensions); }
+};
+
+/// Raises `libraryFailure` ("CDFinquirezVar").
+VariableDescription inquireVariable(CdfId file, long variable);
+
+/// The library divides by the size of a record and moves as many bytes as a description says:
+/// refuses, in the library's words, descriptions that only a damaged file or a variable too large
+/// to store has. Readers and writers call this after all their other checks.
+void requireUsableRecord(const VariableDescription& variable, const char* routine);
+
+/// Refuses, as the library's bad number of elements, to move `values` values of the variable to or
+/// from `bytes` bytes if they are not enough.
+void requireRoom(const VariableDescription& variable, long values, std::size_t bytes,
+                 const char* routine);
+
+}  // namespace TOLVEX::ambrix

@@ -1,0 +1,81 @@
+// Storage settings and record counts of variables. The reserve percentage and the cache size are
+// selections of the current variable to the library, read with CONFIRM_ and set without PUT_.
+#pragma once
+
+#include <cstdint>
+
+#include "gateway/families.h"
+
+namespace TOLVEX::ambrix {
+
+/// A number that the library holds for a variable.
+struct VariableNumber {
+  long operation;
+  long item;
+  const char* routine;
+};
+
+/// A command (identifier, variable) that returns a `VariableNumber` as a double scalar.
+template <const VariableNumber& row>
+void getVariableNumber(int, qvArray* outputs[], std::int32_t, const qvArray* arguments[],
+                       const CommandEntry*) {
+  const CdfId file = getCdfIdArg(arguments[0]);
+  const long variable = getLongScalarArg(arguments[1], "VARNUM");
+  long value = 0;
+  callOnVariable(row.routine, file, variable, row.operation, row.item, &value);
+  outputs[0] = makeDoubleScalar(value);
+}
+
+/// A command (identifier, variable, number) without a result.
+template <const NumberSetting& row>
+void setVariableNumber(int, qvArray*[], std::int32_t, const qvArray* arguments[],
+                       const CommandEntry*) {
+  const CdfId file = getCdfIdArg(arguments[0]);
+  const long variable = getLongScalarArg(arguments[1], "VARNUM");
+  const long value = libraryNumber(getLongScalarArg(arguments[2], row.label), row.refused);
+  if constexpr (row.operation == SELECT_) {
+    callOnVariable(row.routine, file, variable, row.item, value);
+  } else {
+    callOnVariable(row.routine, file, variable, row.operation, row.item, value);
+  }
+}
+
+// clang-format off
+inline constexpr VariableNumber kGetVarAllocRecords     {GET_,     zVAR_NUMallocRECS_,    "CDFgetzVarAllocRecords"};
+inline constexpr VariableNumber kGetVarBlockingFactor   {GET_,     zVAR_BLOCKINGFACTOR_,  "CDFgetzVarBlockingFactor"};
+inline constexpr VariableNumber kGetVarMaxAllocRecNum   {GET_,     zVAR_MAXallocREC_,     "CDFgetzVarMaxAllocRecNum"};
+inline constexpr VariableNumber kGetVarMaxWrittenRecNum {GET_,     zVAR_MAXREC_,          "CDFgetzVarMaxWrittenRecNum"};
+inline constexpr VariableNumber kGetVarNumRecsWritten   {GET_,     zVAR_NUMRECS_,         "CDFgetzVarNumRecsWritten"};
+inline constexpr VariableNumber kGetVarReservePercent   {CONFIRM_, zVAR_RESERVEPERCENT_,  "CDFgetzVarReservePercent"};
+
+inline constexpr FileNumber kGetVarsMaxWrittenRecNum    {GET_,     zVARs_MAXREC_,         "CDFgetzVarsMaxWrittenRecNum"};
+
+inline constexpr NumberSetting kSetVarBlockingFactor {PUT_,    zVAR_BLOCKINGFACTOR_, "CDFsetzVarBlockingFactor", "BLOCKINGFACTOR", kBadNumber};
+inline constexpr NumberSetting kSetVarInitialRecs    {PUT_,    zVAR_INITIALRECS_,    "CDFsetzVarInitialRecs",    "NUMRECS",        kBadNumber};
+inline constexpr NumberSetting kSetVarReservePercent {SELECT_, zVAR_RESERVEPERCENT_, "CDFsetzVarReservePercent", "PERCENT",        kBadNumber};
+inline constexpr NumberSetting kSetVarSparseRecords  {PUT_,    zVAR_SPARSERECORDS_,  "CDFsetzVarSparseRecords",  "STYPE",          kBadNumber};
+// clang-format on
+
+/// "getVarSparseRecords" (identifier, variable): the mode's name. Raises `unrecognizedValue`
+/// (value, "SPARSE RECORDS TYPE"), `libraryFailure` ("CDFgetzVarSparseRecords").
+void getVarSparseRecords(int, qvArray* outputs[], std::int32_t, const qvArray* arguments[],
+                         const CommandEntry*);
+
+/// "getVarCacheSize" (identifier, variable): number of buffers. Raises
+/// `varCacheSizeOpInappropriate` on a single-file CDF, `libraryFailure` ("CDFgetFormat",
+/// "CDFgetzVarCacheSize").
+void getVarCacheSize(int, qvArray* outputs[], std::int32_t, const qvArray* arguments[],
+                     const CommandEntry*);
+
+/// "setVarCacheSize" (identifier, variable, number of buffers). Raises as "getVarCacheSize"
+/// ("CDFsetzVarCacheSize").
+void setVarCacheSize(int, qvArray*[], std::int32_t, const qvArray* arguments[],
+                     const CommandEntry*);
+
+/// "setVarAllocBlockRecords" (identifier, variable, first record, last record). Raises
+/// `libraryFailure`
+/// ("CDFsetzVarAllocBlockRecords").
+void setVarAllocBlockRecords(int, qvArray*[], std::int32_t, const qvArray* arguments[],
+                             const CommandEntry*);
+
+}  // namespace TOLVEX::ambrix
