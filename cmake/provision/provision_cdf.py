@@ -49,7 +49,7 @@ def make_pip(folder):
     """A private environment, since distributions refuse pip outside of one; returns its python."""
     try:
         venv.create(folder, with_pip=True)
-    except (subprocess.CalledProcessError, ModuleNotFoundError) as error:
+    except (subprocess.CalledProcessError, ImportError, SystemExit) as error:
         raise ProvisionError("python's venv module cannot make an environment with pip: install "
                              "python3-venv (Debian) or run script/bootstrap") from error
     return folder / "bin" / "python3"
