@@ -6,6 +6,7 @@
 #include <cstdint>
 
 #include "constants/value_names.h"
+#include "gateway/arguments.h"
 #include "gateway/families.h"
 
 namespace TOLVEX::ambrix {
@@ -30,6 +31,28 @@ void getNamedSetting(int, qvArray* outputs[], std::int32_t, const qvArray* argum
   outputs[0] = qvCreateString(lookupValueName(*row.names, value, row.kindName).c_str());
 }
 
+/// A number that is set for a file. A `SELECT_` item follows the selection
+/// that the call begins with; the others follow a `PUT_`.
+struct FileSetting {
+  long operation;  // PUT_ or SELECT_
+  long item;
+  const char* routine;
+  const char* label;
+  long refused;  // given to the library in place of a number beyond 32 bits
+};
+
+/// A command (identifier, number) without a result.
+template <const FileSetting& row>
+void setFileNumber(int, qvArray*[], std::int32_t, const qvArray* arguments[], const CommandEntry*) {
+  const CdfId file = getCdfIdArg(arguments[0]);
+  const long value = libraryNumber(getLongScalarArg(arguments[1], row.label), row.refused);
+  if constexpr (row.operation == SELECT_) {
+    callOnFile(row.routine, file, row.item, value);
+  } else {
+    callOnFile(row.routine, file, row.operation, row.item, value);
+  }
+}
+
 // clang-format off
 inline constexpr NamedSetting kGetFormat       {GET_,     CDF_FORMAT_,        "CDFgetFormat",       &FormatNames,       "FORMAT"};
 inline constexpr NamedSetting kGetChecksum     {GET_,     CDF_CHECKSUM_,      "CDFgetChecksum",     &ChecksumNames,     "CHECKSUM"};
@@ -41,14 +64,14 @@ inline constexpr FileNumber kGetStageCacheSize       {CONFIRM_, STAGE_CACHESIZE_
 inline constexpr FileNumber kGetCompressionCacheSize {CONFIRM_, COMPRESS_CACHESIZE_, "CDFgetCompressionCacheSize"};
 
 // "setFormat" labels its argument like a cache size: users know it under that label.
-inline constexpr NumberSetting kSetFormat               {PUT_,    CDF_FORMAT_,         "CDFsetFormat",               "NUMBUFFERS", kBadNumber};
-inline constexpr NumberSetting kSetChecksum             {PUT_,    CDF_CHECKSUM_,       "CDFsetChecksum",             "MODE",       kBadNumber};
-inline constexpr NumberSetting kSetMajority             {PUT_,    CDF_MAJORITY_,       "CDFsetMajority",             "MAJORITY",   kBadNumber};
-inline constexpr NumberSetting kSetReadOnlyMode         {SELECT_, CDF_READONLY_MODE_,  "CDFsetReadOnlyMode",         "MODE",       kNoSuchNumber};
-inline constexpr NumberSetting kSetCacheSize            {SELECT_, CDF_CACHESIZE_,      "CDFsetCacheSize",            "NUMBUFFERS", kBadNumber};
-inline constexpr NumberSetting kSetVarsCacheSize        {SELECT_, zVARs_CACHESIZE_,    "CDFsetzVarsCacheSize",       "NUMBUFFERS", kBadNumber};
-inline constexpr NumberSetting kSetStageCacheSize       {SELECT_, STAGE_CACHESIZE_,    "CDFsetStageCacheSize",       "NUMBUFFERS", kBadNumber};
-inline constexpr NumberSetting kSetCompressionCacheSize {SELECT_, COMPRESS_CACHESIZE_, "CDFsetCompressionCacheSize", "NUMBUFFERS", kBadNumber};
+inline constexpr FileSetting kSetFormat               {PUT_,    CDF_FORMAT_,         "CDFsetFormat",               "NUMBUFFERS", kBadNumber};
+inline constexpr FileSetting kSetChecksum             {PUT_,    CDF_CHECKSUM_,       "CDFsetChecksum",             "MODE",       kBadNumber};
+inline constexpr FileSetting kSetMajority             {PUT_,    CDF_MAJORITY_,       "CDFsetMajority",             "MAJORITY",   kBadNumber};
+inline constexpr FileSetting kSetReadOnlyMode         {SELECT_, CDF_READONLY_MODE_,  "CDFsetReadOnlyMode",         "MODE",       kNoSuchNumber};
+inline constexpr FileSetting kSetCacheSize            {SELECT_, CDF_CACHESIZE_,      "CDFsetCacheSize",            "NUMBUFFERS", kBadNumber};
+inline constexpr FileSetting kSetVarsCacheSize        {SELECT_, zVARs_CACHESIZE_,    "CDFsetzVarsCacheSize",       "NUMBUFFERS", kBadNumber};
+inline constexpr FileSetting kSetStageCacheSize       {SELECT_, STAGE_CACHESIZE_,    "CDFsetStageCacheSize",       "NUMBUFFERS", kBadNumber};
+inline constexpr FileSetting kSetCompressionCacheSize {SELECT_, COMPRESS_CACHESIZE_, "CDFsetCompressionCacheSize", "NUMBUFFERS", kBadNumber};
 // clang-format on
 
 }  // namespace TOLVEX::ambrix

@@ -1,5 +1,7 @@
 #include "variables/pad_values.h"
 
+#include <algorithm>
+
 #include "gateway/arguments.h"
 #include "gateway/errors.h"
 #include "gateway/library.h"
@@ -21,8 +23,10 @@ void getVarPadValue(int, qvArray* outputs[], std::int32_t, const qvArray* argume
   const VariableDescription variable = inquireVariable(file, number);
   const HostDimensions dimensions = valueDimensions(variable);
   validateDatatype(variable.datatype);
-  requireUsableRecord(variable, routine);
-  const ReadRequest request{routine, 1, variable.elementsPerRecord(), true};
+  if (variable.elements < 1) raiseLibraryFailure(BAD_NUM_ELEMS, routine);
+  // More room than one value needs, and never less.
+  const long bufferBytes = std::max(variable.elementsPerRecord(), variable.elements);
+  const ReadRequest request{routine, 1, bufferBytes, true};
   outputs[0] = readValues(variable, dimensions, request, [&](void* buffer) {
     callOnVariable(routine, file, number, GET_, zVAR_PADVALUE_, buffer);
   });

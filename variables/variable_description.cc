@@ -10,6 +10,12 @@
 #include "variables/datatypes.h"
 
 namespace TOLVEX::ambrix {
+namespace {
+
+// Of the datatypes that the library knows and the module does not support.
+constexpr long kOtherDatatypeSize = 8;
+
+}  // namespace
 
 long VariableDescription::valuesPerRecord() const {
   return productOf(sizes());
@@ -19,12 +25,19 @@ long VariableDescription::elementsPerRecord() const {
   return multiplySaturated(elements, valuesPerRecord());
 }
 
+long VariableDescription::storedBytesPerRecord() const {
+  long bytes = multiplySaturated(elements, datatypeSize(datatype));
+  for (std::size_t i = 0; i < count(); ++i) {
+    if (varianceSlots[i] != NOVARY) bytes = multiplySaturated(bytes, sizeSlots[i]);
+  }
+  return bytes;
+}
+
 bool VariableDescription::allDimensionsVary() const {
   return std::ranges::all_of(variances(), [](long variance) { return variance == VARY; });
 }
 
-VariableDescription inquireVariable(CdfId file, long variable) {
-  const char* routine = "CDFinquirezVar";
+VariableDescription inquireVariable(CdfId file, long variable, const char* routine) {
   VariableDescription found;
   callOnVariable(routine, file, variable, GET_,                                      //
                  zVAR_NAME_, found.name,                                             //
@@ -42,11 +55,21 @@ void requireUsableRecord(const VariableDescription& variable, const char* routin
   if (std::ranges::any_of(variable.sizes(), [](long size) { return size < 1; })) {
     raiseLibraryFailure(BAD_DIM_SIZE, routine);
   }
-  const long recordBytes =
-      multiplySaturated(variable.elementsPerRecord(), datatypeSize(variable.datatype));
-  if (recordBytes > std::numeric_limits<std::int32_t>::max()) {
+  if (variable.storedBytesPerRecord() > std::numeric_limits<std::int32_t>::max()) {
     raiseLibraryFailure(BAD_DIM_SIZE, routine);
   }
+}
+
+void requireDivisibleRecord(CdfId file, long variable, const char* routine) {
+  const VariableDescription found = inquireVariable(file, variable, routine);
+  std::uint32_t values = 1;
+  for (std::size_t i = 0; i < found.sizes().size(); ++i) {
+    if (found.varianceSlots[i] != NOVARY) values *= static_cast<std::uint32_t>(found.sizes()[i]);
+  }
+  const long supportedSize = datatypeSize(found.datatype);
+  const long elementSize = supportedSize > 0 ? supportedSize : kOtherDatatypeSize;
+  const auto valueBytes = static_cast<std::uint32_t>(found.elements * elementSize);
+  if (values * valueBytes == 0) raiseLibraryFailure(BAD_DIM_SIZE, routine);
 }
 
 void requireRoom(const VariableDescription& variable, long values, std::size_t bytes,

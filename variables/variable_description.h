@@ -26,20 +26,27 @@ struct VariableDescription {
   [[nodiscard]] long valuesPerRecord() const;
   /// The same in elements: characters for text.
   [[nodiscard]] long elementsPerRecord() const;
-  /// Whether the library stores each value of a record, none standing for a whole dimension.
+  /// The same in bytes, of what the library stores: along a dimension that does not vary, one
+  /// value.
+  [[nodiscard]] long storedBytesPerRecord() const;
   [[nodiscard]] bool allDimensionsVary() const;
 
  private:
   [[nodiscard]] std::size_t count() const { return static_cast<std::size_t>(dimensions); }
 };
 
-/// Raises `libraryFailure` ("CDFinquirezVar").
-VariableDescription inquireVariable(CdfId file, long variable);
+/// Raises `libraryFailure` with the routine that the inquiry stands for.
+VariableDescription inquireVariable(CdfId file, long variable,
+                                    const char* routine = "CDFinquirezVar");
 
-/// The library divides by the size of a record and moves as many bytes as a description says:
-/// refuses, in the library's words, descriptions that only a damaged file or a variable too large
-/// to store has. Readers and writers call this after all their other checks.
+/// The library counts the bytes of a record in 32 bits: refuses, in its words, descriptions that
+/// only a damaged file or a variable too large to store has. Readers and writers call this after
+/// all their other checks.
 void requireUsableRecord(const VariableDescription& variable, const char* routine);
+
+/// Some settings make the library divide by that count, which can wrap around to zero; they go
+/// through for every other variable.
+void requireDivisibleRecord(CdfId file, long variable, const char* routine);
 
 /// Refuses, as the library's bad number of elements, to move `values` values of the variable to or
 /// from `bytes` bytes if they are not enough.

@@ -30,8 +30,10 @@ void getVarCacheSize(int, qvArray* outputs[], std::int32_t, const qvArray* argum
   const CdfId file = getCdfIdArg(arguments[0]);
   const long variable = getLongScalarArg(arguments[1], "VARNUM");
   requireMultiFile(file);
+  const char* routine = "CDFgetzVarCacheSize";
+  requireDivisibleRecord(file, variable, routine);
   long buffers = 0;
-  callOnVariable("CDFgetzVarCacheSize", file, variable, CONFIRM_, zVAR_CACHESIZE_, &buffers);
+  callOnVariable(routine, file, variable, CONFIRM_, zVAR_CACHESIZE_, &buffers);
   outputs[0] = makeDoubleScalar(buffers);
 }
 
@@ -41,7 +43,9 @@ void setVarCacheSize(int, qvArray*[], std::int32_t, const qvArray* arguments[],
   const long variable = getLongScalarArg(arguments[1], "VARNUM");
   const long buffers = libraryNumber(getLongScalarArg(arguments[2], "NUMBUFFERS"), kBadNumber);
   requireMultiFile(file);
-  callOnVariable("CDFsetzVarCacheSize", file, variable, zVAR_CACHESIZE_, buffers);
+  const char* routine = "CDFsetzVarCacheSize";
+  requireDivisibleRecord(file, variable, routine);
+  callOnVariable(routine, file, variable, zVAR_CACHESIZE_, buffers);
 }
 
 void setVarAllocBlockRecords(int, qvArray*[], std::int32_t, const qvArray* arguments[],
@@ -50,7 +54,9 @@ void setVarAllocBlockRecords(int, qvArray*[], std::int32_t, const qvArray* argum
   const long variable = getLongScalarArg(arguments[1], "VARNUM");
   const long first = libraryNumber(getLongScalarArg(arguments[2], "RECSTART"), kBadNumber);
   const long last = libraryNumber(getLongScalarArg(arguments[3], "RECSTOP"), kBadNumber);
-  callOnVariable("CDFsetzVarAllocBlockRecords", file, variable, PUT_,  //
+  const char* routine = "CDFsetzVarAllocBlockRecords";
+  requireDivisibleRecord(file, variable, routine);
+  callOnVariable(routine, file, variable, PUT_,  //
                  zVAR_ALLOCATEBLOCK_, first, last);
 }
 

@@ -4,7 +4,9 @@
 
 #include <cstdint>
 
+#include "gateway/arguments.h"
 #include "gateway/families.h"
+#include "variables/variable_description.h"
 
 namespace TOLVEX::ambrix {
 
@@ -13,6 +15,7 @@ struct VariableNumber {
   long operation;
   long item;
   const char* routine;
+  bool dividesByRecord;  // the library divides by the bytes of a record on the way
 };
 
 /// A command (identifier, variable) that returns a `VariableNumber` as a double scalar.
@@ -21,18 +24,30 @@ void getVariableNumber(int, qvArray* outputs[], std::int32_t, const qvArray* arg
                        const CommandEntry*) {
   const CdfId file = getCdfIdArg(arguments[0]);
   const long variable = getLongScalarArg(arguments[1], "VARNUM");
+  if constexpr (row.dividesByRecord) requireDivisibleRecord(file, variable, row.routine);
   long value = 0;
   callOnVariable(row.routine, file, variable, row.operation, row.item, &value);
   outputs[0] = makeDoubleScalar(value);
 }
 
+/// A number that is set for a variable: with PUT_, or as a SELECT_ item that follows the selection
+/// of the variable.
+struct VariableSetting {
+  long operation;
+  long item;
+  const char* routine;
+  const char* label;
+  bool dividesByRecord;
+};
+
 /// A command (identifier, variable, number) without a result.
-template <const NumberSetting& row>
+template <const VariableSetting& row>
 void setVariableNumber(int, qvArray*[], std::int32_t, const qvArray* arguments[],
                        const CommandEntry*) {
   const CdfId file = getCdfIdArg(arguments[0]);
   const long variable = getLongScalarArg(arguments[1], "VARNUM");
-  const long value = libraryNumber(getLongScalarArg(arguments[2], row.label), row.refused);
+  const long value = libraryNumber(getLongScalarArg(arguments[2], row.label), kBadNumber);
+  if constexpr (row.dividesByRecord) requireDivisibleRecord(file, variable, row.routine);
   if constexpr (row.operation == SELECT_) {
     callOnVariable(row.routine, file, variable, row.item, value);
   } else {
@@ -41,19 +56,19 @@ void setVariableNumber(int, qvArray*[], std::int32_t, const qvArray* arguments[]
 }
 
 // clang-format off
-inline constexpr VariableNumber kGetVarAllocRecords     {GET_,     zVAR_NUMallocRECS_,    "CDFgetzVarAllocRecords"};
-inline constexpr VariableNumber kGetVarBlockingFactor   {GET_,     zVAR_BLOCKINGFACTOR_,  "CDFgetzVarBlockingFactor"};
-inline constexpr VariableNumber kGetVarMaxAllocRecNum   {GET_,     zVAR_MAXallocREC_,     "CDFgetzVarMaxAllocRecNum"};
-inline constexpr VariableNumber kGetVarMaxWrittenRecNum {GET_,     zVAR_MAXREC_,          "CDFgetzVarMaxWrittenRecNum"};
-inline constexpr VariableNumber kGetVarNumRecsWritten   {GET_,     zVAR_NUMRECS_,         "CDFgetzVarNumRecsWritten"};
-inline constexpr VariableNumber kGetVarReservePercent   {CONFIRM_, zVAR_RESERVEPERCENT_,  "CDFgetzVarReservePercent"};
+inline constexpr VariableNumber kGetVarAllocRecords     {GET_,     zVAR_NUMallocRECS_,    "CDFgetzVarAllocRecords",     false};
+inline constexpr VariableNumber kGetVarBlockingFactor   {GET_,     zVAR_BLOCKINGFACTOR_,  "CDFgetzVarBlockingFactor",   false};
+inline constexpr VariableNumber kGetVarMaxAllocRecNum   {GET_,     zVAR_MAXallocREC_,     "CDFgetzVarMaxAllocRecNum",   false};
+inline constexpr VariableNumber kGetVarMaxWrittenRecNum {GET_,     zVAR_MAXREC_,          "CDFgetzVarMaxWrittenRecNum", false};
+inline constexpr VariableNumber kGetVarNumRecsWritten   {GET_,     zVAR_NUMRECS_,         "CDFgetzVarNumRecsWritten",   false};
+inline constexpr VariableNumber kGetVarReservePercent   {CONFIRM_, zVAR_RESERVEPERCENT_,  "CDFgetzVarReservePercent",   true};
 
 inline constexpr FileNumber kGetVarsMaxWrittenRecNum    {GET_,     zVARs_MAXREC_,         "CDFgetzVarsMaxWrittenRecNum"};
 
-inline constexpr NumberSetting kSetVarBlockingFactor {PUT_,    zVAR_BLOCKINGFACTOR_, "CDFsetzVarBlockingFactor", "BLOCKINGFACTOR", kBadNumber};
-inline constexpr NumberSetting kSetVarInitialRecs    {PUT_,    zVAR_INITIALRECS_,    "CDFsetzVarInitialRecs",    "NUMRECS",        kBadNumber};
-inline constexpr NumberSetting kSetVarReservePercent {SELECT_, zVAR_RESERVEPERCENT_, "CDFsetzVarReservePercent", "PERCENT",        kBadNumber};
-inline constexpr NumberSetting kSetVarSparseRecords  {PUT_,    zVAR_SPARSERECORDS_,  "CDFsetzVarSparseRecords",  "STYPE",          kBadNumber};
+inline constexpr VariableSetting kSetVarBlockingFactor {PUT_,    zVAR_BLOCKINGFACTOR_, "CDFsetzVarBlockingFactor", "BLOCKINGFACTOR", true};
+inline constexpr VariableSetting kSetVarInitialRecs    {PUT_,    zVAR_INITIALRECS_,    "CDFsetzVarInitialRecs",    "NUMRECS",        true};
+inline constexpr VariableSetting kSetVarReservePercent {SELECT_, zVAR_RESERVEPERCENT_, "CDFsetzVarReservePercent", "PERCENT",        true};
+inline constexpr VariableSetting kSetVarSparseRecords  {PUT_,    zVAR_SPARSERECORDS_,  "CDFsetzVarSparseRecords",  "STYPE",          false};
 // clang-format on
 
 /// "getVarSparseRecords" (identifier, variable): the mode's name. Raises `unrecognizedValue`

@@ -127,7 +127,9 @@ void deleteVarRecords(int, qvArray*[], std::int32_t, const qvArray* arguments[],
   const long number = getLongScalarArg(arguments[1], "VARNUM");
   const long first = getLongScalarArg(arguments[2], "STARTREC");
   const long last = getLongScalarArg(arguments[3], "ENDREC");
-  callOnVariable("CDFdeletezVarRecords", file, number, DELETE_,  //
+  const char* routine = "CDFdeletezVarRecords";
+  requireDivisibleRecord(file, number, routine);
+  callOnVariable(routine, file, number, DELETE_,  //
                  zVAR_RECORDS_, libraryNumber(first, kBadNumber), libraryNumber(last, kBadNumber));
 }
 
