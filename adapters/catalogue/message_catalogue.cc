@@ -31,15 +31,13 @@ bool isPlaceholder(std::string_view text, std::size_t at) {
 
 std::string fillIn(std::string_view text, const std::vector<MessageArg>& values) {
   std::string result;
-  for (std::size_t at = 0; at < text.size(); ++at) {
-    if (!isPlaceholder(text, at)) {
-      result += text[at];
-      continue;
-    }
-    result += valueText(values, static_cast<std::size_t>(text[at + 1] - '1'));
-    at += 2;
+  for (std::size_t brace = text.find('{'); brace != text.npos; brace = text.find('{')) {
+    const bool isValue = isPlaceholder(text, brace);
+    result += text.substr(0, isValue ? brace : brace + 1);
+    if (isValue) result += valueText(values, static_cast<std::size_t>(text[brace + 1] - '1'));
+    text.remove_prefix(brace + (isValue ? 3 : 1));
   }
-  return result;
+  return result.append(text);
 }
 
 std::string listValues(const MessageId& id) {

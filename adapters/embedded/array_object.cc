@@ -123,6 +123,20 @@ qvArray* makeArray(qvClassID classId, std::span<const std::size_t> sizes, Conten
   return array;
 }
 
+namespace {
+
+/// Puts the cells of an array in front of a chain of arrays.
+Tracked* chainCells(const qvArray& array, Tracked* chain) noexcept {
+  for (qvArray* const cell : array.cells()) {
+    if (cell == nullptr) continue;
+    cell->place.next = chain;
+    chain = &cell->place;
+  }
+  return chain;
+}
+
+}  // namespace
+
 void destroyArray(qvArray* array) noexcept {
   if (array == nullptr) return;
   TrackedList::remove(array->place);
@@ -131,13 +145,7 @@ void destroyArray(qvArray* array) noexcept {
   while (pending != nullptr) {
     auto* const next = reinterpret_cast<qvArray*>(pending);
     pending = next->place.next;
-    if (next->classId == qvCELL_CLASS) {
-      for (qvArray* const cell : next->cells()) {
-        if (cell == nullptr) continue;
-        cell->place.next = pending;
-        pending = &cell->place;
-      }
-    }
+    if (next->classId == qvCELL_CLASS) pending = chainCells(*next, pending);
     if (next->ownsElements) release(next->elements);
     release(next);
     countArray(-1);
