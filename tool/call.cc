@@ -1,0 +1,70 @@
+#include "tool/call.h"
+
+#include <optional>
+
+#include "tool/cdf_file.h"
+#include "tool/failure.h"
+#include "tool/json_value.h"
+
+namespace ambrix::tool {
+namespace {
+
+std::optional<JsonView> parseWord(std::string_view word) {
+  try {
+    bool numbersInRange = true;
+    return JsonView::check(word, numbersInRange);
+  } catch (const JsonError&) {
+    return std::nullopt;
+  }
+}
+
+/// JSON that stands for an array, and else the text itself; an object is never meant as a text.
+Array readWord(const std::string& word) {
+  const auto json = parseWord(word);
+  if (!json) return Array::fromUtf8(word);
+  try {
+    return readValue(*json);
+  } catch (const JsonError& error) {
+    if (json->kind() == JsonKind::kObject) throw UsageError(word + ": " + error.what());
+    return Array::fromUtf8(word);
+  }
+}
+
+std::vector<Array> readWords(std::span<const std::string> words) {
+  std::vector<Array> arrays;
+  for (const std::string& word : words) {
+    try {
+      arrays.push_back(readWord(word));
+    } catch (const std::invalid_argument&) {
+      throw UsageError("an argument is not valid UTF-8");
+    }
+  }
+  return arrays;
+}
+
+std::vector<Array> callOnFile(CdfFile file, const std::string& command,
+                              const std::vector<Array>& arguments) {
+  const std::vector<ArrayView> views(arguments.begin(), arguments.end());
+  std::vector<Array> results = file.call(command, views);
+  if (command == "close" || command == "delete") file.forget();
+  file.close();
+  return results;
+}
+
+}  // namespace
+
+void runCall(Module& module, const CallOptions& options, StandardOutput& output) {
+  if (options.words.empty()) throw UsageError("call: which command?");
+  const std::string& command = options.words.front();
+  const std::vector<Array> arguments = readWords(std::span(options.words).subspan(1));
+  const std::vector<Array> results =
+      options.file.empty() ? module.call(Array::fromUtf8(command), arguments)
+                           : callOnFile(CdfFile::open(module, options.file), command, arguments);
+  for (const Array& result : results) {
+    std::string line;
+    appendValue(line, result);
+    output.write(line + '\n');
+  }
+}
+
+}  // namespace ambrix::tool

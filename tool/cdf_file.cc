@@ -1,0 +1,79 @@
+#include "tool/cdf_file.h"
+
+#include <algorithm>
+#include <iterator>
+#include <utility>
+
+#include "tool/failure.h"
+
+namespace ambrix::tool {
+
+std::string bytesOf(ArrayView characters) {
+  std::string bytes;
+  std::ranges::transform(characters.chars(), std::back_inserter(bytes),
+                         [](char16_t unit) { return static_cast<char>(unit); });
+  return bytes;
+}
+
+CdfFile CdfFile::from(Module& module, std::string_view command, std::string_view path) try {
+  return {module, std::move(module.call(command, {Array::fromUtf8(path)}).at(0))};
+} catch (const std::invalid_argument&) {
+  throw ToolError("badFileName", "the name of the file is not valid UTF-8");
+}
+
+CdfFile CdfFile::open(Module& module, std::string_view path) {
+  return from(module, "open", path);
+}
+
+CdfFile CdfFile::create(Module& module, std::string_view path) {
+  return from(module, "create", path);
+}
+
+CdfFile::CdfFile(CdfFile&& other) noexcept
+    : module_(other.module_), id_(std::exchange(other.id_, Array())) {}
+
+CdfFile::~CdfFile() {
+  try {
+    close();
+  } catch (const std::exception&) {
+    // Another failure is on its way, or nobody wants to know.
+  }
+}
+
+std::vector<Array> CdfFile::call(std::string_view command, std::span<const ArrayView> arguments) {
+  std::vector<ArrayView> all = {id_};
+  all.insert(all.end(), arguments.begin(), arguments.end());
+  return module_->call(command, std::span<const ArrayView>(all));
+}
+
+std::vector<Array> CdfFile::call(std::string_view command,
+                                 std::initializer_list<double> arguments) {
+  std::vector<Array> scalars;
+  for (const double argument : arguments)
+    scalars.push_back(Array::scalar(argument));
+  return call(command, std::vector<ArrayView>(scalars.begin(), scalars.end()));
+}
+
+double CdfFile::number(std::string_view command, std::initializer_list<double> arguments) {
+  return call(command, arguments).at(0).data<double>().front();
+}
+
+std::string CdfFile::text(std::string_view command, std::initializer_list<double> arguments) {
+  return bytesOf(call(command, arguments).at(0));
+}
+
+void CdfFile::setReadOnly() {
+  call("setReadOnlyMode", {constantValue(*module_, "READONLYON")});
+}
+
+void CdfFile::close() {
+  if (!id_) return;
+  const Array id = std::exchange(id_, Array());
+  module_->call("close", {id});
+}
+
+double constantValue(Module& module, std::string_view name) {
+  return module.call("getConstantValue", {Array::fromNarrow(name)}).at(0).data<double>().front();
+}
+
+}  // namespace ambrix::tool

@@ -1,0 +1,68 @@
+#include "tool/command_line.h"
+
+#include <algorithm>
+#include <memory>
+
+#include "tool/help_texts.h"
+
+namespace ambrix::tool {
+namespace {
+
+/// Help whose usage line is the synopsis written for it.
+class HelpFormatter : public CLI::Formatter {
+ public:
+  explicit HelpFormatter(std::string usage) : usage_("Usage: " + std::move(usage) + "\n") {}
+  std::string make_usage(const CLI::App*, std::string) const override { return usage_; }
+
+ private:
+  std::string usage_;
+};
+
+void describe(CLI::App& app, const HelpText& help, const std::string& usage) {
+  app.description(help.brief);
+  app.footer(std::string(help.details) + "\nExamples:\n" + help.examples);
+  const auto formatter = std::make_shared<HelpFormatter>(usage);
+  formatter->column_width(28);
+  formatter->label("Positionals", "Arguments");
+  formatter->label("Subcommands", "Commands");
+  app.formatter(formatter);
+  app.set_help_flag("-h,--help", "Print this help and exit");
+}
+
+CLI::App& addCommand(CLI::App& app, const HelpText& help) {
+  CLI::App& command = *app.add_subcommand(help.name);
+  describe(command, help, std::string("ambrix ") + help.name + " " + help.synopsis);
+  return command;
+}
+
+void addCall(CLI::App& app, Arguments& arguments) {
+  CLI::App& call = addCommand(app, kCallHelp);
+  call.add_option("--file", arguments.call.file,
+                  "Open this file, pass it as the first argument, and close it afterwards")
+      ->type_name("FILE");
+  call.prefix_command();  // what follows may begin with a minus sign
+  call.callback([&call, &arguments] { arguments.call.words = call.remaining(); });
+}
+
+void addSession(CLI::App& app, Arguments& arguments) {
+  CLI::App& session = addCommand(app, kSessionHelp);
+  session
+      .add_option("--max-array-bytes", arguments.maxArrayBytes,
+                  "The most bytes that one array or scratch buffer may take (default: 4 GiB)")
+      ->type_name("N");
+}
+
+}  // namespace
+
+std::unique_ptr<CLI::App> makeParser(Arguments& arguments) {
+  auto app = std::make_unique<CLI::App>("", "ambrix");
+  describe(*app, kToolHelp, std::string("ambrix ") + kToolHelp.synopsis);
+  app->add_flag("--version", arguments.version,
+                "Print the versions of ambrix and of the CDF library and exit");
+  app->add_flag("--man", arguments.manual)->group("");
+  addCall(*app, arguments);
+  addSession(*app, arguments);
+  return app;
+}
+
+}  // namespace ambrix::tool

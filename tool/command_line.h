@@ -1,0 +1,23 @@
+// The arguments of the tool.
+#pragma once
+
+#include <CLI/CLI.hpp>
+#include <string>
+#include <vector>
+
+#include "tool/call.h"
+#include "tool/session.h"
+
+namespace ambrix::tool {
+
+struct Arguments {
+  CallOptions call;
+  std::size_t maxArrayBytes = kSessionArrayBytes;
+  bool version = false;
+  bool manual = false;
+};
+
+/// The parser of the command line, which stores into `arguments`; these must outlive it.
+std::unique_ptr<CLI::App> makeParser(Arguments& arguments);
+
+}  // namespace ambrix::tool

@@ -1,0 +1,75 @@
+// What --help and the manual page say, apart from the options.
+#pragma once
+
+#include <array>
+
+namespace ambrix::tool {
+
+struct HelpText {
+  const char* name;
+  const char* synopsis;
+  const char* brief;
+  const char* details;
+  const char* examples;
+};
+
+inline constexpr HelpText kToolHelp = {
+    "ambrix", "[--version] [--help] COMMAND ...",
+    "Shows, converts and edits files in the Common Data Format (CDF)",
+    "Failures are told on standard error as \"ambrix: IDENTIFIER: message\".\n"
+    "The exit status is 0, 1 after a failure, or 2 when the arguments are not understood.\n",
+    "  ambrix info data.cdf\n"
+    "  ambrix dump data.cdf Epoch --records 0:9\n"
+    "  ambrix COMMAND --help\n"};
+
+inline constexpr HelpText kInfoHelp = {
+    "info", "FILE [--attributes] [--json]",
+    "Shows what a file is made of: its settings and its variables",
+    "Dimensions are listed as a host's arrays have them: the one that varies fastest comes first.\n"
+    "A variable of a datatype that is not supported is listed as far as it is known.\n",
+    "  ambrix info data.cdf\n"
+    "  ambrix info --attributes data.cdf\n"
+    "  ambrix info --json data.cdf | jq .variables[].name\n"};
+
+inline constexpr HelpText kDumpHelp = {
+    "dump", "FILE VARIABLE [--records A:B] [--format table|csv|json]",
+    "Prints the values of a variable, which is given by its name or its number",
+    "Record numbers and indices begin at 0, and the first index varies fastest. Epochs are "
+    "printed\n"
+    "as times; those that are no times, fill values for example, as numbers. In JSON, the data "
+    "are\n"
+    "nested with the first index innermost.\n",
+    "  ambrix dump data.cdf Epoch\n"
+    "  ambrix dump data.cdf 3 --records 10:19\n"
+    "  ambrix dump data.cdf B_GSE --format csv > b_gse.csv\n"};
+
+inline constexpr HelpText kCallHelp = {
+    "call", "[--file FILE] COMMAND [ARGUMENT...]",
+    "Calls one command of the module and prints each result as a line of JSON",
+    "Arguments are JSON: numbers, true, false, null, lists of numbers or logicals, and arrays as\n"
+    "{\"class\":..., \"size\":[...], \"data\":[...]}. Whatever is not JSON is a text.\n",
+    "  ambrix call getLibraryVersion\n"
+    "  ambrix call getConstantValue GZIP_COMPRESSION\n"
+    "  ambrix call --file data.cdf getVarName 0\n"
+    "  ambrix call --file data.cdf renameVar 0 Epoch\n"};
+
+inline constexpr HelpText kSessionHelp = {
+    "session", "[--max-array-bytes N]", "Answers calls of the module through a pipe",
+    "Each line of standard input is a request and each line of standard output its answer, both "
+    "in\n"
+    "JSON. docs/session-protocol.md describes them.\n",
+    "  printf '{\"command\":\"getLibraryVersion\"}\\n' | ambrix session\n"};
+
+inline constexpr HelpText kConvertHelp = {
+    "convert", "IN OUT [OPTION...]", "Writes a copy of a file with other settings",
+    "OUT gets the extension .cdf when it has none. An existing file is never overwritten, and\n"
+    "nothing is left behind when the conversion fails. Variables and entries of a datatype that "
+    "is\n"
+    "not supported are listed, and stop the conversion unless they are to be skipped.\n",
+    "  ambrix convert old.cdf new.cdf --compression gzip:6\n"
+    "  ambrix convert rows.cdf columns.cdf --majority column --checksum md5\n"};
+
+inline constexpr std::array kCommandHelp = {kInfoHelp, kDumpHelp, kCallHelp, kConvertHelp,
+                                            kSessionHelp};
+
+}  // namespace ambrix::tool
