@@ -1,0 +1,96 @@
+// A host whose error call comes back: the error then leaves as an exception of the module.
+#include <gtest/gtest.h>
+
+#include <exception>
+#include <string>
+
+#include "gateway/errors.h"
+#include "gateway/raise_error.h"
+
+namespace {
+
+int reports = 0;
+bool catalogueFails = false;
+
+}  // namespace
+
+extern "C" void qvErrMsgId(const TOLVEX::ambrix::MessageId&) {
+  ++reports;
+}
+
+extern "C" void qvGetMessageText(const TOLVEX::ambrix::MessageId& id, std::string& text) {
+  if (catalogueFails) throw std::bad_alloc();
+  text = "text of " + id.identifier;
+}
+
+namespace TOLVEX::ambrix {
+namespace {
+
+RaisedError raised() {
+  try {
+    raiseError(cdflib::mismatchedVarianceSize(3, 2));
+  } catch (const RaisedError& error) {
+    return error;
+  }
+}
+
+TEST(ReturningHostTest, TheErrorIsReportedOnceAndThenThrown) {
+  reports = 0;
+  EXPECT_THROW(raiseError(validate::wrongNumberOfInputs()), RaisedError);
+  EXPECT_EQ(reports, 1);
+}
+
+TEST(ReturningHostTest, TheExceptionTellsIdentifierTextAndValues) {
+  const RaisedError error = raised();
+  EXPECT_EQ(error.identifier(), "TOLVEX:ambrix:cdflib:mismatchedVarianceSize");
+  EXPECT_STREQ(error.what(), "text of mismatchedVarianceSize");
+  EXPECT_EQ(error.messageId().values, (std::vector<MessageArg>{3, 2}));
+}
+
+TEST(ReturningHostTest, TheExceptionIsAStandardOne) {
+  try {
+    raiseError(cdflib::fileOpenError());
+  } catch (const std::exception& error) {
+    EXPECT_STREQ(error.what(), "text of fileOpenError");
+  }
+}
+
+TEST(ReturningHostTest, ACatalogueThatFailsLeavesTheIdentifierAsText) {
+  catalogueFails = true;
+  EXPECT_STREQ(raised().what(), "mismatchedVarianceSize");
+  catalogueFails = false;
+}
+
+TEST(ReturningHostTest, ACloneIsTheSameErrorOnItsOwn) {
+  std::unique_ptr<RaisedError> clone;
+  {
+    const RaisedError error = raised();
+    clone = error.clone();
+    EXPECT_NE(clone.get(), &error);
+  }
+  EXPECT_EQ(clone->identifier(), "TOLVEX:ambrix:cdflib:mismatchedVarianceSize");
+  EXPECT_EQ(clone->messageId().values, (std::vector<MessageArg>{3, 2}));
+}
+
+TEST(ReturningHostTest, RethrownItKeepsItsType) {
+  const RaisedError error = raised();
+  const std::exception& base = error;
+  EXPECT_THROW(dynamic_cast<const RaisedError&>(base).rethrow(), RaisedError);
+}
+
+TEST(ReturningHostTest, ItTravelsThroughAnExceptionPointer) {
+  std::exception_ptr carried;
+  try {
+    raiseError(cdflib::invalidOperation("fly"));
+  } catch (...) {
+    carried = std::current_exception();
+  }
+  try {
+    std::rethrow_exception(carried);
+  } catch (const RaisedError& error) {
+    EXPECT_EQ(error.messageId().values, std::vector<MessageArg>{"fly"});
+  }
+}
+
+}  // namespace
+}  // namespace TOLVEX::ambrix
