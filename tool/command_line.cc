@@ -35,6 +35,13 @@ CLI::App& addCommand(CLI::App& app, const HelpText& help) {
   return command;
 }
 
+void addInfo(CLI::App& app, Arguments& arguments) {
+  CLI::App& info = addCommand(app, kInfoHelp);
+  info.add_option("FILE", arguments.info.file, "The file")->required();
+  info.add_flag("--attributes", arguments.info.attributes, "Also list the attributes and entries");
+  info.add_flag("--json", arguments.info.json, "Print a JSON object");
+}
+
 void addCall(CLI::App& app, Arguments& arguments) {
   CLI::App& call = addCommand(app, kCallHelp);
   call.add_option("--file", arguments.call.file,
@@ -60,6 +67,7 @@ std::unique_ptr<CLI::App> makeParser(Arguments& arguments) {
   app->add_flag("--version", arguments.version,
                 "Print the versions of ambrix and of the CDF library and exit");
   app->add_flag("--man", arguments.manual)->group("");
+  addInfo(*app, arguments);
   addCall(*app, arguments);
   addSession(*app, arguments);
   return app;

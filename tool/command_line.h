@@ -2,16 +2,19 @@
 #pragma once
 
 #include <CLI/CLI.hpp>
+#include <memory>
 #include <string>
 #include <vector>
 
 #include "tool/call.h"
+#include "tool/info.h"
 #include "tool/session.h"
 
 namespace ambrix::tool {
 
 struct Arguments {
   CallOptions call;
+  InfoOptions info;
   std::size_t maxArrayBytes = kSessionArrayBytes;
   bool version = false;
   bool manual = false;

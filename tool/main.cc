@@ -32,6 +32,7 @@ void runCommand(const std::string& command, const Arguments& arguments, Standard
   if (command == "session") return runSession(arguments.maxArrayBytes, output);
   Module module;
   module.setWarningHandler(printWarning);
+  if (command == "info") return runInfo(module, arguments.info, output);
   if (command == "call") return runCall(module, arguments.call, output);
 }
 

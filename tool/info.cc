@@ -1,0 +1,14 @@
+#include "tool/info.h"
+
+namespace ambrix::tool {
+
+void runInfo(Module& module, const InfoOptions& options, StandardOutput& output) {
+  CdfFile file = CdfFile::open(module, options.file);
+  file.setReadOnly();
+  const FileFacts facts = readFacts(module, file, options.attributes);
+  file.close();
+  output.write(options.json ? factsAsJson(facts, options)
+                            : factsAsTables(facts, options, Style(output.isTerminal())));
+}
+
+}  // namespace ambrix::tool
