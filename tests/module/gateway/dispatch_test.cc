@@ -1,0 +1,139 @@
+// The entry point: the command's name, the number of arguments, numbers out of range.
+#include "tests/module/support/module_test.h"
+
+namespace ambrix_test {
+namespace {
+
+using DispatchTest = ModuleTest;
+
+TEST_F(DispatchTest, NamesMustMatchExactly) {
+  for (const char* name : {"Open", "open ", " open", "ope", "opens", "OPEN", "\xE9"}) {
+    EXPECT_EQ(does(name, {"x"}), cdflib("invalidOperation", std::string(name)));
+  }
+  EXPECT_EQ(does("", {"x"}), cdflib("invalidOperation", std::string()));
+}
+
+TEST_F(DispatchTest, ANameEndsAtItsFirstZero) {
+  const Array name = Array::text(std::u16string_view(u"getValidate\0tail", 16));
+  EXPECT_EQ(shown(module.call(name)), "char 1x14 'VALIDATEFILEon'");
+}
+
+TEST_F(DispatchTest, ANameOfAnyShapeIsReadInStorageOrder) {
+  const std::u16string text = u"getValidate";
+  const Array column = Array::of<char16_t>(text, {11, 1});
+  EXPECT_EQ(shown(module.call(column)), "char 1x14 'VALIDATEFILEon'");
+}
+
+TEST_F(DispatchTest, OnlyTheLowByteOfACharacterOfTheNameCounts) {
+  const Array name = Array::text(u"\u0167etValidate");  // 0x67 is g
+  EXPECT_EQ(shown(module.call(name)), "char 1x14 'VALIDATEFILEon'");
+}
+
+TEST_F(DispatchTest, ACommandThatIsNoTextIsALogicError) {
+  for (const Array& name : {Array::scalar(5.0), Array::cell({1, 1}), Array::scalar(true)}) {
+    try {
+      module.call(name);
+      ADD_FAILURE() << "no error";
+    } catch (const std::logic_error& error) {
+      EXPECT_STREQ(error.what(), "basic_string::_M_construct null not valid");
+    }
+  }
+}
+
+struct Counts {
+  const char* name;
+  int minimum;
+  int maximum;
+};
+
+// One row of each kind of range; the whole table has a test of its own.
+const Counts kCounts[] = {{"getVarData", 3, 4},     {"setCompression", 2, 3},
+                          {"setVarCompression", 3, 4}, {"getConstantNames", 0, 0},
+                          {"getFileBackward", 0, 0},  {"getLibraryVersion", 0, 0},
+                          {"getLibraryCopyright", 0, 0}, {"getValidate", 0, 0},
+                          {"open", 1, 1},           {"hyperPutVarData", 9, 9}};
+
+TEST_F(DispatchTest, TooFewAndTooManyArgumentsAreRefusedBeforeAnyIsRead) {
+  for (const Counts& row : kCounts) {
+    if (row.minimum > 0) {
+      const Arguments tooFew(static_cast<std::size_t>(row.minimum - 1));
+      EXPECT_EQ(does(row.name, tooFew), kWrongNumberOfInputs) << row.name;
+    }
+    const Arguments tooMany(static_cast<std::size_t>(row.maximum + 1));
+    EXPECT_EQ(does(row.name, tooMany), kWrongNumberOfInputs) << row.name;
+  }
+}
+
+TEST_F(DispatchTest, EveryCountOfARangeReachesTheHandler) {
+  for (const Counts& row : kCounts) {
+    for (int count = std::max(row.minimum, 1); count <= row.maximum; ++count) {
+      const std::string text = does(row.name, Arguments(static_cast<std::size_t>(count)));
+      EXPECT_NE(text, kWrongNumberOfInputs) << row.name << " with " << count;
+    }
+  }
+}
+
+TEST_F(DispatchTest, AnUnknownNameIsReportedWhateverItsArguments) {
+  EXPECT_EQ(does("openCDF"), cdflib("invalidOperation", "openCDF"));
+}
+
+TEST_F(DispatchTest, NumbersOutOfRangeEndAsArgumentOutOfBounds) {
+  const Given file = create();
+  for (const double value : {1e19, -1e19, 9223372036854775808.0, -9223372036854775808.0,
+                             HUGE_VAL, -HUGE_VAL}) {
+    EXPECT_EQ(does("getVarName", {file, value}), kOutOfBounds) << value;
+    EXPECT_EQ(does("setValidate", {value}), kOutOfBounds) << value;
+  }
+}
+
+TEST_F(DispatchTest, NumbersAreTruncatedTowardZero) {
+  const Given file = create();
+  createVar(file, {.name = "a"});
+  createVar(file, {.name = "b"});
+  EXPECT_EQ(does("getVarName", {file, 1.9}), "char 1x1 'b'");
+  EXPECT_EQ(does("getVarName", {file, 0.7}), "char 1x1 'a'");
+  EXPECT_EQ(does("getVarName", {file, -0.9}), "char 1x1 'a'");
+  EXPECT_EQ(does("setValidate", {-1.9}), "done");
+}
+
+TEST_F(DispatchTest, ANumberMustBeOneDouble) {
+  const Given file = create();
+  createVar(file, {});
+  const std::string notScalar = validate("argumentNotDoubleScalar", "VARNUM");
+  EXPECT_EQ(does("getVarName", {file, Array::scalar(std::int32_t{0})}), notScalar);
+  EXPECT_EQ(does("getVarName", {file, Array::scalar(0.0F)}), notScalar);
+  EXPECT_EQ(does("getVarName", {file, Array::scalar(false)}), notScalar);
+  EXPECT_EQ(does("getVarName", {file, {0, 0}}), notScalar);
+  EXPECT_EQ(does("getVarName", {file, {1e30, 0}}), notScalar);
+  EXPECT_EQ(does("getVarName", {file, {}}), notScalar);
+  EXPECT_EQ(does("getVarName", {file, "0"}), notScalar);
+  EXPECT_EQ(does("getVarName", {file, Array::cell({1, 1})}), notScalar);
+}
+
+TEST_F(DispatchTest, NanIsTheMostNegativeNumberAndNoOverflow) {
+  const Given file = create();
+  createVar(file, {});
+  EXPECT_EQ(does("getVarName", {file, NAN}), refused("CDFgetzVarName", kNoSuchVar));
+}
+
+TEST_F(DispatchTest, ATextArgumentThatIsNoTextIsALogicError) {
+  const Given file = create();
+  const std::string logicError = "basic_string::_M_construct null not valid";
+  EXPECT_EQ(does("open", {5}), logicError);
+  EXPECT_EQ(does("create", {5}), logicError);
+  EXPECT_EQ(does("getVarNum", {file, 5}), logicError);
+  EXPECT_EQ(does("getConstantValue", {5}), logicError);
+  EXPECT_EQ(does("createAttr", {file, 5, 1}), logicError);
+}
+
+TEST_F(DispatchTest, TheUnloadHandlerIsRegisteredByACallThatFails) {
+  ::ambrix::Module other = std::move(module);
+  other.call("create", {Array::fromUtf8("left")});
+  EXPECT_THROW(other.call("nonsense"), ::ambrix::Error);
+  other.unload();
+  module = ::ambrix::Module();
+  EXPECT_EQ(other.lastWarnings().size(), 1U);
+}
+
+}  // namespace
+}  // namespace ambrix_test
