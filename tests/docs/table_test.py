@@ -1,0 +1,78 @@
+"""The table of commands agrees with the sources, and the manual with the table."""
+import pathlib
+import re
+import subprocess
+import sys
+import unittest
+
+sys.path.insert(0, str(pathlib.Path(__file__).parent))
+
+import table_file  # noqa: E402
+
+ROOT = table_file.ROOT
+TABLE = table_file.read()
+COMMANDS = TABLE["commands"]
+MODULE = ("gateway", "constants", "file", "attributes", "variables", "epoch")
+
+
+def sources():
+    return "".join(path.read_text() for folder in MODULE for path in (ROOT / folder).glob("*.[ch]*"))
+
+
+def counts(command):
+    """How many arguments it takes, at least and at most."""
+    required = [a for a in command["arguments"] if not a.get("optional")]
+    return len(required), len(command["arguments"])
+
+
+class TableTest(unittest.TestCase):
+    def test_the_manual_is_what_the_table_gives(self):
+        done = subprocess.run([ROOT / "script" / "docs", "--check"], check=False)
+        self.assertEqual(done.returncode, 0)
+
+    def test_the_table_is_in_its_own_layout(self):
+        self.assertEqual(table_file.PATH.read_text(), table_file.layout(TABLE) + "\n")
+
+    def test_has_each_command_once_with_its_counts(self):
+        text = (ROOT / "gateway" / "command_table.cc").read_text()
+        rows = re.findall(r'\{ ?\d+, "(\w+)", +(\d), (\d), ', text)
+        self.assertEqual(len(rows), 91)
+        self.assertEqual(sorted((c["name"], *counts(c)) for c in COMMANDS),
+                         sorted((name, int(least), int(most)) for name, least, most in rows))
+
+    def test_has_each_identifier_once_with_as_many_values(self):
+        text = (ROOT / "gateway" / "errors.h").read_text()
+        found = []
+        for component, body in re.findall(r'namespace TOLVEX::ambrix::(\w+) \{(.*?)\n\}  //', text,
+                                          re.S):
+            for name, parameters in re.findall(r"struct \w+ : Error \{\s+(?:explicit )?(\w+)"
+                                               r"\((.*?)\)\s+:", body, re.S):
+                count = parameters.count(",") + 1 if parameters else 0
+                found.append((f"TOLVEX:ambrix:{component}", name, count))
+        listed = [(row["component"], row["identifier"], len(row["values"]))
+                  for row in TABLE["identifiers"]]
+        self.assertEqual(sorted(listed), sorted(found))
+
+    def test_commands_raise_identifiers_that_there_are_with_all_their_values(self):
+        expected = {row["identifier"]: len(row["values"]) for row in TABLE["identifiers"]}
+        rows = [row for command in COMMANDS
+                for row in command["errors"] + command.get("warnings", [])]
+        rows += [row for kind in TABLE["argument_kinds"] for row in kind["errors"]]
+        for row in rows:
+            with self.subTest(row=row):
+                self.assertEqual(len(row["values"]), expected.get(row["identifier"]))
+
+    def test_names_the_routines_that_the_module_names(self):
+        in_sources = set(re.findall(r'"(CDF[a-z]\w+)"', sources()))
+        in_table = {routine for command in COMMANDS for routine in command["routines"]}
+        self.assertEqual(in_table, in_sources)
+
+    def test_names_the_labels_that_the_module_names(self):
+        labels = {a["label"] for command in COMMANDS for a in command["arguments"] if "label" in a}
+        for label in labels - {"VARIANCE"}:  # stands for a value there, not for an argument
+            with self.subTest(label=label):
+                self.assertIn(f'"{label}"', sources())
+
+
+if __name__ == "__main__":
+    unittest.main()
