@@ -136,17 +136,13 @@ class ArgumentList {
     show(text + ']');
   }
 
-  void show(const std::string& argument) {
-    text_ += ' ' + argument;
-  }
+  void show(const std::string& argument) { text_ += ' ' + argument; }
 
   void separate() {
     if (!text_.empty()) text_ += " | ";
   }
 
-  long number() {
-    return va_arg(list_, long);
-  }
+  long number() { return va_arg(list_, long); }
 
   template <typename T>
   T* pointer() {

@@ -143,9 +143,9 @@ double computeEPOCH(long year, long month, long day, long hour, long minute, lon
 double computeEPOCH16(long year, long month, long day, long hour, long minute, long second,
                       long millisecond, long microsecond, long nanosecond, long picosecond,
                       double* epoch) {
-  fakeCdflib().finish(timeText("computeEPOCH16", {year, month, day, hour, minute, second,
-                                                  millisecond, microsecond, nanosecond,
-                                                  picosecond}));
+  fakeCdflib().finish(timeText(
+      "computeEPOCH16",
+      {year, month, day, hour, minute, second, millisecond, microsecond, nanosecond, picosecond}));
   epoch[0] = static_cast<double>(year);
   epoch[1] = static_cast<double>(picosecond);
   return fakeCdflib().nextEpoch();

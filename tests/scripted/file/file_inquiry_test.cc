@@ -77,9 +77,8 @@ TEST_F(FileInquiryTest, GetLibraryVersionFetchesTheSubIncrementAndKeepsItBack) {
   fake.answer("LIB_INCREMENT_", {1});
   EXPECT_THAT(shown(call("getLibraryVersion")),
               ElementsAre("double 1x1 [3]", "double 1x1 [9]", "double 1x1 [1]"));
-  EXPECT_THAT(
-      calls(),
-      ElementsAre("GET_ LIB_VERSION_ | LIB_RELEASE_ | LIB_INCREMENT_ | LIB_subINCREMENT_"));
+  EXPECT_THAT(calls(),
+              ElementsAre("GET_ LIB_VERSION_ | LIB_RELEASE_ | LIB_INCREMENT_ | LIB_subINCREMENT_"));
   EXPECT_EQ(errorOf("getLibraryVersion", {file()}), validate("wrongNumberOfInputs"));
 }
 
@@ -96,8 +95,7 @@ TEST_F(FileInquiryTest, CopyrightsComeAsTheyAreLineBreaksIncluded) {
   EXPECT_EQ(result("getCopyright", {file()}).utf8(), text);
   fake.answerText("LIB_COPYRIGHT_", text);
   EXPECT_EQ(result("getLibraryCopyright").utf8(), text);
-  EXPECT_THAT(calls(),
-              ElementsAre("SELECT_ CDF_ 7 | GET_ CDF_COPYRIGHT_", "GET_ LIB_COPYRIGHT_"));
+  EXPECT_THAT(calls(), ElementsAre("SELECT_ CDF_ 7 | GET_ CDF_COPYRIGHT_", "GET_ LIB_COPYRIGHT_"));
 }
 
 TEST_F(FileInquiryTest, AnEmptyTextIsAnEmptyArray) {

@@ -11,7 +11,8 @@ using GetCompressionTest = ScriptedTest;
 TEST_F(GetCompressionTest, AFileHasTypeParameterAndPercentage) {
   const std::pair<Numbers, std::vector<std::string>> answers[] = {
       {{0}, {"char 1x14 'NO_COMPRESSION'", "double 0x0 []", "double 1x1 [0]"}},
-      {{1, 0, 100}, {"char 1x15 'RLE_COMPRESSION'", "char 1x12 'RLE_OF_ZEROS'", "double 1x1 [100]"}},
+      {{1, 0, 100},
+       {"char 1x15 'RLE_COMPRESSION'", "char 1x12 'RLE_OF_ZEROS'", "double 1x1 [100]"}},
       {{2, 0, 50},
        {"char 1x16 'HUFF_COMPRESSION'", "char 1x22 'OPTIMAL_ENCODING_TREES'", "double 1x1 [50]"}},
       {{3, 0, 51},

@@ -15,7 +15,8 @@ TEST_F(SetCompressionTest, AFileTakesTypeAndParameter) {
       {{file(), 5, 1}, "5 [1]"}, {{file(), 5, 9}, "5 [9]"}, {{file(), 2, -1}, "2 [-1]"}};
   for (const auto& [arguments, text] : settings) {
     EXPECT_THAT(call("setCompression", arguments), IsEmpty());
-    EXPECT_THAT(calls(), ElementsAre(std::string("SELECT_ CDF_ 7 | PUT_ CDF_COMPRESSION_ ") + text));
+    EXPECT_THAT(calls(),
+                ElementsAre(std::string("SELECT_ CDF_ 7 | PUT_ CDF_COMPRESSION_ ") + text));
   }
 }
 
@@ -45,13 +46,13 @@ TEST_F(SetCompressionTest, TheTypeIsCheckedBeforeTheParameterIsRead) {
 
 TEST_F(SetCompressionTest, AVariableTakesTypeAndParameter) {
   const std::pair<Arguments, const char*> settings[] = {
-      {{file(), 3, 0}, "0 [0]"},    {{file(), 3, 1}, "1 [0]"},    {{file(), 3, 2}, "2 [0]"},
-      {{file(), 3, 3}, "3 [0]"},    {{file(), 3, 1, 7}, "1 [7]"}, {{file(), 3, 5, 9}, "5 [9]"}};
+      {{file(), 3, 0}, "0 [0]"}, {{file(), 3, 1}, "1 [0]"},    {{file(), 3, 2}, "2 [0]"},
+      {{file(), 3, 3}, "3 [0]"}, {{file(), 3, 1, 7}, "1 [7]"}, {{file(), 3, 5, 9}, "5 [9]"}};
   for (const auto& [arguments, text] : settings) {
     EXPECT_THAT(call("setVarCompression", arguments), IsEmpty());
-    EXPECT_THAT(calls(), ElementsAre(
-                             std::string("SELECT_ CDF_ 7 | zVAR_ 3 | PUT_ zVAR_COMPRESSION_ ") +
-                             text));
+    EXPECT_THAT(
+        calls(),
+        ElementsAre(std::string("SELECT_ CDF_ 7 | zVAR_ 3 | PUT_ zVAR_COMPRESSION_ ") + text));
   }
 }
 
