@@ -37,9 +37,23 @@ CLI::App& addCommand(CLI::App& app, const HelpText& help) {
 
 void addInfo(CLI::App& app, Arguments& arguments) {
   CLI::App& info = addCommand(app, kInfoHelp);
-  info.add_option("FILE", arguments.info.file, "The file")->required();
+  info.add_option("FILE", arguments.info.file, "The file")->required()->type_name("");
   info.add_flag("--attributes", arguments.info.attributes, "Also list the attributes and entries");
   info.add_flag("--json", arguments.info.json, "Print a JSON object");
+}
+
+void addDump(CLI::App& app, Arguments& arguments) {
+  CLI::App& dump = addCommand(app, kDumpHelp);
+  dump.add_option("FILE", arguments.dump.file, "The file")->required()->type_name("");
+  dump.add_option("VARIABLE", arguments.dump.variable, "The variable's name or number")
+      ->required()
+      ->type_name("");
+  dump.add_option("--records", arguments.dump.records,
+                  "Only records A to B; one may be left out, and A alone is one record")
+      ->type_name("A:B");
+  dump.add_option("--format", arguments.dump.format, "table (the default), csv or json")
+      ->type_name("FORMAT")
+      ->transform(CLI::IsMember({"table", "csv", "json"}));
 }
 
 void addCall(CLI::App& app, Arguments& arguments) {
@@ -68,6 +82,7 @@ std::unique_ptr<CLI::App> makeParser(Arguments& arguments) {
                 "Print the versions of ambrix and of the CDF library and exit");
   app->add_flag("--man", arguments.manual)->group("");
   addInfo(*app, arguments);
+  addDump(*app, arguments);
   addCall(*app, arguments);
   addSession(*app, arguments);
   return app;

@@ -7,6 +7,7 @@
 #include <vector>
 
 #include "tool/call.h"
+#include "tool/dump.h"
 #include "tool/info.h"
 #include "tool/session.h"
 
@@ -14,6 +15,7 @@ namespace ambrix::tool {
 
 struct Arguments {
   CallOptions call;
+  DumpOptions dump;
   InfoOptions info;
   std::size_t maxArrayBytes = kSessionArrayBytes;
   bool version = false;

@@ -33,6 +33,7 @@ void runCommand(const std::string& command, const Arguments& arguments, Standard
   Module module;
   module.setWarningHandler(printWarning);
   if (command == "info") return runInfo(module, arguments.info, output);
+  if (command == "dump") return runDump(module, arguments.dump, output);
   if (command == "call") return runCall(module, arguments.call, output);
 }
 

@@ -1,0 +1,45 @@
+// `ambrix dump`: the values of a variable.
+#pragma once
+
+#include <memory>
+#include <string>
+
+#include "tool/slabs.h"
+#include "tool/standard_output.h"
+#include "tool/values.h"
+
+namespace ambrix::tool {
+
+struct DumpOptions {
+  std::string file;
+  std::string variable;
+  std::string records;
+  std::string format = "table";
+};
+
+/// Throws `UsageError` for records that are no range, and `ToolError` for those that are not there.
+void runDump(Module& module, const DumpOptions& options, StandardOutput& output);
+
+/// Records from the first to the one before the end.
+struct RecordRange {
+  std::size_t first = 0;
+  std::size_t end = 0;
+};
+
+/// How values are written, one after the other in host order.
+class DumpFormat {
+ public:
+  virtual ~DumpFormat() = default;
+  virtual std::string begin() { return {}; }
+  /// One value. `indices` are those within the record.
+  virtual std::string value(std::size_t record, const std::vector<std::size_t>& indices,
+                            const ValueText& value) = 0;
+  virtual std::string end() { return {}; }
+};
+
+std::unique_ptr<DumpFormat> makeTableFormat(const Variable& variable, const RecordRange& range,
+                                            bool colours);
+std::unique_ptr<DumpFormat> makeCsvFormat(const Variable& variable);
+std::unique_ptr<DumpFormat> makeJsonFormat(const Variable& variable, const RecordRange& range);
+
+}  // namespace ambrix::tool
