@@ -18,8 +18,8 @@ CELL = Array("cell", [0, 0], [])
 TOO_LARGE = 1e19
 
 # What an argument of a kind is taken for, to reach the arguments behind it.
-STAND_INS = {"number": 0.0, "numbers": [], "text": "x", "file name": "x", "variances": [],
-             "times": [], "value": 0.0}
+STAND_INS = {"number": 1.0, "numbers": [], "text": "x", "file name": "x", "variances": [],
+             "times": [], "value": INT8}
 # Arguments of a kind that cannot be converted, with the errors that they raise.
 WRONG = {
     "file": [(0.0, "argumentNotUint64Scalar", True),
@@ -32,6 +32,15 @@ WRONG = {
     "text": [(0.0, "", False)],
     "file name": [(0.0, "", False), (Array("char", [1, 1], "\ud800"), "invalidCharError", False)],
 }
+
+
+def takes_file(command):
+    return any(argument["kind"] == "file" for argument in command["arguments"])
+
+
+def stand_ins(command, file):
+    return [file if argument["kind"] == "file" else STAND_INS[argument["kind"]]
+            for argument in command["arguments"]]
 
 
 def wrong_arguments():
@@ -79,16 +88,34 @@ class RunningModuleTest(unittest.TestCase):
     def test_arguments_of_a_wrong_kind_raise_the_errors_of_the_kind_with_the_label(self):
         for command, position, wrong, name, values in wrong_arguments():
             with self.subTest(command=command["name"], position=position, wrong=wrong):
-                arguments = [self.file if argument["kind"] == "file" else
-                             STAND_INS[argument["kind"]] for argument in command["arguments"]]
-                if command["name"] == "getVarData":
-                    arguments[1] = 1.0  # a variable whose indices are looked at
+                arguments = stand_ins(command, self.file)
                 arguments[position] = wrong
                 error = self.error_of(command["name"], *arguments)
                 self.assertEqual((error.name, error.values), (name, values))
 
+    def test_a_file_that_the_library_refuses_is_reported_under_the_first_routine(self):
+        with tempfile.TemporaryDirectory() as folder, Session(cwd=folder) as session:
+            (file,) = session.call("create", "freed")
+            session.call("setChecksum", file, session.constant("OTHER_CHECKSUM"))
+            with self.assertRaises(CallError):  # but the library lets the file go
+                session.call("close", file)
+            for command in filter(takes_file, COMMANDS):
+                with self.subTest(command=command["name"]):
+                    arguments = stand_ins(command, file)
+                    if command["name"] == "createVar":
+                        arguments[5] = True  # one record variance there must be
+                    self.check_refused(session, command, arguments)
+
+    def check_refused(self, session, command, arguments):
+        with self.assertRaises(CallError) as raised:
+            session.call(command["name"], *arguments)
+        self.assertEqual(raised.exception.name, "libraryFailure")
+        self.assertEqual(raised.exception.values[0], command["routines"][0])
+
     def test_the_constants_are_those_listed(self):
-        listed = {name: value for row in TABLE["constants"] for name, value in row["values"].items()}
+        listed = {}
+        for row in TABLE["constants"]:
+            listed.update(row["values"])
         names = [cell.data for cell in self.session.call("getConstantNames")[0].data]
         self.assertEqual({name: self.session.constant(name) for name in names}, listed)
 
@@ -97,9 +124,10 @@ class RunningModuleTest(unittest.TestCase):
             (file,) = session.call("create", "datatypes")
             for row in TABLE["datatypes"]:
                 with self.subTest(datatype=row["name"]):
-                    number = session.value("createVar", file, row["name"], row["code"], 1, [], True, [])
-                    self.assertEqual(session.values("inquireVar", file, number)[1],
-                                     row["name"].lower())
+                    definition = (row["name"], row["code"], 1, [], True, [])
+                    number = session.value("createVar", file, *definition)
+                    datatype = session.values("inquireVar", file, number)[1]
+                    self.assertEqual(datatype, row["name"].lower())
                     (pad,) = session.call("getVarPadValue", file, number)
                     self.assertEqual(pad.class_name, row["class"])
 

@@ -16,7 +16,8 @@ MODULE = ("gateway", "constants", "file", "attributes", "variables", "epoch")
 
 
 def sources():
-    return "".join(path.read_text() for folder in MODULE for path in (ROOT / folder).glob("*.[ch]*"))
+    files = [path for folder in MODULE for path in (ROOT / folder).glob("*.[ch]*")]
+    return "".join(path.read_text() for path in files)
 
 
 def counts(command):
