@@ -4,7 +4,9 @@ import pathlib
 
 ROOT = pathlib.Path(__file__).resolve().parents[2]
 PATH = ROOT / "docs" / "commands.json"
-WIDTH = 160
+INDENT = 2
+WIDTH = 100
+FLAT_WIDTH = 160  # of what holds no further lists or objects
 
 
 def read(path=PATH):
@@ -20,22 +22,24 @@ def layout(value, indent=0, prefix=0):
     line = json.dumps(value, ensure_ascii=False)
     if not value or not isinstance(value, (dict, list)):
         return line
-    shallow = all(not isinstance(part, (dict, list)) for part in _parts(value))
-    if shallow and not _is_script(value) and indent + prefix + len(line) < WIDTH:
+    width = FLAT_WIDTH if _is_flat(value) else WIDTH
+    if not _is_example(value) and indent + prefix + len(line) < width:
         return line
-    inner = " " * (indent + 1)
+    inner = indent + INDENT
     if isinstance(value, list):
-        lines = [layout(part, indent + 1) for part in value]
-        return "[\n" + ",\n".join(inner + text for text in lines) + "\n" + " " * indent + "]"
-    lines = [f"{json.dumps(key)}: {layout(part, indent + 1, len(key) + 4)}"
-             for key, part in value.items()]
-    return "{\n" + ",\n".join(inner + text for text in lines) + "\n" + " " * indent + "}"
+        lines = [layout(part, inner) for part in value]
+    else:
+        lines = [f"{json.dumps(key)}: {layout(part, inner, len(key) + 4)}"
+                 for key, part in value.items()]
+    opening, closing = "[]" if isinstance(value, list) else "{}"
+    body = ",\n".join(" " * inner + text for text in lines)
+    return f"{opening}\n{body}\n{' ' * indent}{closing}"
 
 
-def _parts(value):
-    return value.values() if isinstance(value, dict) else value
+def _is_flat(value):
+    parts = value.values() if isinstance(value, dict) else value
+    return not any(isinstance(part, (dict, list)) for part in parts)
 
 
-def _is_script(value):
-    return isinstance(value, list) and any(isinstance(part, str) and part.startswith("> ")
-                                           for part in value)
+def _is_example(value):
+    return isinstance(value, list) and any(str(part).startswith("> ") for part in value)
