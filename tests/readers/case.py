@@ -1,0 +1,55 @@
+"""What the tests of this folder share."""
+
+import tempfile
+import unittest
+import warnings
+
+from readers import cdflib_reader, module_reader, pycdfpp_reader
+from readers.comparison import variable_differences
+from readers.content import Unread, attempt
+from readers.known_faults import matching
+from support.ambrix_session import Session
+
+READERS = (cdflib_reader, pycdfpp_reader)
+
+
+class ReadersCase(unittest.TestCase):
+    """A session in a temporary folder."""
+
+    def setUp(self):
+        warnings.simplefilter("ignore")  # the readers' own
+        folder = tempfile.TemporaryDirectory()
+        self.addCleanup(folder.cleanup)
+        self.folder = folder.name
+        self.session = Session(cwd=self.folder)
+        self.addCleanup(self.session.close)
+
+    def read(self, path):
+        """The content through the module."""
+        return module_reader.read(self.session, str(path))
+
+
+def unexplained(reader, name, found):
+    """The differences that are no known fault of the reader, and the rows that explain the rest."""
+    rows = {text: matching(reader.NAME, name, text) for text in found}
+    used = {row for explaining in rows.values() for row in explaining}
+    return [text for text, explaining in rows.items() if not explaining], used
+
+
+def reference(one, path):
+    """The variables of a file by name as an independent reader has them, without known faults.
+
+    Variables that no reader has right are left out.
+    """
+    contents = [(reader, attempt(reader.read, str(path))) for reader in READERS]
+    found = {}
+    for reader, content in contents:
+        if isinstance(content, Unread):
+            continue
+        for name, variable in content.variables.items():
+            texts = [f"variable {name}: {text}"
+                     for text in variable_differences(one.variables[name], variable)]
+            faulty = any(matching(reader.NAME, path.name, text) for text in texts)
+            if name not in found and not faulty:
+                found[name] = variable
+    return found

@@ -1,0 +1,108 @@
+"""What a CDF file holds, in one form whichever reader it comes from.
+
+Values are numpy arrays of the shape (records, d1, ..., dn), with the dimensions as the file
+declares them, whatever the file's majority. A last axis is added for the bytes of a character
+value and for the two doubles of an epoch16. Names are the file's bytes, as Latin-1 text.
+"""
+
+from dataclasses import dataclass, field
+
+import numpy as np
+
+# code: the module's name for it, the type of its values, the class of the host's arrays
+DATATYPES = {
+    1: ("cdf_int1", "i1", "int8"),
+    2: ("cdf_int2", "<i2", "int16"),
+    4: ("cdf_int4", "<i4", "int32"),
+    11: ("cdf_uint1", "u1", "uint8"),
+    12: ("cdf_uint2", "<u2", "uint16"),
+    14: ("cdf_uint4", "<u4", "uint32"),
+    21: ("cdf_real4", "<f4", "single"),
+    22: ("cdf_real8", "<f8", "double"),
+    31: ("cdf_epoch", "<f8", "double"),
+    32: ("cdf_epoch16", "<f8", "double"),
+    41: ("cdf_byte", "i1", "int8"),
+    44: ("cdf_float", "<f4", "single"),
+    45: ("cdf_double", "<f8", "double"),
+    51: ("cdf_char", "u1", "char"),
+    52: ("cdf_uchar", "u1", "char"),
+}
+CODES = {name: code for code, (name, _, _) in DATATYPES.items()}
+INT8, TT2000 = 8, 33  # in many files, and not supported by the module
+EPOCH16 = 32
+CHARACTERS = (51, 52)
+
+
+def dtype_of(code):
+    """The numpy type of one stored number or byte."""
+    return np.dtype("<i8") if code in (INT8, TT2000) else np.dtype(DATATYPES[code][1])
+
+
+def leading_of(code, elements):
+    """The axes that one value adds: its characters, or the two doubles of an epoch16."""
+    if code in CHARACTERS:
+        return (elements,)
+    return (2,) if code == EPOCH16 else ()
+
+
+@dataclass
+class Variable:
+    code: int
+    elements: int
+    sizes: tuple  # d1, ..., dn
+    varies: tuple  # dimension variances
+    record_varies: bool
+    values: np.ndarray = None  # None: not read
+    pad: np.ndarray = None  # one value, flat; None: the file declares none
+    sparse: str = "no"  # "no", "pad" or "previous"
+
+    @property
+    def shape(self):
+        """The shape of the values but for the number of records."""
+        return tuple(self.sizes) + leading_of(self.code, self.elements)
+
+
+@dataclass
+class Attribute:
+    is_global: bool
+    # By gEntry number or by variable name: (code, values), characters as bytes.
+    entries: dict = field(default_factory=dict)
+
+
+@dataclass
+class Content:
+    row_major: bool
+    keeps_entry_numbers: bool = True  # of gEntries, where some were never written
+    variables: dict = field(default_factory=dict)
+    attributes: dict = field(default_factory=dict)
+
+
+class Unread:
+    """In the place of what a reader could not read."""
+
+    def __init__(self, error):
+        self.error = error
+
+
+def attempt(function, *arguments):
+    """The result, or `Unread` when the reader fails on this item."""
+    try:
+        return function(*arguments)
+    except Exception as error:  # readers fail in whatever way; what they may miss is listed
+        return Unread(error)
+
+
+def text_bytes(texts, elements):
+    """The bytes of fixed-length texts, each byte a character of a Latin-1 text."""
+    texts = np.asarray(texts)
+    flat = [text.encode("latin-1").ljust(elements, b"\0") for text in texts.reshape(-1).tolist()]
+    data = np.frombuffer(b"".join(flat), "u1")
+    return data.reshape(texts.shape + (elements,))
+
+
+def expand(values, variable):
+    """Values without the axes of dimensions that do not vary, repeated along these."""
+    leading = leading_of(variable.code, variable.elements)
+    kept = tuple(size if vary else 1 for size, vary in zip(variable.sizes, variable.varies))
+    values = values.reshape((-1,) + kept + leading)
+    return np.broadcast_to(values, (values.shape[0],) + tuple(variable.sizes) + leading)

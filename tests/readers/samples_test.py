@@ -1,0 +1,119 @@
+"""Everything in real files, value by value, as cdflib and pycdfpp read it."""
+
+import unittest
+
+from readers import pycdfpp_reader
+from readers.case import READERS, ReadersCase, unexplained
+from readers.comparison import differences
+from readers.content import attempt
+from readers.known_faults import rows_for
+from readers.sample_files import FOLDER, UNREADABLE, distribution_files, folder_files
+from readers.sample_files import needs_folder
+from support.ambrix_session import CallError
+
+
+class SamplesTest(ReadersCase):
+    def compare(self, files):
+        self.assertTrue(files)
+        used = set()
+        for name, path in files.items():
+            mine = self.read(path)
+            for reader in READERS:
+                with self.subTest(file=name, reader=reader.NAME):
+                    theirs = attempt(reader.read, str(path))
+                    rest, rows = unexplained(reader, name, differences(mine, theirs))
+                    used |= rows
+                    self.assertEqual(rest, [])
+        for reader in READERS:
+            stale = [row for row in rows_for(reader.NAME, files) if row not in used]
+            self.assertEqual(stale, [], "known faults that are none any more")
+
+    def test_files_of_the_cdf_distribution(self):
+        self.compare(distribution_files())
+
+    @needs_folder
+    def test_files_of_the_sample_folder(self):
+        self.compare(folder_files())
+
+
+@needs_folder
+class OrderOfDimensionsTest(ReadersCase):
+    """Told without the code that puts the module's arrays into the readers' order."""
+
+    def check(self, name, variable, host_size, order):
+        """The module's data are the file's bytes, which lie in numpy's "C" or "F" order."""
+        path = folder_files()[name]
+        theirs = pycdfpp_reader.read(str(path)).variables[variable]
+        (file,) = self.session.call("open", str(path))
+        number = self.session.value("getVarNum", file, variable)
+        sizes = self.session.call("inquireVar", file, number)[3]
+        self.assertEqual(sizes.data, host_size)
+        for record in range(len(theirs.values)):
+            (one,) = self.session.call("getVarRecordData", file, number, record)
+            self.assertEqual(one.size, host_size)
+            self.assertEqual(one.data, theirs.values[record].flatten(order).tolist())
+            (same,) = self.session.call("hyperGetVarData", file, number, record, 1, 1,
+                                        [0] * len(host_size), host_size, [1] * len(host_size))
+            self.assertEqual(same, one)
+        self.session.call("close", file)
+
+    def test_a_row_major_variable_has_its_dimensions_reversed(self):
+        self.check("a_cdf.cdf", "var5d_counter", [2, 3, 4, 5], "C")
+        self.check("nasajava_testCdfRowMajor.cdf", "rank3float", [2, 5], "C")
+
+    def test_a_column_major_variable_has_its_dimensions_as_they_are(self):
+        self.check("a_col_major_cdf.cdf", "var5d_counter", [5, 4, 3, 2], "F")
+        self.check("nasajava_testCdfColMajor.cdf", "rank3float", [5, 2], "F")
+
+    def test_indices_are_in_the_host_s_order(self):
+        for name, indices in (("a_cdf.cdf", [1, 2, 3, 4]), ("a_col_major_cdf.cdf", [4, 3, 2, 1])):
+            path = folder_files()[name]
+            theirs = pycdfpp_reader.read(str(path)).variables["var5d_counter"]
+            (file,) = self.session.call("open", str(path))
+            number = self.session.value("getVarNum", file, "var5d_counter")
+            value = self.session.value("getVarData", file, number, 2, indices)
+            self.assertEqual(value, theirs.values[2, 4, 3, 2, 1])
+            self.session.call("close", file)
+
+
+@needs_folder
+class RefusedTest(ReadersCase):
+    def assert_raises(self, identifier, values, *call):
+        with self.assertRaises(CallError) as raised:
+            self.session.call(*call)
+        error = raised.exception
+        self.assertEqual((error.identifier, error.values), ("TOLVEX:ambrix:cdflib:" + identifier,
+                                                            values))
+
+    def test_a_file_that_the_library_refuses(self):
+        for name in UNREADABLE:
+            self.assert_raises("fileOpenError", [], "open", str(FOLDER / name))
+
+    def test_variables_of_unsupported_datatypes(self):
+        (file,) = self.session.call("open", str(folder_files()["nasajava_test.cdf"]))
+        for name, code, zeros in (("newI8", 8, [0]), ("tt2000", 33, [])):
+            number = self.session.value("getVarNum", file, name)
+            values = [code, "DATATYPE"]
+            ones = [1] * len(zeros)
+            self.assert_raises("unrecognizedValue", values, "inquireVar", file, number)
+            self.assert_raises("unrecognizedValue", values, "getVarPadValue", file, number)
+            self.assert_raises("unrecognizedValue", values, "getVarRecordData", file, number, 0)
+            self.assert_raises("unrecognizedValue", values, "getVarData", file, number, 0, zeros)
+            self.assert_raises("unrecognizedValue", values, "hyperGetVarData", file, number, 0, 1,
+                               1, zeros, ones, ones)
+
+    def test_entries_of_unsupported_datatypes(self):
+        (file,) = self.session.call("open", str(folder_files()["testutf8.cdf"]))
+        number = self.session.value("getAttrNum", file, "TestDate")
+        for command in ("getAttrgEntry", "inquireAttrgEntry"):
+            self.assert_raises("unrecognizedValue", [33, "DATATYPE"], command, file, number, 2)
+        number = self.session.value("getAttrNum", file, "Test")
+        self.assert_raises("unrecognizedValue", [8, "DATATYPE"], "getAttrgEntry", file, number, 17)
+        variable = self.session.value("getVarNum", file, "tt2000")
+        number = self.session.value("getAttrNum", file, "dummy")
+        self.assert_raises("unrecognizedValue", [33, "DATATYPE"], "getAttrEntry", file, number,
+                           variable)
+
+
+if __name__ == "__main__":
+    unittest.main()
