@@ -56,6 +56,26 @@ void addDump(CLI::App& app, Arguments& arguments) {
       ->transform(CLI::IsMember({"table", "csv", "json"}));
 }
 
+void addConvert(CLI::App& app, Arguments& arguments) {
+  CLI::App& convert = addCommand(app, kConvertHelp);
+  ConvertOptions& options = arguments.convert;
+  convert.add_option("IN", options.input, "The file to copy")->required()->type_name("");
+  convert.add_option("OUT", options.output, "The file to write")->required()->type_name("");
+  convert
+      .add_option("--compression", options.compression,
+                  "Compress the file as a whole: none, rle, huff, ahuff or gzip, which may have a "
+                  "level from 1 to 9 (6 if left out); variables keep their own compression")
+      ->type_name("TYPE[:LEVEL]");
+  convert.add_option("--majority", options.majority, "row or column")
+      ->type_name("MAJORITY")
+      ->transform(CLI::IsMember({"row", "column"}));
+  convert.add_option("--checksum", options.checksum, "md5 or none")
+      ->type_name("CHECKSUM")
+      ->transform(CLI::IsMember({"md5", "none"}));
+  convert.add_flag("--skip-unsupported", options.skipUnsupported,
+                   "Leave out what the module does not support, and list it");
+}
+
 void addCall(CLI::App& app, Arguments& arguments) {
   CLI::App& call = addCommand(app, kCallHelp);
   call.add_option("--file", arguments.call.file,
@@ -83,6 +103,7 @@ std::unique_ptr<CLI::App> makeParser(Arguments& arguments) {
   app->add_flag("--man", arguments.manual)->group("");
   addInfo(*app, arguments);
   addDump(*app, arguments);
+  addConvert(*app, arguments);
   addCall(*app, arguments);
   addSession(*app, arguments);
   return app;

@@ -7,6 +7,7 @@
 #include <vector>
 
 #include "tool/call.h"
+#include "tool/convert.h"
 #include "tool/dump.h"
 #include "tool/info.h"
 #include "tool/session.h"
@@ -15,6 +16,7 @@ namespace ambrix::tool {
 
 struct Arguments {
   CallOptions call;
+  ConvertOptions convert;
   DumpOptions dump;
   InfoOptions info;
   std::size_t maxArrayBytes = kSessionArrayBytes;

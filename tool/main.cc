@@ -9,6 +9,7 @@
 #include "tool/cdf_file.h"
 #include "tool/command_line.h"
 #include "tool/failure.h"
+#include "tool/man_page.h"
 #include "tool/warnings.h"
 
 namespace ambrix::tool {
@@ -34,12 +35,14 @@ void runCommand(const std::string& command, const Arguments& arguments, Standard
   module.setWarningHandler(printWarning);
   if (command == "info") return runInfo(module, arguments.info, output);
   if (command == "dump") return runDump(module, arguments.dump, output);
+  if (command == "convert") return runConvert(module, arguments.convert);
   if (command == "call") return runCall(module, arguments.call, output);
 }
 
 void run(const CLI::App& parser, const Arguments& arguments, StandardOutput& output) {
   const auto commands = parser.get_subcommands();
   if (arguments.version) return printVersions(output);
+  if (arguments.manual) return output.write(manualPage(parser));
   if (commands.empty()) throw UsageError("which command?");
   runCommand(commands.front()->get_name(), arguments, output);
 }

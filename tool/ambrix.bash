@@ -1,0 +1,27 @@
+# Completion of the ambrix command line for bash.
+
+_ambrix() {
+  local word=$2 previous=$3 command=${COMP_WORDS[1]}
+  local commands="info dump call convert session"
+  declare -A options=(
+    [info]="--attributes --json --help"
+    [dump]="--records --format --help"
+    [call]="--file --help"
+    [convert]="--compression --majority --checksum --skip-unsupported --help"
+    [session]="--max-array-bytes --help"
+  )
+  declare -A values=(
+    [--format]="table csv json"
+    [--majority]="row column"
+    [--checksum]="md5 none"
+    [--compression]="none rle huff ahuff gzip"
+  )
+  if [[ $COMP_CWORD == 1 ]]; then
+    mapfile -t COMPREPLY < <(compgen -W "$commands --help --version" -- "$word")
+  elif [[ -n ${values[$previous]:-} ]]; then
+    mapfile -t COMPREPLY < <(compgen -W "${values[$previous]}" -- "$word")
+  elif [[ $word == -* ]]; then
+    mapfile -t COMPREPLY < <(compgen -W "${options[$command]:-}" -- "$word")
+  fi
+}
+complete -o default -F _ambrix ambrix

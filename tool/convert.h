@@ -1,0 +1,53 @@
+// `ambrix convert`: a copy of a file with other settings.
+#pragma once
+
+#include <string>
+#include <vector>
+
+#include "tool/cdf_file.h"
+#include "tool/variable.h"
+
+namespace ambrix::tool {
+
+struct ConvertOptions {
+  std::string input;
+  std::string output;
+  std::string compression;  // empty: as the input has it
+  std::string majority;
+  std::string checksum;
+  bool skipUnsupported = false;
+};
+
+void runConvert(Module& module, const ConvertOptions& options);
+
+/// A variable on its way from one file to another.
+struct Copied {
+  Variable source;
+  Variable target;
+};
+
+/// The two files of a conversion.
+struct Conversion {
+  Module& module;
+  const ConvertOptions& options;
+  CdfFile& input;
+  CdfFile& output;
+  bool transposes = false;        // the files differ in majority
+  std::vector<Copied> variables;  // those that are copied
+};
+
+/// What the module cannot carry over, one line each.
+std::vector<std::string> listUnsupported(CdfFile& input);
+
+/// Throws `UsageError` when the settings asked for are none that there are.
+void checkOptions(const ConvertOptions& options);
+
+void copySettings(Conversion& conversion);
+void createVariables(Conversion& conversion);
+void copyAttributes(Conversion& conversion);
+void copyData(Conversion& conversion);
+
+/// The number of a datatype that is named as the module names it.
+double datatypeCode(Module& module, std::string name);
+
+}  // namespace ambrix::tool

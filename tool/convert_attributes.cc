@@ -1,0 +1,64 @@
+// Attributes and their entries.
+#include <algorithm>
+
+#include "tool/attributes.h"
+#include "tool/convert.h"
+#include "tool/values.h"
+
+namespace ambrix::tool {
+namespace {
+
+/// Numbers of variables move down by the number of those before them that are left out.
+double targetEntry(const Conversion& conversion, const Attribute& attribute, double entry) {
+  if (attribute.global) return entry;
+  for (const Copied& variable : conversion.variables)
+    if (variable.source.number == entry) return variable.target.number;
+  const double all = countVariables(conversion.input);
+  return entry - (all - static_cast<double>(conversion.variables.size()));
+}
+
+bool isLeftOut(const Conversion& conversion, const Attribute& attribute, double entry) {
+  if (attribute.global || entry >= countVariables(conversion.input)) return false;
+  return std::ranges::none_of(conversion.variables, [&](const Copied& variable) {
+    return variable.source.number == entry;
+  });
+}
+
+/// The value with as many elements as the entry has: the module ends texts at a zero byte.
+Array completeText(Array value, std::size_t elements) {
+  if (value.classId() != ClassId::kChar || value.elementCount() >= elements) return value;
+  std::u16string units = value.text();
+  units.resize(elements);
+  return Array::text(units);
+}
+
+void copyEntry(Conversion& conversion, const Attribute& attribute, const EntryHeader& entry) {
+  const Array value = completeText(readEntry(conversion.input, attribute, entry.number),
+                                   static_cast<std::size_t>(entry.elements));
+  const Array number = Array::scalar(attribute.number);
+  const Array target = Array::scalar(targetEntry(conversion, attribute, entry.number));
+  const Array datatype = Array::scalar(datatypeCode(conversion.module, entry.datatype));
+  const ArrayView arguments[] = {number, target, datatype, value};
+  conversion.output.call("putAttrEntry", arguments);
+}
+
+}  // namespace
+
+void copyAttributes(Conversion& conversion) {
+  const double scopes[] = {constantValue(conversion.module, "VARIABLE_SCOPE"),
+                           constantValue(conversion.module, "GLOBAL_SCOPE")};
+  const double count = countAttributes(conversion.input);
+  for (double number = 0; number < count; ++number) {
+    const Attribute attribute = inquireAttribute(conversion.input, number);
+    const Array name = Array::fromNarrow(attribute.name);
+    const Array scope = Array::scalar(scopes[attribute.global ? 1 : 0]);
+    const ArrayView arguments[] = {name, scope};
+    conversion.output.call("createAttr", arguments);
+    forEachEntry(conversion.input, attribute, [&](const EntryHeader& entry) {
+      if (!entry.supported || isLeftOut(conversion, attribute, entry.number)) return;
+      copyEntry(conversion, attribute, entry);
+    });
+  }
+}
+
+}  // namespace ambrix::tool
