@@ -21,8 +21,7 @@ TEST_F(EpochTest, ComputesKnownEpochs) {
   EXPECT_EQ(does("computeEpoch", {{2000, 1, 1, 0, 0, 0, 0}}), "double 1x1 [63113904000000]");
   EXPECT_EQ(does("computeEpoch", {{1970, 1, 1, 0, 0, 0, 0}}), "double 1x1 [62167219200000]");
   EXPECT_EQ(does("computeEpoch", {{2000, 1, 1, 0, 0, 0, 1}}), "double 1x1 [63113904000001]");
-  EXPECT_EQ(does("computeEpoch", {{2000, 2, 29, 23, 59, 59, 999}}),
-            "double 1x1 [63119087999999]");
+  EXPECT_EQ(does("computeEpoch", {{2000, 2, 29, 23, 59, 59, 999}}), "double 1x1 [63119087999999]");
 }
 
 TEST_F(EpochTest, EachGroupOfSevenIsATimeWhateverTheShape) {
@@ -52,8 +51,7 @@ TEST_F(EpochTest, AWrongNumberOfComponentsAndAWrongClassAreOneError) {
   EXPECT_EQ(does("computeEpoch", {"1234567"}), badVector(7));
   EXPECT_EQ(does("computeEpoch", {Array::cell({7, 1})}), badVector(7));
   EXPECT_EQ(does("computeEpoch16", {{2000, 1, 1, 0, 0, 0, 0}}), badVector(10));
-  EXPECT_EQ(does("computeEpoch16", {row<float>({2000, 1, 1, 0, 0, 0, 0, 0, 0, 0})}),
-            badVector(10));
+  EXPECT_EQ(does("computeEpoch16", {row<float>({2000, 1, 1, 0, 0, 0, 0, 0, 0, 0})}), badVector(10));
 }
 
 TEST_F(EpochTest, AnIllegalTimeEndsTheCommand) {

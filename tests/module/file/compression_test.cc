@@ -29,8 +29,7 @@ TEST_F(FileCompressionTest, EveryTypeIsReturnedByItsNameWithItsParameter) {
             "char 1x16 'HUFF_COMPRESSION'; char 1x22 'OPTIMAL_ENCODING_TREES'; double 1x1 [0]");
   EXPECT_EQ(compressed({3}),
             "char 1x17 'AHUFF_COMPRESSION'; char 1x22 'OPTIMAL_ENCODING_TREES'; double 1x1 [0]");
-  EXPECT_EQ(compressed({5, 7}),
-            "char 1x16 'GZIP_COMPRESSION'; double 1x1 [7]; double 1x1 [0]");
+  EXPECT_EQ(compressed({5, 7}), "char 1x16 'GZIP_COMPRESSION'; double 1x1 [7]; double 1x1 [0]");
   EXPECT_EQ(compressed({0}), "char 1x14 'NO_COMPRESSION'; double 0x0 []; double 1x1 [100]");
   EXPECT_EQ(compressed({0, 5}), "char 1x14 'NO_COMPRESSION'; double 0x0 []; double 1x1 [100]");
 }

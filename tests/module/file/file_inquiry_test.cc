@@ -52,10 +52,17 @@ TEST_F(FileInquiryTest, FilesOfOthersShowTheirEncodingAndMajority) {
 }
 
 TEST_F(FileInquiryTest, EveryEncodingHasItsName) {
-  const std::pair<const char*, const char*> encodings[] = {
-      {"alphaosf1", "ALPHAOSF1"}, {"alphavmsd", "ALPHAMVSD"}, {"alphavmsg", "ALPHAMVSG"},
-      {"alphavmsi", "ALPHAMVSI"}, {"decstation", "DECSTATION"}, {"hp", "HP"}, {"ibmrs", "IBMRS"},
-      {"next", "NEXT"}, {"sgi", "SGI"}, {"sun", "SUN"}, {"vax", "VAX"}};
+  const std::pair<const char*, const char*> encodings[] = {{"alphaosf1", "ALPHAOSF1"},
+                                                           {"alphavmsd", "ALPHAMVSD"},
+                                                           {"alphavmsg", "ALPHAMVSG"},
+                                                           {"alphavmsi", "ALPHAMVSI"},
+                                                           {"decstation", "DECSTATION"},
+                                                           {"hp", "HP"},
+                                                           {"ibmrs", "IBMRS"},
+                                                           {"next", "NEXT"},
+                                                           {"sgi", "SGI"},
+                                                           {"sun", "SUN"},
+                                                           {"vax", "VAX"}};
   AMBRIX_NEED_SAMPLE(folder, "encodings");
   for (const auto& [name, encoding] : encodings) {
     const Given file = open(folder + "/alltypes_" + name + ".cdf");

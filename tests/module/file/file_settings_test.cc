@@ -14,9 +14,9 @@ struct Setter {
 };
 
 const Setter kSetters[] = {
-    {"setFormat", "NUMBUFFERS"},        {"setChecksum", "MODE"},
-    {"setMajority", "MAJORITY"},        {"setReadOnlyMode", "MODE"},
-    {"setCacheSize", "NUMBUFFERS"},     {"setVarsCacheSize", "NUMBUFFERS"},
+    {"setFormat", "NUMBUFFERS"},         {"setChecksum", "MODE"},
+    {"setMajority", "MAJORITY"},         {"setReadOnlyMode", "MODE"},
+    {"setCacheSize", "NUMBUFFERS"},      {"setVarsCacheSize", "NUMBUFFERS"},
     {"setStageCacheSize", "NUMBUFFERS"}, {"setCompressionCacheSize", "NUMBUFFERS"},
 };
 
@@ -60,8 +60,7 @@ TEST_F(FileSettingsTest, NumbersBeyond32BitsAreRefusedByTheLibrary) {
   EXPECT_EQ(does("setFormat", {file, cut + 2}), refused("CDFsetFormat", kBadFormat));
   EXPECT_EQ(does("setMajority", {file, cut + 2}), refused("CDFsetMajority", kBadMajority));
   EXPECT_EQ(does("setChecksum", {file, cut + 1}), refused("CDFsetChecksum", kBadChecksum));
-  EXPECT_EQ(does("setReadOnlyMode", {file, cut}),
-            refused("CDFsetReadOnlyMode", kBadReadonlyMode));
+  EXPECT_EQ(does("setReadOnlyMode", {file, cut}), refused("CDFsetReadOnlyMode", kBadReadonlyMode));
   EXPECT_EQ(does("setCacheSize", {file, cut + 9}), refused("CDFsetCacheSize", kBadCacheSize));
   EXPECT_EQ(does("getMajority", {file}), "char 1x9 'ROW_MAJOR'");
   EXPECT_EQ(does("getChecksum", {file}), "char 1x11 'NO_CHECKSUM'");

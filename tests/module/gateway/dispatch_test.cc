@@ -47,11 +47,11 @@ struct Counts {
 };
 
 // One row of each kind of range; the whole table has a test of its own.
-const Counts kCounts[] = {{"getVarData", 3, 4},     {"setCompression", 2, 3},
-                          {"setVarCompression", 3, 4}, {"getConstantNames", 0, 0},
-                          {"getFileBackward", 0, 0},  {"getLibraryVersion", 0, 0},
-                          {"getLibraryCopyright", 0, 0}, {"getValidate", 0, 0},
-                          {"open", 1, 1},           {"hyperPutVarData", 9, 9}};
+const Counts kCounts[] = {
+    {"getVarData", 3, 4},          {"setCompression", 2, 3},  {"setVarCompression", 3, 4},
+    {"getConstantNames", 0, 0},    {"getFileBackward", 0, 0}, {"getLibraryVersion", 0, 0},
+    {"getLibraryCopyright", 0, 0}, {"getValidate", 0, 0},     {"open", 1, 1},
+    {"hyperPutVarData", 9, 9}};
 
 TEST_F(DispatchTest, TooFewAndTooManyArgumentsAreRefusedBeforeAnyIsRead) {
   for (const Counts& row : kCounts) {
@@ -79,8 +79,8 @@ TEST_F(DispatchTest, AnUnknownNameIsReportedWhateverItsArguments) {
 
 TEST_F(DispatchTest, NumbersOutOfRangeEndAsArgumentOutOfBounds) {
   const Given file = create();
-  for (const double value : {1e19, -1e19, 9223372036854775808.0, -9223372036854775808.0,
-                             HUGE_VAL, -HUGE_VAL}) {
+  for (const double value :
+       {1e19, -1e19, 9223372036854775808.0, -9223372036854775808.0, HUGE_VAL, -HUGE_VAL}) {
     EXPECT_EQ(does("getVarName", {file, value}), kOutOfBounds) << value;
     EXPECT_EQ(does("setValidate", {value}), kOutOfBounds) << value;
   }

@@ -1,8 +1,8 @@
 // Creating, opening, closing and deleting files, and who may be told of which identifier.
-#include "tests/module/support/module_test.h"
-
 #include <filesystem>
 #include <fstream>
+
+#include "tests/module/support/module_test.h"
 
 namespace ambrix_test {
 namespace {

@@ -85,8 +85,8 @@ inline const std::string kWrongNumberOfInputs = "TOLVEX:ambrix:validate:wrongNum
 inline const std::string kInvalidFileId = "TOLVEX:ambrix:cdflib:invalidFileId()";
 
 // Skips the test where the folder of samples is absent.
-#define AMBRIX_NEED_SAMPLE(variable, name)    \
-  const std::string variable = sample(name);  \
+#define AMBRIX_NEED_SAMPLE(variable, name)   \
+  const std::string variable = sample(name); \
   if (variable.empty()) GTEST_SKIP() << "no " name ": set AMBRIX_SAMPLES to the folder of samples"
 
 }  // namespace ambrix_test

@@ -1,0 +1,176 @@
+// "hyperGetVarData": strided blocks of records and dimensions.
+#include <numeric>
+
+#include "tests/module/support/module_test.h"
+
+namespace ambrix_test {
+namespace {
+
+using ReadHyperslabsTest = ModuleTest;
+const std::string kTooLarge = "TOLVEX:ambrix:cdflib:dimSizeTooLarge()";
+
+std::string failed(const char* text) {
+  return refused("CDFhyperGetzVarData", text);
+}
+
+TEST_F(ReadHyperslabsTest, ScalarRecordsAreAColumn) {
+  const Given example = open(distributionSample("example2.cdf"));
+  EXPECT_EQ(does("hyperGetVarData", {example, 0, 0, 3, 1, {}, {}, {}}), "int32 3x1 [0 100 200]");
+  EXPECT_EQ(does("hyperGetVarData", {example, 0, 2, 4, 7, {}, {}, {}}),
+            "int32 4x1 [200 900 1600 2300]");
+}
+
+// Value 20 r + c + 200 record at CDF indices (r, c), the host's (c, r).
+TEST_F(ReadHyperslabsTest, ARowMajorBlockIsGivenAndReturnedInTheHostsOrder) {
+  const Given example = open(distributionSample("example1.cdf"));
+  EXPECT_EQ(does("hyperGetVarData", {example, 2, 0, 2, 1, {5, 1}, {3, 2}, {2, 4}}),
+            "int32 3x2x2 [25 27 29 105 107 109 225 227 229 305 307 309]");
+  EXPECT_EQ(does("hyperGetVarData", {example, 2, 1, 1, 1, {0, 9}, {20, 1}, {1, 1}}).substr(0, 22),
+            "int32 20x1 [380 381 38");
+}
+
+TEST_F(ReadHyperslabsTest, AColumnMajorBlockIsAsTheLibraryHasIt) {
+  AMBRIX_NEED_SAMPLE(path, "nasajava_testCdfColMajor.cdf");
+  EXPECT_EQ(does("hyperGetVarData", {open(path), 0, 0, 1, 1, {0, 0}, {5, 2}, {1, 1}}),
+            "single 5x2 [1 0 0 0 0 0 1 0 0 2]");
+  EXPECT_EQ(does("hyperGetVarData", {open(path), 0, 0, 1, 1, {1, 1}, {2, 1}, {3, 1}}),
+            "single 2x1 [1 2]");
+}
+
+TEST_F(ReadHyperslabsTest, WholeVariablesEqualTheirRecords) {
+  const Given example = open(distributionSample("example1.cdf"));
+  const Array all = result("hyperGetVarData", {example, 2, 0, 3, 1, {0, 0}, {20, 10}, {1, 1}});
+  EXPECT_THAT(all.size(), testing::ElementsAre(20, 10, 3));
+  std::vector<std::int32_t> expected(600);
+  std::iota(expected.begin(), expected.end(), 0);
+  EXPECT_THAT(all.data<std::int32_t>(), testing::ElementsAreArray(expected));
+}
+
+TEST_F(ReadHyperslabsTest, CountsBeyondADimensionAreTooLarge) {
+  const Given file = create();
+  const double variable = createVar(file, {.datatype = 22, .sizes = {3, 2}});
+  EXPECT_EQ(
+      does("hyperGetVarData", {file, variable, 0, 4, 1, {0, 0}, {3, 2}, {1, 1}}).substr(0, 13),
+      "double 3x2x4 ");
+  EXPECT_EQ(does("hyperGetVarData", {file, variable, 0, 4, 1, {0, 0}, {2, 3}, {1, 1}}), kTooLarge);
+  EXPECT_EQ(does("hyperGetVarData", {file, variable, 0, 4, 1, {0, 0}, {4294967296.0, 1}, {1, 1}}),
+            kTooLarge);
+}
+
+TEST_F(ReadHyperslabsTest, EachVectorMustHaveOneNumberForEachDimension) {
+  const Given example = open(distributionSample("example1.cdf"));
+  const std::string error = cdflib("badDimSpec", 2L, "Image");
+  EXPECT_EQ(does("hyperGetVarData", {example, 2, 0, 1, 1, {0}, {1, 1}, {1, 1}}), error);
+  EXPECT_EQ(does("hyperGetVarData", {example, 2, 0, 1, 1, {0, 0}, {1, 1, 1}, {1, 1}}), error);
+  EXPECT_EQ(does("hyperGetVarData", {example, 2, 0, 1, 1, {0, 0}, {1, 1}, {1}}), error);
+  EXPECT_EQ(does("hyperGetVarData", {example, 2, 0, 1, 1, {0, 0}, {99, 1}, {1, 1, 1}}), error);
+  EXPECT_EQ(does("hyperGetVarData", {example, 0, 0, 1, 1, {}, {}, {1}}),
+            cdflib("badDimSpec", 0L, "Time"));
+}
+
+TEST_F(ReadHyperslabsTest, StartsAndIntervalsAreTheLibrarysToJudge) {
+  const Given example = open(distributionSample("example1.cdf"));
+  const auto reads = [&](Given record, Given count, Given stride, Given start, Given counts,
+                         Given strides) {
+    return does("hyperGetVarData", {example, 2, record, count, stride, start, counts, strides});
+  };
+  const Given zeros = {0, 0}, ones = {1, 1};
+  EXPECT_EQ(reads(-1, 1, 1, zeros, ones, ones), failed(kBadRecNum));
+  EXPECT_EQ(reads(0, 0, 1, zeros, ones, ones), failed(kBadRecCount));
+  EXPECT_EQ(reads(0, 1, 0, zeros, ones, ones), failed(kBadRecInterval));
+  EXPECT_EQ(reads(0, 1, 1, {20, 0}, ones, ones), failed(kBadDimIndex));
+  EXPECT_EQ(reads(0, 1, 1, {-1, 0}, ones, ones), failed(kBadDimIndex));
+  EXPECT_EQ(reads(0, 1, 1, zeros, {0, 1}, ones), failed(kBadDimCount));
+  EXPECT_EQ(reads(0, 1, 1, zeros, ones, {0, 1}), failed(kBadDimInterval));
+  EXPECT_EQ(reads(0, 1, 1, {19, 0}, {2, 1}, ones), failed(kBadDimIndex));
+}
+
+TEST_F(ReadHyperslabsTest, NumbersBeyond32BitsAreRefusedInTheWordsOfTheirKind) {
+  const Given example = open(distributionSample("example1.cdf"));
+  const double cut = 4294967296.0;
+  const auto reads = [&](Given record, Given stride, Given start, Given strides) {
+    return does("hyperGetVarData", {example, 2, record, 1, stride, start, {1, 1}, strides});
+  };
+  const Given zeros = {0, 0}, ones = {1, 1};
+  EXPECT_EQ(reads(cut, 1, zeros, ones), failed(kBadRecNum));
+  EXPECT_EQ(reads(0, cut + 1, zeros, ones), failed(kBadRecInterval));
+  EXPECT_EQ(reads(0, 1, {cut, 0}, ones), failed(kBadDimIndex));
+  EXPECT_EQ(reads(0, 1, zeros, {cut + 1, 1}), failed(kBadDimInterval));
+}
+
+TEST_F(ReadHyperslabsTest, NegativeCountsAreTheHostsErrorAfterAllChecks) {
+  const Given example = open(distributionSample("example1.cdf"));
+  const std::string bad = "TOLVEX:host:badDimension";
+  EXPECT_THAT(does("hyperGetVarData", {example, 2, 0, -1, 1, {0, 0}, {1, 1}, {1, 1}}),
+              testing::StartsWith(bad));
+  EXPECT_THAT(does("hyperGetVarData", {example, 2, 0, 1, 1, {0, 0}, {-3, 1}, {1, 1}}),
+              testing::StartsWith(bad));
+  EXPECT_EQ(does("hyperGetVarData", {example, 2, 0, -1, 1, {0, 0}, {21, 1}, {1, 1}}), kTooLarge);
+}
+
+TEST_F(ReadHyperslabsTest, MoreRecordsThanMemoryHoldsAreTheHostsError) {
+  const Given example = open(distributionSample("example1.cdf"));
+  EXPECT_THAT(does("hyperGetVarData", {example, 0, 0, 9e18, 1, {}, {}, {}}),
+              testing::StartsWith("TOLVEX:host:outOfMemory"));
+}
+
+TEST_F(ReadHyperslabsTest, ArgumentsAreReadInOrderUnderTheirLabels) {
+  const Given example = open(distributionSample("example1.cdf"));
+  const Given bad = Array::cell({1, 2});
+  Arguments arguments{example, bad, bad, bad, bad, bad, bad, bad};
+  const char* scalars[] = {"VARNUM", "RECSTART", "RECCOUNT", "RECSTRIDE"};
+  for (std::size_t i = 0; i < 4; ++i) {
+    EXPECT_EQ(does("hyperGetVarData", arguments), notScalar(scalars[i]));
+    arguments[i + 1] = 0;
+  }
+  const char* vectors[] = {"DIMSTART", "DIMCOUNT", "DIMSTRIDe"};
+  for (std::size_t i = 0; i < 3; ++i) {
+    EXPECT_EQ(does("hyperGetVarData", arguments),
+              validate("argumentNotDoublePrecision", vectors[i]));
+    arguments[i + 5] = {0, 0};
+  }
+}
+
+TEST_F(ReadHyperslabsTest, TextsKeepTheirCharactersInTheFirstDimension) {
+  AMBRIX_NEED_SAMPLE(path, "nasajava_test.cdf");
+  const Given others = open(path);
+  const double name = number("getVarNum", {others, "Name"});
+  EXPECT_EQ(does("hyperGetVarData", {others, name, 0, 2, 1, 0, 2, 1}),
+            "char 10x2x2 '123456789 13579     abcd      bcdefghij '");
+  EXPECT_EQ(does("hyperGetVarData", {others, name, 0, 2, 1, 1, 1, 1}),
+            "char 10x1x2 '13579     bcdefghij '");
+}
+
+TEST_F(ReadHyperslabsTest, Epoch16sAreColumnsOfPairs) {
+  AMBRIX_NEED_SAMPLE(path, "nasajava_test.cdf");
+  const Given others = open(path);
+  const double epochs = number("getVarNum", {others, "ep16"});
+  const Array all = result("hyperGetVarData", {others, epochs, 0, 3, 1, {}, {}, {}});
+  EXPECT_THAT(all.size(), testing::ElementsAre(2, 3));
+  const Array first = result("getVarData", {others, epochs, 0});
+  EXPECT_EQ(all.data<double>()[0], first.data<double>()[0]);
+  EXPECT_EQ(all.data<double>()[1], first.data<double>()[1]);
+}
+
+TEST_F(ReadHyperslabsTest, RecordsThatWereNeverWrittenReadAsPadValues) {
+  AMBRIX_NEED_SAMPLE(path, "nasajava_test.cdf");
+  const Given others = open(path);
+  const double sparse = number("getVarNum", {others, "Temp"});
+  EXPECT_EQ(does("hyperGetVarData", {others, sparse, 4, 3, 1, 0, 3, 1}).substr(0, 11),
+            "single 3x3 ");
+  const double scalar = number("getVarNum", {others, "Temperature"});
+  EXPECT_EQ(does("hyperGetVarData", {others, scalar, 0, 8, 1, {}, {}, {}}),
+            "single 8x1 [55.5499992 66.6600037 -1.00000002e+30 -1.00000002e+30 -1.00000002e+30 "
+            "999.98999 -1.00000002e+30 -1.00000002e+30]");
+}
+
+TEST_F(ReadHyperslabsTest, UnsupportedDatatypesAreReportedAfterTheCounts) {
+  AMBRIX_NEED_SAMPLE(path, "nasajava_test.cdf");
+  const Given others = open(path);
+  const double int8 = number("getVarNum", {others, "newI8"});
+  EXPECT_EQ(does("hyperGetVarData", {others, int8, 0, 1, 1, 0, 3, 1}), kTooLarge);
+  EXPECT_EQ(does("hyperGetVarData", {others, int8, 0, 1, 1, 0, 2, 1}), unrecognized(8, "DATATYPE"));
+}
+
+}  // namespace
+}  // namespace ambrix_test
