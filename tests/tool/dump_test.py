@@ -1,0 +1,101 @@
+"""`ambrix dump`."""
+
+import csv
+import io
+import json
+import unittest
+
+from support.ambrix_session import array
+from tool.example_file import DATATYPES, write_example
+from tool.support import ToolCase
+
+
+class DumpTest(ToolCase):
+    def setUp(self):
+        super().setUp()
+        write_example(self.session(), "example", "ROW_MAJOR")
+
+    def dump(self, variable, *options):
+        return self.output("dump", "example.cdf", variable, *options)
+
+    def data(self, variable, *options):
+        return json.loads(self.dump(variable, "--format", "json", *options))["data"]
+
+    def rows(self, variable, *options):
+        return list(csv.reader(io.StringIO(self.dump(variable, "--format", "csv", *options))))
+
+    def test_values_of_every_datatype(self):
+        for datatype, (class_name, values) in DATATYPES.items():
+            expected = list(values)
+            if datatype == "CDF_EPOCH":
+                expected = ["1996-01-01T00:00:00.000", -1e31]
+            self.assertEqual(self.data(datatype), expected, class_name)
+        self.assertEqual(self.data("fine"), ["2004-05-13T15:08:11.022033044055"])
+
+    def test_table(self):
+        self.assertEqual(self.dump("CDF_INT2"),
+                         "Record  CDF_INT2\n     0  -32768\n     1  5\n")
+        lines = self.dump("cube", "--records", "1").splitlines()
+        self.assertEqual(lines[0].split(), ["Record", "i1", "i2", "i3", "cube"])
+        self.assertEqual(lines[1].split(), ["1", "0", "0", "0", "24"])
+        self.assertEqual(lines[2].split(), ["1", "1", "0", "0", "25"])
+        self.assertEqual(lines[3].split(), ["1", "0", "1", "0", "26"])
+        self.assertEqual(len(lines), 25)
+
+    def test_csv(self):
+        rows = self.rows("texts")
+        self.assertEqual(rows[0], ["record", "i1", "i2", "texts"])
+        self.assertEqual(rows[1:], [["0", "0", "0", "caf\u00e9"], ["0", "1", "0", "b"],
+                                    ["0", "0", "1", "c"], ["0", "1", "1", "d"]])
+
+    def test_json_is_nested_with_the_first_index_innermost(self):
+        cube = self.data("cube")
+        self.assertEqual([len(cube), len(cube[0]), len(cube[0][0]), len(cube[0][0][0])],
+                         [3, 4, 3, 2])
+        self.assertEqual(cube[2][3][2], [70, 71])
+        self.assertEqual(self.data("texts"), [[["caf\u00e9", "b    "], ["c    ", "d    "]]])
+
+    def test_variables_are_known_by_number_too(self):
+        self.assertEqual(self.dump("2"), self.dump("CDF_INT2"))
+
+    def test_records(self):
+        for records, expected in (("0:0", [0]), ("1:2", [24, 48]), ("2", [48]), (":1", [0, 24]),
+                                  ("1:", [24, 48]), (":", [0, 24, 48]), ("1:99", [24, 48])):
+            self.assertEqual([record[0][0][0] for record in self.data("cube", "--records", records)],
+                             expected, records)
+        self.assert_fails("ambrix:noSuchRecord", "dump", "example.cdf", "cube", "--records", "3")
+        for records in ("2:1", "x", "1:x", "1:2:3", "1.5"):
+            self.assert_misused("dump", "example.cdf", "cube", "--records", records)
+
+    def test_records_that_are_not_stored(self):
+        self.assertEqual(self.data("sparse PAD"), [[-9] * 3] * 2 + [[2, 1, 2]] + [[-9] * 3] * 2
+                         + [[5, 1, 2]])
+        self.assertEqual(self.data("sparse PREV"), [[-9] * 3] * 2 + [[2, 1, 2]] * 3 + [[5, 1, 2]])
+        self.assertEqual(self.data("empty"), [])
+
+    def test_a_record_too_large_to_be_read_at_once(self):
+        session = self.session()
+        call = session.call
+        (file,) = call("create", "large")
+        sizes = [3, 1000, 400]
+        call("createVar", file, "v", session.constant("CDF_INT4"), 1, sizes, True, [True] * 3)
+        for plane in (0, 250, 399):
+            call("putVarData", file, 0, 1, [2, 999, plane], array("int32", [plane + 1]))
+        call("close", file)
+        rows = [r for r in csv.reader(io.StringIO(
+            self.output("dump", "large.cdf", "v", "--records", "1", "--format", "csv")))]
+        self.assertEqual(len(rows), 3 * 1000 * 400 + 1)
+        self.assertEqual(rows[1 + 2 + 3 * (999 + 1000 * 250)], ["1", "2", "999", "250", "251"])
+        self.assertEqual(rows[-1], ["1", "2", "999", "399", "400"])
+
+    def test_failures(self):
+        self.assertIn("nonsense", self.assert_fails("ambrix:noSuchVariable", "dump", "example.cdf",
+                                                    "nonsense"))
+        self.assert_fails("ambrix:noSuchVariable", "dump", "example.cdf", "99")
+        self.assert_fails("TOLVEX:ambrix:cdflib:fileOpenError", "dump", "missing.cdf", "v")
+        self.assert_misused("dump", "example.cdf")
+        self.assert_misused("dump", "example.cdf", "cube", "--format", "xml")
+
+
+if __name__ == "__main__":
+    unittest.main()

@@ -1,0 +1,114 @@
+"""`ambrix info`."""
+
+import json
+import subprocess
+import unittest
+
+from tool.example_file import DATATYPES, write_example
+from tool.support import TOOL, ToolCase, sample
+
+
+class InfoTest(ToolCase):
+    def setUp(self):
+        super().setUp()
+        write_example(self.session(), "example", "ROW_MAJOR")
+
+    def info(self, *options, file="example.cdf"):
+        return json.loads(self.output("info", "--json", file, *options))
+
+    def test_settings(self):
+        facts = self.info()
+        self.assertEqual(facts["file"], "example.cdf")
+        self.assertEqual(facts["format"], "SINGLE_FILE")
+        self.assertEqual(facts["majority"], "ROW_MAJOR")
+        self.assertEqual(facts["checksum"], "NO_CHECKSUM")
+        self.assertEqual(facts["compression"]["type"], "NO_COMPRESSION")
+        self.assertEqual(facts["records"], 6)
+        self.assertEqual((facts["globalAttributes"], facts["variableAttributes"]), (1, 2))
+        self.assertNotIn("attributes", facts)
+
+    def test_variables(self):
+        variables = {v["name"]: v for v in self.info()["variables"]}
+        self.assertEqual(list(variables)[:13], list(DATATYPES))
+        self.assertEqual([v["number"] for v in variables.values()], list(range(19)))
+        for datatype in DATATYPES:
+            self.assertEqual(variables[datatype]["datatype"], datatype.lower())
+        cube = variables["cube"]
+        self.assertEqual(cube["dimensions"], [2, 3, 4])
+        self.assertEqual(cube["padValue"], [-7])
+        self.assertEqual((cube["records"], cube["recordsStored"]), (3, 3))
+        self.assertEqual(cube["compression"]["type"], "GZIP_COMPRESSION")
+        self.assertEqual(cube["compression"]["parameter"], "7")
+        self.assertEqual(variables["texts"]["elements"], 5)
+        self.assertEqual(variables["texts"]["recordVariance"], False)
+        self.assertEqual(variables["sparse PAD"]["sparseRecords"], "PAD_SPARSERECORDS")
+        sparse = variables["sparse PREV"]
+        self.assertEqual((sparse["records"], sparse["recordsStored"]), (6, 2))
+        self.assertEqual(variables["empty"]["records"], 0)
+
+    def test_attributes(self):
+        unit, empty = self.info("--attributes")["attributes"][1:]
+        self.assertEqual(unit["scope"], "VARIABLE_SCOPE")
+        self.assertEqual([e["number"] for e in unit["entries"]], [0, 13])
+        self.assertEqual(unit["entries"][0]["values"], ["caf\u00e9"])
+        self.assertEqual(empty["entries"], [])
+        entries = {e["datatype"]: e for e in self.info("--attributes")["attributes"][0]["entries"]}
+        self.assertEqual([e["number"] for e in entries.values()], list(range(0, 26, 2)))
+        self.assertEqual(entries["cdf_real8"]["values"], [0.1, 1e300])
+        self.assertEqual(entries["cdf_epoch"]["values"], ["1996-01-01T00:00:00.000", -1e31])
+
+    def test_tables_for_people(self):
+        text = self.output("info", "--attributes", "example.cdf")
+        self.assertIn("Majority    ROW_MAJOR\n", text)
+        (cube,) = [line for line in text.splitlines() if line.split()[:2] == ["13", "cube"]]
+        self.assertEqual(cube.split()[:7], ["13", "cube", "cdf_int4", "1", "2x3x4", "3", "T/TTT"])
+        self.assertIn("6 (2 stored)", text)
+        self.assertIn("caf\u00e9", text)
+        self.assertIn("Global attributes\n", text)
+        self.assertNotIn("\033", text)
+        self.assertNotIn("Attribute ", self.output("info", "example.cdf"))
+
+    def test_columns_are_aligned_whatever_the_characters(self):
+        session = self.session()
+        (file,) = session.call("open", "example.cdf")
+        session.call("putAttrEntry", file, 1, 0, 51, "\u00e6\u00bc\u00a2\u00e5\u00ad\u0097")
+        session.call("close", file)
+        lines = self.output("info", "--attributes", "example.cdf").splitlines()
+        self.assertTrue(any(line.endswith("\u6f22\u5b57") for line in lines))
+
+    def test_unsupported_datatypes_are_listed(self):
+        session = self.session()
+        (file,) = session.call("open", "example.cdf")
+        session.call("createVar", file, "fine time", 33, 1, [2], True, [True])
+        session.call("createVar", file, "long", 8, 1, [], True, [])
+        session.call("close", file)
+        time, long = self.info("--attributes")["variables"][-2:]
+        self.assertEqual((time["name"], time["datatype"], time["supported"], time["records"]),
+                         ("fine time", "cdf_time_tt2000", False, 0))
+        self.assertEqual((long["datatype"], long["supported"]), ("cdf_int8", False))
+        self.assertIn("cdf_time_tt2000 (not supported)", self.output("info", "example.cdf"))
+
+    def test_sample_files(self):
+        facts = self.info(file=sample("example1.cdf"))
+        self.assertEqual([v["name"] for v in facts["variables"]], ["Time", "Latitude", "Image"])
+        self.assertEqual(facts["version"], "3.2.1")
+
+    def test_failures(self):
+        self.assert_fails("TOLVEX:ambrix:cdflib:fileOpenError", "info", "missing.cdf")
+        with open(self.path("junk.cdf"), "wb") as file:
+            file.write(b"junk" * 1000)
+        self.assert_fails("TOLVEX:ambrix:cdflib:fileOpenError", "info", "junk.cdf")
+        self.assert_misused("info")
+        self.assert_misused("info", "example.cdf", "more")
+        self.assert_misused("info", "example.cdf", "--nonsense")
+
+    def test_a_reader_that_goes_away_is_no_failure(self):
+        done = subprocess.run(f"'{TOOL}' info --attributes example.cdf | head -n 1; "
+                              "echo ${PIPESTATUS[0]}", shell=True, executable="/bin/bash",
+                              capture_output=True, cwd=self.folder)
+        self.assertEqual(done.stderr, b"")
+        self.assertTrue(done.stdout.endswith(b"\n0\n"))
+
+
+if __name__ == "__main__":
+    unittest.main()

@@ -1,0 +1,64 @@
+"""What the tests of the tool share."""
+
+import os
+import subprocess
+import tempfile
+import unittest
+
+from support.ambrix_session import Session
+
+TOOL = os.environ["AMBRIX_TOOL"]
+SAMPLES = os.environ.get("AMBRIX_CDF_SAMPLES", "")
+
+
+def sample(name):
+    """A sample file of the CDF distribution; the test is skipped where there is none."""
+    path = os.path.join(SAMPLES, name)
+    if not SAMPLES or not os.path.exists(path):
+        raise unittest.SkipTest(f"no sample file {name} of the CDF distribution")
+    return path
+
+
+class ToolCase(unittest.TestCase):
+    """Runs the tool in a folder of its own."""
+
+    def setUp(self):
+        folder = tempfile.TemporaryDirectory()
+        self.addCleanup(folder.cleanup)
+        self.folder = folder.name
+
+    def path(self, name):
+        return os.path.join(self.folder, name)
+
+    def run_tool(self, *arguments, status=0, **options):
+        done = subprocess.run([TOOL, *arguments], capture_output=True, cwd=self.folder, **options)
+        self.assertEqual(done.returncode, status, done.stderr)
+        return done
+
+    def output(self, *arguments):
+        done = self.run_tool(*arguments)
+        self.assertEqual(done.stderr, b"")
+        return done.stdout.decode()
+
+    def assert_fails(self, identifier, *arguments, status=1):
+        """The tool fails with one line on standard error; returns its message."""
+        done = self.run_tool(*arguments, status=status)
+        self.assertEqual(done.stdout, b"")
+        text = done.stderr.decode()
+        prefix = f"ambrix: {identifier}: "
+        self.assertTrue(text.startswith(prefix), text)
+        self.assertTrue(text.endswith("\n"))
+        self.assertEqual(text.count("\n"), 1)
+        return text[len(prefix):-1]
+
+    def assert_misused(self, *arguments):
+        done = self.run_tool(*arguments, status=2)
+        self.assertEqual(done.stdout, b"")
+        self.assertIn("--help", done.stderr.decode())
+        self.assertNotIn("terminate", done.stderr.decode())
+        return done.stderr.decode()
+
+    def session(self):
+        session = Session(cwd=self.folder)
+        self.addCleanup(session.close)
+        return session
