@@ -38,7 +38,8 @@ macro(cdf_provision_library)
     IMPORTED_LOCATION "${CMAKE_BINARY_DIR}/lib/libcdf.so"
     IMPORTED_NO_SONAME ON)  # else its path at build time would be recorded
   set(cdf_link cdf_shared)
-  install(PROGRAMS "${cdf_place}/lib/libcdf.so" DESTINATION "${CMAKE_INSTALL_LIBDIR}")
+  # Beside the module, where no other program takes it for the system's own.
+  install(PROGRAMS "${cdf_place}/lib/libcdf.so" DESTINATION "${CMAKE_INSTALL_LIBDIR}/ambrix")
 endmacro()
 
 macro(cdf_provision_source)

@@ -13,7 +13,7 @@ add_library(ambrix_module MODULE)
 set_target_properties(ambrix_module PROPERTIES
   PREFIX ""
   LINKER_LANGUAGE CXX
-  INSTALL_RPATH "$ORIGIN/.."
+  INSTALL_RPATH "$ORIGIN;$ORIGIN/.."  # the CDF library of an installation, and of the build
   LIBRARY_OUTPUT_DIRECTORY "${CMAKE_LIBRARY_OUTPUT_DIRECTORY}/ambrix"
   LINK_DEPENDS "${PROJECT_SOURCE_DIR}/cmake/module.map")
 target_link_libraries(ambrix_module PRIVATE ambrix_module_objects CDF::cdf)

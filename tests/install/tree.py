@@ -1,0 +1,84 @@
+"""A tree of installed files, and what must be true of it wherever it lies."""
+
+import os
+import subprocess
+from pathlib import Path
+
+BUILD = Path(os.environ["AMBRIX_BUILD"])
+SOURCE = Path(os.environ["AMBRIX_SOURCE"])
+CMAKE = os.environ["AMBRIX_CMAKE"]
+CPACK = os.environ["AMBRIX_CPACK"]
+VERSION = os.environ["AMBRIX_VERSION"]
+SAMPLES = Path(os.environ["AMBRIX_CDF_SAMPLES"])
+
+FILES = """
+    bin/ambrix
+    include/ambrix/embedded.h include/ambrix/module.h include/ambrix/host/message_id.h
+    lib/libambrix_embedded.so lib/ambrix/ambrix_module.so
+    lib/cmake/ambrix/ambrixConfig.cmake lib/cmake/ambrix/ambrixConfigVersion.cmake
+    share/man/man1/ambrix.1 share/bash-completion/completions/ambrix
+    share/doc/ambrix/LICENSE share/doc/ambrix/CHANGELOG.md
+    share/doc/ambrix/docs/embedding.md share/doc/ambrix/docs/commands.md
+    share/doc/ambrix/examples/CMakeLists.txt share/doc/ambrix/examples/list_variables.cc
+    """.split()
+
+# What other readers of CDF files see in the sample.
+LISTED = """\
+Time: cdf_int4, 24 records: 0
+Longitude: cdf_real4, 1 record of 2: -165 -150
+Latitude: cdf_real4, 1 record of 2: 40 30
+Temperature: cdf_real4, 24 records of 2x2: 20 21.7 19.2 20.7
+"""
+
+
+def run(*command, env=None):
+    """The standard output of a program, which must succeed."""
+    done = subprocess.run([str(word) for word in command], stdout=subprocess.PIPE,
+                          stderr=subprocess.STDOUT, text=True, env=env)
+    if done.returncode != 0:
+        raise AssertionError(f"{command[0]} failed:\n{done.stdout}")
+    return done.stdout
+
+
+def configure_example(tree, folder):
+    """Lets CMake find ambrix in the tree for the example that lies in it."""
+    return run(CMAKE, "-S", tree / "share/doc/ambrix/examples", "-B", folder,
+               "-G", os.environ["AMBRIX_GENERATOR"],
+               f"-DCMAKE_CXX_COMPILER={os.environ['AMBRIX_CXX']}",
+               "-DCMAKE_CXX_FLAGS=-Wall -Wextra -Wpedantic -Werror",
+               f"-DCMAKE_PREFIX_PATH={tree}", "-DCMAKE_FIND_USE_PACKAGE_REGISTRY=OFF")
+
+
+class TreeChecks:
+    """For test cases: checks of a tree, with nothing in the environment to help it."""
+
+    def check_files(self, tree):
+        self.assertEqual([name for name in FILES if not (tree / name).is_file()], [])
+        readme = "README.md"
+        self.assertEqual((tree / "share/doc/ambrix" / readme).exists(), (SOURCE / readme).exists())
+        bundled = (BUILD / "lib/libcdf.so").exists()
+        self.assertEqual((tree / "lib/ambrix/libcdf.so").exists(), bundled)
+        if bundled:
+            self.assertTrue((tree / "share/doc/ambrix/CDF_copyright.txt").is_file())
+
+    def check_libraries(self, tree):
+        """None is missing, or found in the folders of the build."""
+        for program in ("bin/ambrix", "lib/ambrix/ambrix_module.so"):
+            found = run("ldd", tree / program, env={"PATH": os.defpath})
+            self.assertNotIn("not found", found)
+            self.assertNotIn(str(BUILD), found)
+
+    def check_tool(self, tree):
+        tool = tree / "bin/ambrix"
+        self.assertIn(f"ambrix {VERSION}\n", run(tool, "--version", env={}))
+        told = run(tool, "info", SAMPLES / "example2.cdf", env={})
+        self.assertRegex(told, r"\bTemperature +cdf_real4 +1 +2x2 +24\b")
+
+    def check_example(self, tree, folder):
+        """It is built with nothing but the tree, and tells what is in a file."""
+        configure_example(tree, folder)
+        run(CMAKE, "--build", folder)
+        program = folder / "list_variables"
+        self.assertEqual(run(program, SAMPLES / "example2.cdf", env={}), LISTED)
+        self.assertIn('\ncartesian: cdf_char, 1 record of 2: "x"\n',
+                      run(program, SAMPLES / "geocpi1.cdf", env={}))
