@@ -44,6 +44,7 @@ class ArgumentList {
 
  private:
   bool readItems(long operation) {
+    operation_ = operation;
     bool first = true;
     for (next_ = number(); next_ < NULL_; next_ = number(), first = false) {
       const Item* item = ambrix_test::findItem(operation, next_);
@@ -79,6 +80,7 @@ class ArgumentList {
       case 's':
         return show('\'' + std::string(pointer<const char>()) + '\'');
       case 'v':
+        if (createdDimensions_ < 0 && operation_ == CREATE_) createdDimensions_ = lastNumber_;
         return showVector(pointer<const long>());
       case 'p':
         return show('[' + std::to_string(*pointer<const long>()) + ']');
@@ -125,8 +127,9 @@ class ArgumentList {
   }
 
   void showVector(const long* entries) {
-    const auto dimensions = static_cast<std::size_t>(fake_.number("zVAR_NUMDIMS_"));
-    std::size_t shown = std::min(dimensions, kMaxDims);
+    const long dimensions =
+        createdDimensions_ < 0 ? fake_.number("zVAR_NUMDIMS_") : createdDimensions_;
+    std::size_t shown = std::min(static_cast<std::size_t>(dimensions), kMaxDims);
     for (std::size_t i = 0; i < kMaxDims; ++i) {
       if (entries[i] != 0) shown = std::max(shown, i + 1);
     }
@@ -154,6 +157,8 @@ class ArgumentList {
   std::string text_;
   long next_ = 0;
   long lastNumber_ = 0;  // the status, when its text is asked for
+  long operation_ = 0;
+  long createdDimensions_ = -1;  // of the variable that the list creates
   std::size_t given_ = 0;
 };
 
