@@ -26,7 +26,7 @@ def first_difference(one, other):
 
 
 def _pads_differ(one, other, code):
-    if other is None:  # the file declares none
+    if one is None or other is None:  # the file declares none
         return False
     if code not in CHARACTERS:
         return not same_numbers(one, other)

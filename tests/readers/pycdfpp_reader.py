@@ -7,7 +7,7 @@ from readers.content import CHARACTERS, EPOCH16, Attribute, Content, Variable, a
 
 NAME = "pycdfpp"
 SPARSE = {"no_sparse_records": "no", "pad_sparse_records": "pad",
-          "previous_sparse_records": "previous"}
+          "prev_sparse_records": "previous"}
 
 
 def bytes_as_text(name):
