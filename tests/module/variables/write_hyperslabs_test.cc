@@ -1,0 +1,167 @@
+// "hyperPutVarData": strided blocks of records and dimensions.
+#include "tests/module/support/file_bytes.h"
+#include "tests/module/support/module_test.h"
+
+namespace ambrix_test {
+namespace {
+
+/// Begins with a row-major file.
+class WriteHyperslabsTest : public ModuleTest {
+ protected:
+  Given file = create();
+};
+
+std::string failed(const char* text) {
+  return refused("CDFhyperPutzVarData", text);
+}
+
+std::string wrongNumber(const char* counts, long records, long expected) {
+  return cdflib("wrongNumberOfHyperPutVarDataElements", counts, records, "v", expected);
+}
+
+TEST_F(WriteHyperslabsTest, ScalarRecordsAreWrittenInOneGo) {
+  const double variable = createVar(file, {.datatype = 22});
+  EXPECT_EQ(does("hyperPutVarData", {file, variable, 0, 3, 1, {}, {}, {}, {1, 2, 3}}), "done");
+  EXPECT_EQ(does("hyperPutVarData", {file, variable, 1, 2, 3, {}, {}, {}, {8, 9}}), "done");
+  EXPECT_EQ(does("hyperGetVarData", {file, variable, 0, 5, 1, {}, {}, {}}).substr(0, 18),
+            "double 5x1 [1 8 3 ");
+  EXPECT_EQ(does("getVarData", {file, variable, 4}), "double 1x1 [9]");
+}
+
+TEST_F(WriteHyperslabsTest, ABlockIsGivenInTheHostsOrderInBothMajorities) {
+  for (const Given& target : {file, createColumnMajor("columns")}) {
+    const double variable = createVar(target, {.sizes = {2, 3}});
+    results("putVarRecordData", {target, variable, 0, row<std::int32_t>({0, 0, 0, 0, 0, 0})});
+    EXPECT_EQ(does("hyperPutVarData",
+                   {target, variable, 0, 1, 1, {1, 0}, {1, 2}, {1, 2}, row<std::int32_t>({7, 8})}),
+              "done");
+    EXPECT_EQ(does("getVarRecordData", {target, variable, 0}), "int32 2x3 [0 7 0 0 0 8]");
+    results("close", {target});
+  }
+  const std::string expected = bytesOf<std::int32_t>({0, 7, 0, 0, 0, 8});
+  EXPECT_THAT(fileBytes("new.cdf"), testing::HasSubstr(expected));
+  EXPECT_THAT(fileBytes("columns.cdf"), testing::HasSubstr(expected));
+}
+
+TEST_F(WriteHyperslabsTest, TheWrongNumberIsReportedWithTheCountsInTheLibrarysOrder) {
+  const Given columns = createColumnMajor("columns");
+  for (const auto& [target, counts] :
+       {std::pair<Given, const char*>{columns, "[ 2 3 ]"}, {file, "[ 3 2 ]"}}) {
+    const double variable = createVar(target, {.datatype = 22, .sizes = {2, 3}});
+    EXPECT_EQ(does("hyperPutVarData", {target,
+                                       variable,
+                                       0,
+                                       2,
+                                       1,
+                                       {0, 0},
+                                       {2, 3},
+                                       {1, 1},
+                                       Array::zeros(ClassId::kDouble, {10, 1})}),
+              wrongNumber(counts, 2, 12));
+  }
+}
+
+TEST_F(WriteHyperslabsTest, TheExpectedNumberCountsTextsAndPairs) {
+  createVar(file, {.datatype = 22});
+  EXPECT_EQ(does("hyperPutVarData", {file, 0, 0, 3, 1, {}, {}, {}, {1}}), wrongNumber("[ ]", 3, 3));
+  results("deleteVar", {file, 0});
+  createVar(file, {.datatype = 51, .sizes = {2}, .elements = 5});
+  EXPECT_EQ(does("hyperPutVarData", {file, 0, 0, 3, 1, 0, 2, 1, "x"}), wrongNumber("[ 2 ]", 3, 30));
+  results("deleteVar", {file, 0});
+  createVar(file, {.datatype = 32, .sizes = {2}});
+  EXPECT_EQ(does("hyperPutVarData", {file, 0, 0, 3, 1, 0, 2, 1, {1}}), wrongNumber("[ 2 ]", 3, 12));
+}
+
+TEST_F(WriteHyperslabsTest, NegativeCountsAreReportedAsTheyAre) {
+  createVar(file, {.datatype = 22, .sizes = {2}});
+  EXPECT_EQ(does("hyperPutVarData", {file, 0, 0, -1, 1, 0, 2, 1, {1, 2}}),
+            wrongNumber("[ 2 ]", -1, -2));
+  EXPECT_EQ(does("hyperPutVarData", {file, 0, 0, 1, 1, 0, -2, 1, {1, 2}}),
+            wrongNumber("[ -2 ]", 1, -2));
+}
+
+TEST_F(WriteHyperslabsTest, TheNumberComesBeforeTheDatatypeAndThatBeforeTheClass) {
+  createVar(file, {.datatype = 22});
+  EXPECT_EQ(does("hyperPutVarData", {file, 0, 0, 2, 1, {}, {}, {}, row<float>({1})}),
+            wrongNumber("[ ]", 2, 2));
+  EXPECT_EQ(does("hyperPutVarData", {file, 0, 0, 1, 1, {}, {}, {}, row<float>({1})}),
+            cdflib("datatypeMismatch", "single", "CDF_REAL8"));
+  results("createVar", {file, "i8", 8, 1, {}, -1, {}});
+  EXPECT_EQ(does("hyperPutVarData", {file, 1, 0, 1, 1, {}, {}, {}, row<float>({1})}),
+            unrecognized(8, "DATATYPE"));
+}
+
+// Only the library compares the vectors with the dimensions.
+TEST_F(WriteHyperslabsTest, VectorsShorterThanTheDimensionsAreFilledWithZeros) {
+  createVar(file, {.datatype = 22, .sizes = {2, 2}});
+  const Given zeros = {0, 0}, ones = {1, 1};
+  EXPECT_EQ(does("hyperPutVarData", {file, 0, 0, 1, 1, zeros, 1, ones, 5}), failed(kBadDimCount));
+  EXPECT_EQ(does("hyperPutVarData", {file, 0, 0, 1, 1, zeros, ones, 1, 5}),
+            failed(kBadDimInterval));
+  EXPECT_EQ(does("hyperPutVarData", {file, 0, 0, 1, 1, zeros, {}, {}, 5}), failed(kBadDimCount));
+  EXPECT_EQ(does("hyperPutVarData", {file, 0, 0, 1, 1, {}, ones, ones, 5}), "done");
+  EXPECT_EQ(does("getVarData", {file, 0, 0, {0, 0}}), "double 1x1 [5]");
+}
+
+TEST_F(WriteHyperslabsTest, CountsBeyondTheDimensionsNeverLetTheLibraryReadBeyondTheData) {
+  createVar(file, {.datatype = 22});
+  EXPECT_EQ(does("hyperPutVarData", {file, 0, 0, 1, 1, {}, 0, {}, {}}), failed(kBadDimCount));
+  EXPECT_EQ(does("hyperPutVarData", {file, 0, 0, 1, 1, {0}, {1}, {1}, 6}), "done");
+  EXPECT_EQ(does("getVarData", {file, 0, 0}), "double 1x1 [6]");
+  EXPECT_EQ(does("hyperPutVarData", {file, 0, 0, 1, 1, {}, {2}, {}, {1, 2}}), "done");
+}
+
+TEST_F(WriteHyperslabsTest, MoreThanTenNumbersAreNoHarm) {
+  createVar(file, {.datatype = 22, .sizes = {1}});
+  const Given many = Array::of<double>(std::vector<double>(12, 1.0), {1, 12});
+  const Given zeros = Array::zeros(ClassId::kDouble, {1, 12});
+  EXPECT_EQ(does("hyperPutVarData", {file, 0, 0, 1, 1, zeros, many, many, 3}), "done");
+  EXPECT_EQ(does("getVarData", {file, 0, 0, 0}), "double 1x1 [3]");
+}
+
+TEST_F(WriteHyperslabsTest, NumbersOutOfRangeAreTheLibrarysFailure) {
+  createVar(file, {.datatype = 22, .sizes = {2}});
+  const double cut = 4294967296.0;
+  const auto writes = [&](Given record, Given stride, Given start, Given count, Given interval) {
+    const std::size_t values = static_cast<std::size_t>(count.view().data<double>()[0]);
+    return does("hyperPutVarData", {file, 0, record, 1, stride, start, count, interval,
+                                    Array::zeros(ClassId::kDouble, {1, values})});
+  };
+  EXPECT_EQ(writes(-1, 1, 0, 1, 1), failed(kBadRecNum));
+  EXPECT_EQ(writes(cut, 1, 0, 1, 1), failed(kBadRecNum));
+  EXPECT_EQ(writes(0, 0, 0, 1, 1), failed(kBadRecInterval));
+  EXPECT_EQ(writes(0, cut + 1, 0, 1, 1), failed(kBadRecInterval));
+  EXPECT_EQ(writes(0, 1, 2, 1, 1), failed(kBadDimIndex));
+  EXPECT_EQ(writes(0, 1, cut, 1, 1), failed(kBadDimIndex));
+  EXPECT_EQ(writes(0, 1, 0, 3, 1), failed(kBadDimIndex));
+  EXPECT_EQ(writes(0, 1, 0, 0, 1), failed(kBadDimCount));
+  EXPECT_EQ(writes(0, 1, 0, 1, 0), failed(kBadDimInterval));
+  EXPECT_EQ(writes(0, 1, 0, 1, cut + 1), failed(kBadDimInterval));
+  EXPECT_EQ(does("hyperPutVarData", {file, 9, 0, 1, 1, 0, 1, 1, 1}),
+            refused("CDFinquirezVar", kNoSuchVar));
+}
+
+TEST_F(WriteHyperslabsTest, AlongADimensionThatDoesNotVaryTheLastValueStays) {
+  createVar(file, {.datatype = 22, .sizes = {3}, .variances = {0}});
+  EXPECT_EQ(does("hyperPutVarData", {file, 0, 0, 1, 1, 0, 3, 1, {1, 2, 3}}), "done");
+  EXPECT_EQ(does("hyperGetVarData", {file, 0, 0, 1, 1, 0, 3, 1}), "double 3x1 [3 3 3]");
+}
+
+TEST_F(WriteHyperslabsTest, ArgumentsAreReadInOrderUnderTheirLabels) {
+  const Given bad = Array::cell({1, 2});
+  Arguments arguments{file, bad, bad, bad, bad, bad, bad, bad, bad};
+  const char* scalars[] = {"VARNUM", "RECSTART", "RECCOUNT", "RECSTRIDE"};
+  for (std::size_t i = 0; i < 4; ++i) {
+    EXPECT_EQ(does("hyperPutVarData", arguments), notScalar(scalars[i]));
+    arguments[i + 1] = 0;
+  }
+  const char* vectors[] = {"DIMSTART", "DIMCOUNT", "DIMSTRIDE"};
+  for (std::size_t i = 0; i < 3; ++i) {
+    EXPECT_EQ(does("hyperPutVarData", arguments),
+              validate("argumentNotDoublePrecision", vectors[i]));
+    arguments[i + 5] = {0, 0};
+  }
+}
+
+}  // namespace
+}  // namespace ambrix_test
