@@ -1,7 +1,5 @@
 #include "tool/call.h"
 
-#include <optional>
-
 #include "tool/cdf_file.h"
 #include "tool/failure.h"
 #include "tool/json_value.h"
@@ -9,23 +7,13 @@
 namespace ambrix::tool {
 namespace {
 
-std::optional<JsonView> parseWord(std::string_view word) {
-  try {
-    bool numbersInRange = true;
-    return JsonView::check(word, numbersInRange);
-  } catch (const JsonError&) {
-    return std::nullopt;
-  }
-}
-
 /// JSON that stands for an array, and else the text itself; an object is never meant as a text.
 Array readWord(const std::string& word) {
-  const auto json = parseWord(word);
-  if (!json) return Array::fromUtf8(word);
   try {
-    return readValue(*json);
+    bool numbersInRange = true;
+    return readValue(parseJson(word, numbersInRange));
   } catch (const JsonError& error) {
-    if (json->kind() == JsonKind::kObject) throw UsageError(word + ": " + error.what());
+    if (word.starts_with('{')) throw UsageError(word + ": " + error.what());
     return Array::fromUtf8(word);
   }
 }

@@ -1,7 +1,9 @@
 #include <algorithm>
 #include <array>
+#include <cmath>
 #include <concepts>
 #include <limits>
+#include <string>
 #include <utility>
 #include <vector>
 
@@ -15,34 +17,29 @@ constexpr std::array kClasses = {
     ClassId::kInt8,   ClassId::kUint8,   ClassId::kInt16, ClassId::kUint16, ClassId::kInt32,
     ClassId::kUint32, ClassId::kInt64,   ClassId::kUint64};
 
-ClassId classNamed(std::u16string_view name) {
+ClassId classNamed(const Json& name) {
   for (const ClassId classId : kClasses) {
-    if (std::ranges::equal(std::string_view(className(classId)), name)) return classId;
+    if (name == className(classId)) return classId;
   }
   throw JsonError("an unknown class");
 }
 
-JsonView requireMember(JsonView object, std::u16string_view key) {
-  const auto member = findMember(object, key);
-  if (!member) throw JsonError("an array needs \"class\", \"size\" and \"data\"");
+const Json& requireMember(const Json& object, const char* key) {
+  const auto member = object.find(key);
+  if (member == object.end()) throw JsonError("an array needs \"class\", \"size\" and \"data\"");
   return *member;
 }
 
-std::vector<std::size_t> readSizes(JsonView list) {
-  std::vector<std::size_t> sizes;
-  JsonItems items(list);
-  while (const auto item = items.next())
-    sizes.push_back(item->toUint64());
-  if (sizes.size() < 2) throw JsonError("an array has at least two sizes");
-  return sizes;
+const Json& requireList(const Json& value) {
+  if (!value.is_array()) throw JsonError("not a list");
+  return value;
 }
 
-std::size_t countItems(JsonView list) {
-  std::size_t count = 0;
-  JsonItems items(list);
-  while (items.next())
-    ++count;
-  return count;
+std::vector<std::size_t> readSizes(const Json& list) {
+  std::vector<std::size_t> sizes(requireList(list).size());
+  std::ranges::transform(list, sizes.begin(), readCount);
+  if (sizes.size() < 2) throw JsonError("an array has at least two sizes");
+  return sizes;
 }
 
 bool sizesHold(std::span<const std::size_t> sizes, std::size_t count) {
@@ -60,68 +57,63 @@ void requireCount(std::span<const std::size_t> sizes, std::size_t count) {
 }
 
 template <std::floating_point T>
-T readNonFinite(std::u16string_view text) {
-  if (text == u"NaN") return std::numeric_limits<T>::quiet_NaN();
-  if (text == u"Inf") return std::numeric_limits<T>::infinity();
-  if (text == u"-Inf") return -std::numeric_limits<T>::infinity();
+T readNonFinite(const std::string& text) {
+  if (text == "NaN") return std::numeric_limits<T>::quiet_NaN();
+  if (text == "Inf") return std::numeric_limits<T>::infinity();
+  if (text == "-Inf") return -std::numeric_limits<T>::infinity();
   throw JsonError("a text that is no number");
 }
 
-void readElement(JsonView item, double& value) {
-  const bool text = item.kind() == JsonKind::kString;
-  value = text ? readNonFinite<double>(item.string()) : item.toDouble();
+template <std::floating_point T>
+void readElement(const Json& item, T& value) {
+  if (item.is_string()) {
+    value = readNonFinite<T>(item.get_ref<const std::string&>());
+    return;
+  }
+  if (!item.is_number()) throw JsonError("not a number");
+  value = item.get<T>();
+  if (!std::isfinite(value)) throw JsonError("a number beyond the range of its class");
 }
 
-void readElement(JsonView item, float& value) {
-  const bool text = item.kind() == JsonKind::kString;
-  value = text ? readNonFinite<float>(item.string()) : item.toSingle();
-}
-
-void readElement(JsonView item, bool& value) {
-  value = item.kind() == JsonKind::kTrue;
-  if (!value && item.kind() != JsonKind::kFalse) throw JsonError("not a logical value");
+void readElement(const Json& item, bool& value) {
+  if (!item.is_boolean()) throw JsonError("not a logical value");
+  value = item.get<bool>();
 }
 
 template <std::integral T>
-void readElement(JsonView item, T& value) {
-  using Wide = std::conditional_t<std::is_signed_v<T>, std::int64_t, std::uint64_t>;
-  Wide wide = 0;
-  if constexpr (std::is_signed_v<T>) {
-    wide = item.toInt64();
-  } else {
-    wide = item.toUint64();
-  }
-  if (!std::in_range<T>(wide)) throw JsonError("an integer beyond the range of its class");
-  value = static_cast<T>(wide);
+void readElement(const Json& item, T& value) {
+  if (!item.is_number_integer()) throw JsonError("not an integer");
+  const bool fits = item.is_number_unsigned() ? std::in_range<T>(item.get<std::uint64_t>())
+                                              : std::in_range<T>(item.get<std::int64_t>());
+  if (!fits) throw JsonError("an integer beyond the range of its class");
+  value = item.get<T>();
 }
 
 template <ArrayElement T>
-Array readElements(std::span<const std::size_t> sizes, JsonView data) {
-  requireCount(sizes, countItems(data));
+Array readElements(std::span<const std::size_t> sizes, const Json& data) {
+  requireCount(sizes, requireList(data).size());
   Array array = Array::uninitialized(classIdOf<T>(), sizes);
-  JsonItems items(data);
+  auto item = data.begin();
   for (T& value : array.mutableData<T>())
-    readElement(items.next().value(), value);
+    readElement(*item++, value);
   return array;
 }
 
-Array readChars(std::span<const std::size_t> sizes, JsonView data) {
-  const std::u16string units = data.string();
+Array readChars(std::span<const std::size_t> sizes, const Json& data) {
+  const std::u16string units = unitsOf(data);
   requireCount(sizes, units.size());
   return Array::of(std::span<const char16_t>(units), sizes);
 }
 
-Array readCells(std::span<const std::size_t> sizes, JsonView data) {
-  const std::size_t count = countItems(data);
-  requireCount(sizes, count);
+Array readCells(std::span<const std::size_t> sizes, const Json& data) {
+  requireCount(sizes, requireList(data).size());
   Array array = Array::cell(sizes);
-  JsonItems items(data);
-  for (std::size_t index = 0; index < count; ++index)
-    array.setElement(index, readValue(items.next().value()));
+  for (std::size_t index = 0; index < data.size(); ++index)
+    array.setElement(index, readValue(data[index]));
   return array;
 }
 
-Array readData(ClassId classId, std::span<const std::size_t> sizes, JsonView data) {
+Array readData(ClassId classId, std::span<const std::size_t> sizes, const Json& data) {
   switch (classId) {
     case ClassId::kCell:
       return readCells(sizes, data);
@@ -153,40 +145,39 @@ Array readData(ClassId classId, std::span<const std::size_t> sizes, JsonView dat
 }
 
 /// The short forms of numbers and logicals in a row.
-Array readList(JsonView list) {
-  const std::size_t count = countItems(list);
-  if (count == 0) return Array::zeros(ClassId::kDouble, {0, 0});
-  const JsonKind kind = JsonItems(list).next()->kind();
-  const bool logical = kind == JsonKind::kTrue || kind == JsonKind::kFalse;
-  JsonItems items(list);
-  while (const auto item = items.next()) {
-    if (!logical && item->kind() != JsonKind::kNumber) throw JsonError("not a list of numbers");
+Array readList(const Json& list) {
+  if (list.empty()) return Array::zeros(ClassId::kDouble, {0, 0});
+  const std::array<std::size_t, 2> row = {1, list.size()};
+  if (list.front().is_boolean()) return readElements<bool>(row, list);
+  if (!std::ranges::all_of(list, [](const Json& item) { return item.is_number(); })) {
+    throw JsonError("not a list of numbers or of logicals");
   }
-  const std::array<std::size_t, 2> row = {1, count};
-  return logical ? readElements<bool>(row, list) : readElements<double>(row, list);
+  return readElements<double>(row, list);
+}
+
+Array readNumber(const Json& number) {
+  double value = 0;
+  readElement(number, value);
+  return Array::scalar(value);
 }
 
 }  // namespace
 
-Array readValue(JsonView value) {
-  switch (value.kind()) {
-    case JsonKind::kNull:
-      return Array::zeros(ClassId::kDouble, {0, 0});
-    case JsonKind::kTrue:
-    case JsonKind::kFalse:
-      return Array::scalar(value.kind() == JsonKind::kTrue);
-    case JsonKind::kNumber:
-      return Array::scalar(value.toDouble());
-    case JsonKind::kString:
-      return Array::text(value.string());
-    case JsonKind::kList:
-      return readList(value);
-    default:
-      break;
-  }
-  const ClassId classId = classNamed(requireMember(value, u"class").string());
-  const std::vector<std::size_t> sizes = readSizes(requireMember(value, u"size"));
-  return readData(classId, sizes, requireMember(value, u"data"));
+std::size_t readCount(const Json& value) {
+  std::size_t count = 0;
+  readElement(value, count);
+  return count;
+}
+
+Array readValue(const Json& value) {
+  if (value.is_null()) return Array::zeros(ClassId::kDouble, {0, 0});
+  if (value.is_boolean()) return Array::scalar(value.get<bool>());
+  if (value.is_number()) return readNumber(value);
+  if (value.is_string()) return Array::text(unitsOf(value));
+  if (value.is_array()) return readList(value);
+  const ClassId classId = classNamed(requireMember(value, "class"));
+  const std::vector<std::size_t> sizes = readSizes(requireMember(value, "size"));
+  return readData(classId, sizes, requireMember(value, "data"));
 }
 
 }  // namespace ambrix::tool

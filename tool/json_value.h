@@ -11,7 +11,10 @@ namespace ambrix::tool {
 
 /// The array that a value stands for, in the full form {"class", "size", "data"} or a short one.
 /// Throws `JsonError` when it stands for none, and `Error` when the array cannot be had.
-Array readValue(JsonView value);
+Array readValue(const Json& value);
+
+/// A non-negative integer. Throws `JsonError` for any other value.
+std::size_t readCount(const Json& value);
 
 /// Appends the full form of an array.
 void appendValue(std::string& json, ArrayView array);
@@ -22,7 +25,5 @@ void appendString(std::string& json, std::u16string_view units);
 void appendBytes(std::string& json, std::string_view bytes);
 /// The same for a text for people: UTF-8 where it is valid, and else byte by byte.
 void appendMessage(std::string& json, std::string_view text);
-/// Appends a checked JSON text with all that is not ASCII escaped.
-void appendAscii(std::string& json, std::string_view source);
 
 }  // namespace ambrix::tool

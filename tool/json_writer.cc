@@ -152,15 +152,4 @@ void appendMessage(std::string& json, std::string_view text) {
   appendString(json, units ? *units : decodeLeniently(text));
 }
 
-void appendAscii(std::string& json, std::string_view source) {
-  const std::u16string units = catalogue::toUtf16(source).value();
-  for (const char16_t unit : units) {
-    if (unit > 0x7E) {
-      appendEscaped(json, unit);
-    } else {
-      json += static_cast<char>(unit);
-    }
-  }
-}
-
 }  // namespace ambrix::tool

@@ -18,23 +18,16 @@ struct Request {
   std::size_t outputs = kAllOutputs;
 };
 
-std::size_t readOutputs(JsonView value) {
-  if (!value.isCount()) throw JsonError("\"outputs\" is no count");
-  constexpr std::size_t kMoreThanAny = 4;  // digits: no command has that many results
-  return value.source().size() > kMoreThanAny ? kAllOutputs : value.toUint64();
-}
-
-Request readRequest(JsonView object) {
+Request readRequest(const Json& object) {
+  if (!object.is_object()) throw JsonError("a request is an object");
   Request request;
-  const auto command = findMember(object, u"command");
-  if (!command) throw JsonError("a request needs a \"command\"");
-  request.command = readValue(*command);
-  if (const auto outputs = findMember(object, u"outputs")) request.outputs = readOutputs(*outputs);
-  const auto arguments = findMember(object, u"arguments");
-  if (!arguments) return request;
-  JsonItems items(*arguments);
-  while (const auto item = items.next())
-    request.arguments.push_back(readValue(*item));
+  if (!object.contains("command")) throw JsonError("a request needs a \"command\"");
+  request.command = readValue(object["command"]);
+  if (object.contains("outputs")) request.outputs = readCount(object["outputs"]);
+  const Json arguments = object.value("arguments", Json::array());
+  if (!arguments.is_array()) throw JsonError("\"arguments\" is no list");
+  for (const Json& argument : arguments)
+    request.arguments.push_back(readValue(argument));
   return request;
 }
 
@@ -47,16 +40,12 @@ std::string describeOutputs(const std::vector<Array>& outputs) {
   return json += ']';
 }
 
-/// The parsed line; also its tag, as far as there is one, when it is no good request.
-JsonView parseLine(std::string_view line, std::string& tag) {
+/// The parsed line; also its tag, if it has one, even when it turns out to be no good request.
+Json parseLine(std::string_view line, std::string& tag) {
   bool numbersInRange = true;
-  const JsonView object = JsonView::check(line, numbersInRange);
-  JsonMembers members(object);
-  while (const auto member = members.next()) {
-    if (member->key == u"tag") tag = member->value.source();
-  }
+  Json object = parseJson(line, numbersInRange);
+  if (object.is_object() && object.contains("tag")) tag = toAscii(object["tag"]);
   if (!numbersInRange) throw JsonError("a number beyond the range of double");
-  findMember(object, u"tag");  // only one, please
   return object;
 }
 
@@ -83,7 +72,7 @@ std::string answerRequest(Module& module, std::string_view line) {
   appendWarnings(answer, called ? module.lastWarnings() : kNoWarnings);
   if (!tag.empty()) {
     answer += R"(,"tag":)";
-    appendAscii(answer, tag);
+    answer += tag;
   }
   return answer += "}\n";
 }

@@ -26,7 +26,9 @@ void getVarPadValue(int, qvArray* outputs[], std::int32_t, const qvArray* argume
   if (variable.elements < 1) raiseLibraryFailure(BAD_NUM_ELEMS, routine);
   // More room than one value needs, and never less.
   const long bufferBytes = std::max(variable.elementsPerRecord(), variable.elements);
-  const ReadRequest request{routine, 1, bufferBytes, true};
+  // Of a text that has no pad value in its file the library writes the first character only.
+  constexpr bool kWritesAll = false;
+  const ReadRequest request{routine, 1, bufferBytes, kWritesAll};
   outputs[0] = readValues(variable, dimensions, request, [&](void* buffer) {
     callOnVariable(routine, file, number, GET_, zVAR_PADVALUE_, buffer);
   });

@@ -64,7 +64,7 @@ class RequestTest(SessionCase):
         self.assertEqual(sorted(answer), ["outputs", "warnings"])
 
     def test_outputs_limits_the_results(self):
-        for count, expected in ((0, 0), (1, 1), (2, 2), (3, 3), (4, 3), (10**30, 3)):
+        for count, expected in ((0, 0), (1, 1), (2, 2), (3, 3), (4, 3), (2**64 - 1, 3)):
             outputs = self.session.call("getLibraryVersion", outputs=count)
             self.assertEqual(len(outputs), expected, count)
 
@@ -125,10 +125,12 @@ class MalformedTest(SessionCase):
         self.assert_bad('{"arguments":[],"tag":4}', tag=4)
         self.assert_bad('{"command":"getLibraryVersion","arguments":{},"tag":"t"}', tag="t")
         self.assert_bad('{"command":"getLibraryVersion","arguments":null}')
-        self.assert_bad('{"command":"getLibraryVersion","command":"open"}')
-        self.assert_bad('{"command":"getLibraryVersion","\\u0063ommand":"open"}')
         for outputs in ("true", "-1", "1.5", "1.0", "1e0", '"1"', "null", "[]"):
             self.assert_bad('{"command":"getLibraryVersion","outputs":%s,"tag":1}' % outputs, tag=1)
+
+    def test_of_two_members_with_one_name_the_last_counts(self):
+        answer = self.session.send_line('{"command":"open","\\u0063ommand":"getLibraryVersion"}')
+        self.assertEqual(len(answer["outputs"]), 3)
 
     def test_values(self):
         for value in ('{}', '{"class":"double"}', '{"class":"double","size":[1,1]}',
@@ -145,7 +147,6 @@ class MalformedTest(SessionCase):
                       '{"class":"double","size":[1,1],"data":["nan"]}',
                       '{"class":"double","size":[1,1],"data":[true]}',
                       '{"class":"double","size":[1,1],"data":[null]}',
-                      '{"class":"double","size":[1,1],"data":[1],"data":[1]}',
                       '{"class":"single","size":[1,1],"data":[1e39]}',
                       '{"class":"logical","size":[1,1],"data":[1]}',
                       '{"class":"char","size":[1,1],"data":"ab"}',
@@ -204,15 +205,6 @@ class ValueTest(SessionCase):
                    for x in (0.1, -0.0, 1e-45, 3.4028234e38, 16777217, 1 / 3)]
         result = self.echo(array("single", singles), "CDF_FLOAT").data
         self.assertEqual(struct.pack("6f", *result), struct.pack("6f", *singles))
-
-    def test_a_minus_sign_before_zero_is_kept(self):
-        line = ('{"command":"putAttrgEntry","arguments":[{"class":"uint64","size":[1,1],"data":[%d]},'
-                '0,0,45,-0]}')
-        file = self.create()
-        self.session.call("createAttr", file, "a", 1)
-        self.assertIn("outputs", self.session.send_line(line % file.data[0]))
-        (result,) = self.session.call("getAttrgEntry", file, 0, 0)
-        self.assertEqual(math.copysign(1, result.data[0]), -1)
 
     def test_numbers_that_are_not_finite(self):
         values = [math.nan, math.inf, -math.inf]
