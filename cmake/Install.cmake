@@ -10,7 +10,7 @@ write_basic_package_version_file("${CMAKE_BINARY_DIR}/generated/ambrixConfigVers
 install(FILES "${CMAKE_BINARY_DIR}/generated/ambrixConfigVersion.cmake"
   DESTINATION "${ambrix_package}")
 
-install(FILES LICENSE CHANGELOG.md DESTINATION "${CMAKE_INSTALL_DOCDIR}")
+install(FILES LICENSE NOTICE CHANGELOG.md DESTINATION "${CMAKE_INSTALL_DOCDIR}")
 install(FILES README.md DESTINATION "${CMAKE_INSTALL_DOCDIR}" OPTIONAL)
 install(DIRECTORY docs DESTINATION "${CMAKE_INSTALL_DOCDIR}"
   FILES_MATCHING PATTERN "*.md" PATTERN "*.json" PATTERN templates EXCLUDE)

@@ -1,16 +1,17 @@
-# Packages of what is installed, made by `cpack` in the build folder: an archive and, where
-# dpkg-shlibdeps can tell the dependencies, a Debian package. Both carry the CDF library when it was
-# provisioned; with another one (CDF_ROOT), they need it where it was found.
+# Packages of what is installed, made by `cpack` in the build folder: an archive and, where the
+# programs that tell its dependencies are at hand, a Debian package. Both carry the CDF library when
+# it was provisioned; another one (CDF_ROOT) they need where it was found.
 find_program(AMBRIX_SHLIBDEPS dpkg-shlibdeps)
-mark_as_advanced(AMBRIX_SHLIBDEPS)
+find_program(AMBRIX_FILE file)
+mark_as_advanced(AMBRIX_SHLIBDEPS AMBRIX_FILE)
 
 set(CPACK_GENERATOR TGZ)
-if(AMBRIX_SHLIBDEPS)
+if(AMBRIX_SHLIBDEPS AND AMBRIX_FILE)
   list(APPEND CPACK_GENERATOR DEB)
 endif()
 set(CPACK_PACKAGE_CONTACT "ambrix developers <ambrix@localhost>")
 set(CPACK_PACKAGE_VENDOR "ambrix developers")
-set(CPACK_RESOURCE_FILE_LICENSE "${PROJECT_SOURCE_DIR}/LICENSE")
+set(CPACK_SYSTEM_NAME "${CMAKE_SYSTEM_NAME}-${CMAKE_SYSTEM_PROCESSOR}")
 set(CPACK_PACKAGE_CHECKSUM SHA256)
 set(CPACK_STRIP_FILES ON)
 set(CPACK_DEBIAN_FILE_NAME DEB-DEFAULT)

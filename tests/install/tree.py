@@ -17,7 +17,7 @@ FILES = """
     lib/libambrix_embedded.so lib/ambrix/ambrix_module.so
     lib/cmake/ambrix/ambrixConfig.cmake lib/cmake/ambrix/ambrixConfigVersion.cmake
     share/man/man1/ambrix.1 share/bash-completion/completions/ambrix
-    share/doc/ambrix/LICENSE share/doc/ambrix/CHANGELOG.md
+    share/doc/ambrix/LICENSE share/doc/ambrix/NOTICE share/doc/ambrix/CHANGELOG.md
     share/doc/ambrix/docs/embedding.md share/doc/ambrix/docs/commands.md
     share/doc/ambrix/examples/CMakeLists.txt share/doc/ambrix/examples/list_variables.cc
     """.split()
