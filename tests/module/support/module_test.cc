@@ -157,11 +157,11 @@ std::string ModuleTest::sample(const char* name) {
   return fs::exists(path) ? path.string() : "";
 }
 
-int ModuleTest::libraryVersion() {
+LibraryDifferences ModuleTest::library() {
   int version = 0;
   for (const Array& part : results("getLibraryVersion"))
     version = 10 * version + static_cast<int>(part.data<double>()[0]);
-  return version;
+  return LibraryDifferences(version);
 }
 
 }  // namespace ambrix_test

@@ -8,6 +8,7 @@
 #include <string>
 #include <vector>
 
+#include "tests/module/support/library_differences.h"
 #include "tests/module/support/status_texts.h"
 #include "tests/support/given.h"
 #include "tests/support/message_text.h"
@@ -57,9 +58,8 @@ class ModuleTest : public testing::Test {
   /// Empty when the folder of samples is absent.
   static std::string sample(const char* name);
 
-  /// The library's version as 391 or 363.
-  int libraryVersion();
-  bool isOldLibrary() { return libraryVersion() < 390; }
+  /// What the running library does unlike others.
+  LibraryDifferences library();
 
   ::ambrix::Module module;
 
