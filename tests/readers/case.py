@@ -47,6 +47,8 @@ def reference(one, path):
         if isinstance(content, Unread):
             continue
         for name, variable in content.variables.items():
+            if name not in one.variables:
+                continue
             texts = [f"variable {name}: {text}"
                      for text in variable_differences(one.variables[name], variable)]
             faulty = any(matching(reader.NAME, path.name, text) for text in texts)

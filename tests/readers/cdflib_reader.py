@@ -31,7 +31,7 @@ def _variable(cdf, name):
     variable.values = expand(data, variable)
     if info.Pad is not None:
         variable.pad = _pad(info.Pad, variable)
-    if not zvariable:  # dimensions that do not vary are hidden when rVariables are seen as zVariables
+    if not zvariable:  # seen as zVariables, rVariables lose the dimensions that do not vary
         variable.sizes = tuple(size for size, vary in zip(sizes, varies) if vary)
         variable.varies = (True,) * len(variable.sizes)
         variable.values = data.reshape((-1,) + variable.shape)

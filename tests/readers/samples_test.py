@@ -3,12 +3,12 @@
 import unittest
 
 from readers import pycdfpp_reader
-from readers.case import READERS, ReadersCase, unexplained
+from readers.case import READERS, ReadersCase, reference, unexplained
 from readers.comparison import differences
-from readers.content import attempt
+from readers.content import CHARACTERS, attempt
 from readers.known_faults import rows_for
 from readers.sample_files import FOLDER, UNREADABLE, distribution_files, folder_files
-from readers.sample_files import needs_folder
+from readers.sample_files import needs_folder, readable_files
 from support.ambrix_session import CallError
 
 
@@ -34,6 +34,18 @@ class SamplesTest(ReadersCase):
     @needs_folder
     def test_files_of_the_sample_folder(self):
         self.compare(folder_files())
+
+
+class DefaultPadValueTest(ReadersCase):
+    def test_of_characters_is_blank(self):
+        """Where the file declares none the CDF library's versions give one blank or more."""
+        for path in readable_files().values():
+            mine = self.read(path)
+            for name, theirs in reference(mine, path).items():
+                if theirs.pad is None and theirs.code in CHARACTERS:
+                    with self.subTest(file=path.name, variable=name):
+                        pad = mine.variables[name].pad.tobytes()
+                        self.assertRegex(pad, rb"^ +\x00*$")
 
 
 @needs_folder
