@@ -102,6 +102,27 @@ TEST_F(VariableSettingsTest, ABadNumberOfBuffersIsReportedBeforeTheFormatIsRead)
   EXPECT_EQ(does("setVarCacheSize", {file, "0", {1, 2}}), notScalar("VARNUM"));
 }
 
+// A record of 2^32 values has a size of 0 to the library, which divides by it.
+TEST_F(VariableSettingsTest, VariablesWithOversizedRecordsAreRefusedWhereTheLibraryWouldDivide) {
+  createVar(file, {.sizes = {65536, 65536}, .name = "huge"});
+  EXPECT_EQ(does("setVarBlockingFactor", {file, 1, 2}),
+            refused("CDFsetzVarBlockingFactor", kBadDimSize));
+  EXPECT_EQ(does("setVarInitialRecs", {file, 1, 1}), refused("CDFsetzVarInitialRecs", kBadDimSize));
+  EXPECT_EQ(does("setVarAllocBlockRecords", {file, 1, 0, 1}),
+            refused("CDFsetzVarAllocBlockRecords", kBadDimSize));
+  EXPECT_EQ(does("deleteVarRecords", {file, 1, 0, 0}),
+            refused("CDFdeletezVarRecords", kBadDimSize));
+  EXPECT_EQ(does("getVarNumRecsWritten", {file, 1}), "double 1x1 [0]");
+}
+
+TEST_F(VariableSettingsTest, DeletingRecordsOfAMultiFileDoesNothing) {
+  const Given multi = createMultiFile("multi");
+  createVar(multi, {});
+  results("putVarRecordData", {multi, 0, 0, kOne});
+  EXPECT_EQ(does("deleteVarRecords", {multi, 0, 0, 0}), "done");
+  EXPECT_EQ(does("getVarNumRecsWritten", {multi, 0}), "double 1x1 [1]");
+}
+
 struct Command {
   const char* name;
   const char* routine;
