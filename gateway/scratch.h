@@ -12,6 +12,21 @@ struct HostFree {
   void operator()(void* memory) const noexcept { qvFree(memory); }
 };
 
+/// The host's allocator for containers of bytes.
+struct HostAllocator {
+  using value_type = unsigned char;
+  template <typename>
+  struct rebind {
+    using other = HostAllocator;
+  };
+
+  static value_type* allocate(std::size_t bytes) {
+    return static_cast<value_type*>(qvMalloc(bytes));
+  }
+  static void deallocate(value_type* memory, std::size_t) noexcept { qvFree(memory); }
+  friend bool operator==(HostAllocator, HostAllocator) { return true; }
+};
+
 /// A text that the host has allocated.
 using HostString = std::unique_ptr<char, HostFree>;
 

@@ -3,9 +3,12 @@
 
 #include <vector>
 
+#include "gateway/scratch.h"
+
 namespace TOLVEX::ambrix {
 
-using ValueBuffer = std::vector<unsigned char>;
+/// Its memory is the host's, so that the host's limits hold for it.
+using ValueBuffer = std::vector<unsigned char, HostAllocator>;
 
 /// Resizes to hold `count` values of a CDF datatype; new bytes are zero. Character data get one
 /// byte more, for a terminator; an unsupported datatype empties the buffer.
