@@ -10,6 +10,7 @@ from readers.content import Unread, attempt
 from readers.known_faults import matching
 from support.ambrix_session import Session
 
+SAMPLES = {}  # what was read of sample files, by path
 READERS = (cdflib_reader, pycdfpp_reader)
 
 
@@ -27,6 +28,13 @@ class ReadersCase(unittest.TestCase):
     def read(self, path):
         """The content through the module."""
         return module_reader.read(self.session, str(path))
+
+    def read_sample(self, path):
+        """Like `read`, of a file that does not change and is read once; with `reference`."""
+        if path not in SAMPLES:
+            content = self.read(path)
+            SAMPLES[path] = (content, reference(content, path))
+        return SAMPLES[path]
 
 
 def unexplained(reader, name, found):
@@ -47,7 +55,7 @@ def reference(one, path):
         if isinstance(content, Unread):
             continue
         for name, variable in content.variables.items():
-            if name not in one.variables:
+            if name not in one.variables or isinstance(variable, Unread):
                 continue
             texts = [f"variable {name}: {text}"
                      for text in variable_differences(one.variables[name], variable)]

@@ -4,7 +4,7 @@ import cdflib
 import numpy as np
 
 from readers.content import CHARACTERS, CODES, EPOCH16, INT8, TT2000, Attribute, Content
-from readers.content import Variable, attempt, dtype_of, expand, text_bytes
+from readers.content import Variable, attempt, dtype_of, expand, seen_as_zvariable, text_bytes
 
 NAME = "cdflib"
 UNSUPPORTED = {"CDF_INT8": INT8, "CDF_TIME_TT2000": TT2000}
@@ -23,6 +23,8 @@ def _variable(cdf, name):
     zvariable = info.Var_Type == "zVariable"
     sizes = tuple(info.Dim_Sizes)
     varies = tuple(bool(vary) for vary in info.Dim_Vary)
+    if len(varies) > len(sizes):  # of an rVariable it leaves out sizes that do not vary
+        varies = (True,) * len(sizes)
     variable = Variable(info.Data_Type, info.Num_Elements, sizes, varies, bool(info.Rec_Vary),
                         sparse=SPARSE[info.Sparse])
     data = np.asarray(cdf.varget(name))
@@ -31,11 +33,7 @@ def _variable(cdf, name):
     variable.values = expand(data, variable)
     if info.Pad is not None:
         variable.pad = _pad(info.Pad, variable)
-    if not zvariable:  # seen as zVariables, rVariables lose the dimensions that do not vary
-        variable.sizes = tuple(size for size, vary in zip(sizes, varies) if vary)
-        variable.varies = (True,) * len(variable.sizes)
-        variable.values = data.reshape((-1,) + variable.shape)
-    return variable
+    return variable if zvariable else seen_as_zvariable(variable)
 
 
 def _pad(pad, variable):

@@ -60,10 +60,12 @@ def variable_differences(one, other):
     if one is None:
         return [] if other.code in (INT8, TT2000) else [f"datatype {other.code} refused"]
     found = []
-    for name in ("code", "elements", "record_varies", "sparse"):
+    for name in ("code", "elements", "record_varies"):
         mine, theirs = getattr(one, name), getattr(other, name)
         if mine != theirs:
             found.append(f"{name}: {mine} and {theirs}")
+    if other.sparse not in (None, one.sparse):  # None: the reader does not tell
+        found.append(f"sparse: {one.sparse} and {other.sparse}")
     if one.sizes != other.sizes and kept_sizes(one) != kept_sizes(other):
         return found + [f"sizes: {one.sizes} and {other.sizes}"]
     mine, theirs = one.values, other.values

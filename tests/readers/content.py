@@ -106,3 +106,13 @@ def expand(values, variable):
     kept = tuple(size if vary else 1 for size, vary in zip(variable.sizes, variable.varies))
     values = values.reshape((-1,) + kept + leading)
     return np.broadcast_to(values, (values.shape[0],) + tuple(variable.sizes) + leading)
+
+
+def seen_as_zvariable(variable):
+    """An rVariable as the CDF library shows it among zVariables: without the dimensions that do
+    not vary."""
+    single = tuple(slice(None) if vary else 0 for vary in variable.varies)
+    variable.values = variable.values[(slice(None), *single)]
+    variable.sizes = tuple(size for size, vary in zip(variable.sizes, variable.varies) if vary)
+    variable.varies = (True,) * len(variable.sizes)
+    return variable
