@@ -1,5 +1,6 @@
 // The commands on single entries, addressed by attribute and entry number. The "g" commands address
-// gEntries of global attributes, the others zEntries, whose number is the variable's.
+// gEntries of global attributes, the others zEntries, whose number is the variable's; only the put
+// commands go by the attribute's scope instead.
 #pragma once
 
 #include <cstdint>
@@ -26,6 +27,7 @@ inline constexpr EntryKind kGEntry{kGlobalEntry,  "CDFinquireAttrgEntry", "CDFge
 inline constexpr EntryKind kZEntry{kVariableEntry, "CDFinquireAttrzEntry", "CDFgetAttrzEntry", "CDFputAttrzEntry", "CDFdeleteAttrzEntry", "ATTNUM"};
 // clang-format on
 
+// What the commands below do for either kind.
 void getEntry(const EntryKind& kind, qvArray* outputs[], const qvArray* arguments[]);
 void inquireEntry(const EntryKind& kind, qvArray* outputs[], const qvArray* arguments[]);
 void deleteEntry(const EntryKind& kind, const qvArray* arguments[]);

@@ -39,4 +39,10 @@ bool isRowMajor(CdfId file) {
   return majority == ROW_MAJOR;
 }
 
+bool isSingleFile(CdfId file) {
+  long format = 0;
+  callOnFile("CDFgetFormat", file, GET_, CDF_FORMAT_, &format);
+  return format == SINGLE_FILE;
+}
+
 }  // namespace TOLVEX::ambrix

@@ -68,4 +68,6 @@ inline constexpr int kZVariables = 1;
 /// `ROW_MAJOR` files hold their last dimension fastest, the host its first.
 bool isRowMajor(CdfId file);
 
+bool isSingleFile(CdfId file);
+
 }  // namespace TOLVEX::ambrix

@@ -79,7 +79,7 @@ bool isCharacterDatatype(long code) {
   return code == CDF_CHAR || code == CDF_UCHAR;
 }
 
-const std::string& datatypeName(long code) {
+std::string datatypeName(long code) {
   const auto found = datatypeNames().find(code);
   if (found == datatypeNames().end()) raiseUnrecognized(code);
   return found->second;

@@ -25,7 +25,7 @@ std::size_t bytesOfArray(const qvArray* array, long code);
 bool isCharacterDatatype(long code);
 
 /// Upper-case name, for error messages. Raises like `validateDatatype`.
-const std::string& datatypeName(long code);
+std::string datatypeName(long code);
 
 /// Lower-case name as a host string, for inquiry results. Raises like `validateDatatype`.
 qvArray* datatypeNameArray(long code);

@@ -42,7 +42,7 @@ HostDimensions recordDimensions(const VariableDescription& variable, bool rowMaj
   HostDimensions dimensions;
   const bool scalar = variable.dimensions == 0;
   const bool text = isCharacterDatatype(variable.datatype);
-  if (variable.datatype == CDF_EPOCH16 || (text && variable.elements > 1)) {
+  if (variable.datatype == CDF_EPOCH16 || (text && variable.elements != 1)) {
     appendLeading(dimensions, variable);
   } else if (scalar) {
     dimensions.append(variable.elements);

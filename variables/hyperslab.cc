@@ -5,6 +5,15 @@
 #include "gateway/arguments.h"
 
 namespace TOLVEX::ambrix {
+namespace {
+
+/// Whether the last of `count` numbers, `interval` apart, is beyond 32 bits. Each of the three is
+/// within them, so 64 bits hold the result.
+bool wraps(long start, long count, long interval) {
+  return start >= 0 && count >= 1 && interval >= 1 && !fitsLibrary(start + (count - 1) * interval);
+}
+
+}  // namespace
 
 void Hyperslab::reverseDimensions() {
   std::ranges::reverse(start);
@@ -23,22 +32,31 @@ Hyperslab getHyperslabArgs(const qvArray* arguments[], const char* intervalLabel
   return slab;
 }
 
-LibraryHyperslab::LibraryHyperslab(const Hyperslab& slab)
+LibraryHyperslab::LibraryHyperslab(const Hyperslab& slab, std::span<const long> sizes)
     : recordStart(libraryNumber(slab.recordStart, kBadNumber)),
       recordCount(libraryNumber(slab.recordCount, kBadNumber)),
       recordInterval(libraryNumber(slab.recordInterval, kBadNumber)),
       start(libraryVector(slab.start, kBadNumber)),
       count(libraryVector(slab.count, kBadNumber)),
-      interval(libraryVector(slab.interval, kBadNumber)) {}
+      interval(libraryVector(slab.interval, kBadNumber)) {
+  if (wraps(recordStart, recordCount, recordInterval)) recordStart = kBadNumber;
+  for (std::size_t i = 0; i < sizes.size(); ++i) {
+    if (!wraps(start[i], count[i], interval[i])) continue;
+    start[i] = sizes[i];
+    interval[i] = 1;
+  }
+}
 
-void moveHyperslab(const char* routine, CdfId file, long variable, LibraryHyperslab slab,
+void moveHyperslab(const char* routine, CdfId file, long variable, const LibraryHyperslab& slab,
                    long operation, const void* buffer) {
-  callOnVariable(routine, file, variable,                                                      //
-                 zVAR_RECNUMBER_, slab.recordStart,                                            //
-                 zVAR_RECCOUNT_, slab.recordCount,                                             //
-                 zVAR_RECINTERVAL_, slab.recordInterval, zVAR_DIMINDICES_, slab.start.data(),  //
-                 zVAR_DIMCOUNTS_, slab.count.data(),                                           //
-                 zVAR_DIMINTERVALS_, slab.interval.data(), operation, zVAR_HYPERDATA_, buffer);
+  callOnVariable(routine, file, variable,                   //
+                 zVAR_RECNUMBER_, slab.recordStart,         //
+                 zVAR_RECCOUNT_, slab.recordCount,          //
+                 zVAR_RECINTERVAL_, slab.recordInterval,    //
+                 zVAR_DIMINDICES_, slab.start.data(),       //
+                 zVAR_DIMCOUNTS_, slab.count.data(),        //
+                 zVAR_DIMINTERVALS_, slab.interval.data(),  //
+                 operation, zVAR_HYPERDATA_, buffer);
 }
 
 }  // namespace TOLVEX::ambrix

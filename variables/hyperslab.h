@@ -1,6 +1,7 @@
 // A strided block of records and, within each record, a strided block of each dimension.
 #pragma once
 
+#include <span>
 #include <vector>
 
 #include "gateway/library.h"
@@ -25,9 +26,11 @@ struct Hyperslab {
 /// Converts six arguments from "RECSTART" on. The label of the interval vector is the caller's.
 Hyperslab getHyperslabArgs(const qvArray* arguments[], const char* intervalLabel);
 
-/// A hyperslab as the library reads it.
+/// A hyperslab as the library reads it, in a variable of these dimension sizes. The library
+/// computes its last record and indices in 32 bits, where they can wrap around into the variable:
+/// such a hyperslab becomes one that starts beyond it, which the library refuses.
 struct LibraryHyperslab {
-  explicit LibraryHyperslab(const Hyperslab& slab);
+  LibraryHyperslab(const Hyperslab& slab, std::span<const long> sizes);
 
   long recordStart;
   long recordCount;
@@ -38,7 +41,7 @@ struct LibraryHyperslab {
 };
 
 /// Selects the variable and the hyperslab, then performs GET_ or PUT_ of `zVAR_HYPERDATA_`.
-void moveHyperslab(const char* routine, CdfId file, long variable, LibraryHyperslab slab,
+void moveHyperslab(const char* routine, CdfId file, long variable, const LibraryHyperslab& slab,
                    long operation, const void* buffer);
 
 }  // namespace TOLVEX::ambrix

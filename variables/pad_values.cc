@@ -24,7 +24,7 @@ void getVarPadValue(int, qvArray* outputs[], std::int32_t, const qvArray* argume
   const HostDimensions dimensions = valueDimensions(variable);
   validateDatatype(variable.datatype);
   if (variable.elements < 1) raiseLibraryFailure(BAD_NUM_ELEMS, routine);
-  // More room than one value needs, and never less.
+  // More room than one value needs, and never less whatever sizes a damaged file gives.
   const long bufferBytes = std::max(variable.elementsPerRecord(), variable.elements);
   // Of a text that has no pad value in its file the library writes the first character only.
   constexpr bool kWritesAll = false;
@@ -46,7 +46,8 @@ void setVarPadValue(int, qvArray*[], std::int32_t, const qvArray* arguments[],
   if (!hasElements(value, expected)) {
     raiseError(cdflib::wrongNumberOfPadValueElements(variable.name, expected));
   }
-  requireUsableRecord(variable, routine);
+  if (variable.elements < 1) raiseLibraryFailure(BAD_NUM_ELEMS, routine);
+  requireDivisibleRecord(file, variable, routine);
   requireRoom(variable, 1, bytesOfArray(value, variable.datatype), routine);
   const LibraryData data(value);
   callOnVariable(routine, file, number, PUT_, zVAR_PADVALUE_, data.bytes());

@@ -98,7 +98,7 @@ void hyperGetVarData(int, qvArray* outputs[], std::int32_t, const qvArray* argum
   const ReadRequest request{routine, values, bufferBytes, true};
   requireUsableRecord(variable, routine);
   outputs[0] = readValues(variable, dimensions, request, [&](void* buffer) {
-    moveHyperslab(routine, file, number, LibraryHyperslab(slab), GET_, buffer);
+    moveHyperslab(routine, file, number, LibraryHyperslab(slab, variable.sizes()), GET_, buffer);
   });
 }
 

@@ -18,7 +18,7 @@ namespace TOLVEX::ambrix {
 /// What one read asks of the library.
 struct ReadRequest {
   const char* routine;
-  long values;       // that the library may write
+  long values;       // that the library writes at the most
   long bufferBytes;  // that characters are read into: at least those of the values
   bool writesAll;    // else what the library leaves unwritten reads as zeros
 };
@@ -28,11 +28,11 @@ template <typename Read>
 qvArray* readCharacters(const HostDimensions& dimensions, const ReadRequest& request,
                         const Read& read) {
   qvArray* array = qvCreateCharArray(dimensions.count(), dimensions.data());
-  const std::size_t bytes = saturatedProduct({request.bufferBytes});
-  const ScratchBuffer buffer(bytes);
-  if (!request.writesAll) std::memset(buffer.data(), 0, bytes);
+  const std::size_t characters = qvGetNumberOfElements(array);
+  const ScratchBuffer buffer(saturatedProduct({request.bufferBytes}));
+  if (!request.writesAll) std::memset(buffer.data(), 0, characters);
   read(buffer.data());
-  widenCharacters(buffer.data(), qvGetNumberOfElements(array), qvGetChars(array));
+  widenCharacters(buffer.data(), characters, qvGetChars(array));
   return array;
 }
 

@@ -60,16 +60,14 @@ void requireUsableRecord(const VariableDescription& variable, const char* routin
   }
 }
 
-void requireDivisibleRecord(CdfId file, long variable, const char* routine) {
-  const VariableDescription found = inquireVariable(file, variable, routine);
-  std::uint32_t values = 1;
-  for (std::size_t i = 0; i < found.sizes().size(); ++i) {
-    if (found.varianceSlots[i] != NOVARY) values *= static_cast<std::uint32_t>(found.sizes()[i]);
-  }
-  const long supportedSize = datatypeSize(found.datatype);
+void requireDivisibleRecord(CdfId file, const VariableDescription& variable, const char* routine) {
+  const long supportedSize = datatypeSize(variable.datatype);
   const long elementSize = supportedSize > 0 ? supportedSize : kOtherDatatypeSize;
-  const auto valueBytes = static_cast<std::uint32_t>(found.elements * elementSize);
-  if (values * valueBytes == 0) raiseLibraryFailure(BAD_DIM_SIZE, routine);
+  auto bytes = static_cast<std::uint32_t>(variable.elements * elementSize);
+  for (std::size_t i = 0; i < variable.sizes().size(); ++i) {
+    if (variable.variances()[i] != NOVARY) bytes *= static_cast<std::uint32_t>(variable.sizes()[i]);
+  }
+  if (bytes == 0 && isSingleFile(file)) raiseLibraryFailure(BAD_DIM_SIZE, routine);
 }
 
 void requireRoom(const VariableDescription& variable, long values, std::size_t bytes,

@@ -39,14 +39,14 @@ struct VariableDescription {
 VariableDescription inquireVariable(CdfId file, long variable,
                                     const char* routine = "CDFinquirezVar");
 
-/// The library counts the bytes of a record in 32 bits: refuses, in its words, descriptions that
-/// only a damaged file or a variable too large to store has. Readers and writers call this after
-/// all their other checks.
+/// The library counts the bytes of a record in 32 bits: refuses, as its bad dimension size or bad
+/// number of elements, descriptions that only a damaged file or a variable too large to store has.
+/// Readers and writers call this after all their other checks.
 void requireUsableRecord(const VariableDescription& variable, const char* routine);
 
-/// Some settings make the library divide by that count, which can wrap around to zero; they go
-/// through for every other variable.
-void requireDivisibleRecord(CdfId file, long variable, const char* routine);
+/// Some commands make the library divide by the bytes of a record of a single-file CDF: refuses, as
+/// its bad dimension size, variables for which they wrap around to zero, and no others.
+void requireDivisibleRecord(CdfId file, const VariableDescription& variable, const char* routine);
 
 /// Refuses, as the library's bad number of elements, to move `values` values of the variable to or
 /// from `bytes` bytes if they are not enough.

@@ -8,9 +8,7 @@ namespace TOLVEX::ambrix {
 namespace {
 
 void requireMultiFile(CdfId file) {
-  long format = 0;
-  callOnFile("CDFgetFormat", file, GET_, CDF_FORMAT_, &format);
-  if (format == SINGLE_FILE) raiseError(cdflib::varCacheSizeOpInappropriate());
+  if (isSingleFile(file)) raiseError(cdflib::varCacheSizeOpInappropriate());
 }
 
 }  // namespace
@@ -30,10 +28,8 @@ void getVarCacheSize(int, qvArray* outputs[], std::int32_t, const qvArray* argum
   const CdfId file = getCdfIdArg(arguments[0]);
   const long variable = getLongScalarArg(arguments[1], "VARNUM");
   requireMultiFile(file);
-  const char* routine = "CDFgetzVarCacheSize";
-  requireDivisibleRecord(file, variable, routine);
   long buffers = 0;
-  callOnVariable(routine, file, variable, CONFIRM_, zVAR_CACHESIZE_, &buffers);
+  callOnVariable("CDFgetzVarCacheSize", file, variable, CONFIRM_, zVAR_CACHESIZE_, &buffers);
   outputs[0] = makeDoubleScalar(buffers);
 }
 
@@ -43,9 +39,7 @@ void setVarCacheSize(int, qvArray*[], std::int32_t, const qvArray* arguments[],
   const long variable = getLongScalarArg(arguments[1], "VARNUM");
   const long buffers = libraryNumber(getLongScalarArg(arguments[2], "NUMBUFFERS"), kBadNumber);
   requireMultiFile(file);
-  const char* routine = "CDFsetzVarCacheSize";
-  requireDivisibleRecord(file, variable, routine);
-  callOnVariable(routine, file, variable, zVAR_CACHESIZE_, buffers);
+  callOnVariable("CDFsetzVarCacheSize", file, variable, zVAR_CACHESIZE_, buffers);
 }
 
 void setVarAllocBlockRecords(int, qvArray*[], std::int32_t, const qvArray* arguments[],
@@ -55,7 +49,7 @@ void setVarAllocBlockRecords(int, qvArray*[], std::int32_t, const qvArray* argum
   const long first = libraryNumber(getLongScalarArg(arguments[2], "RECSTART"), kBadNumber);
   const long last = libraryNumber(getLongScalarArg(arguments[3], "RECSTOP"), kBadNumber);
   const char* routine = "CDFsetzVarAllocBlockRecords";
-  requireDivisibleRecord(file, variable, routine);
+  requireDivisibleRecord(file, inquireVariable(file, variable, routine), routine);
   callOnVariable(routine, file, variable, PUT_,  //
                  zVAR_ALLOCATEBLOCK_, first, last);
 }

@@ -24,7 +24,9 @@ void getVariableNumber(int, qvArray* outputs[], std::int32_t, const qvArray* arg
                        const CommandEntry*) {
   const CdfId file = getCdfIdArg(arguments[0]);
   const long variable = getLongScalarArg(arguments[1], "VARNUM");
-  if constexpr (row.dividesByRecord) requireDivisibleRecord(file, variable, row.routine);
+  if constexpr (row.dividesByRecord) {
+    requireDivisibleRecord(file, inquireVariable(file, variable, row.routine), row.routine);
+  }
   long value = 0;
   callOnVariable(row.routine, file, variable, row.operation, row.item, &value);
   outputs[0] = makeDoubleScalar(value);
@@ -47,7 +49,9 @@ void setVariableNumber(int, qvArray*[], std::int32_t, const qvArray* arguments[]
   const CdfId file = getCdfIdArg(arguments[0]);
   const long variable = getLongScalarArg(arguments[1], "VARNUM");
   const long value = libraryNumber(getLongScalarArg(arguments[2], row.label), kBadNumber);
-  if constexpr (row.dividesByRecord) requireDivisibleRecord(file, variable, row.routine);
+  if constexpr (row.dividesByRecord) {
+    requireDivisibleRecord(file, inquireVariable(file, variable, row.routine), row.routine);
+  }
   if constexpr (row.operation == SELECT_) {
     callOnVariable(row.routine, file, variable, row.item, value);
   } else {

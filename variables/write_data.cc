@@ -34,11 +34,16 @@ long hyperslabElements(const VariableDescription& variable, const Hyperslab& sla
   return productOf(factors);
 }
 
+bool isLessThanOne(long count) {
+  return count < 1;
+}
+
 /// The values that the library will read: it looks at as many counts as the variable has
-/// dimensions, however many the user gave.
+/// dimensions, however many the user gave. None if it refuses a count.
 long valuesRead(const VariableDescription& variable, const LibraryHyperslab& slab) {
   const std::span<const long> counts(slab.count.data(), variable.sizes().size());
-  return multiplySaturated(slab.recordCount, productOf(counts));
+  const bool refused = slab.recordCount < 1 || std::ranges::any_of(counts, isLessThanOne);
+  return refused ? 0 : multiplySaturated(slab.recordCount, productOf(counts));
 }
 
 }  // namespace
@@ -87,7 +92,7 @@ void putVarRecordData(int, qvArray*[], std::int32_t, const qvArray* arguments[],
   requireClassOfDatatype(data, variable.datatype);
   requireUsableRecord(variable, routine);
   requireRoom(variable, variable.valuesPerRecord(), bytesOfArray(data, variable.datatype), routine);
-  // The routine would write such a record into a damaged file, or abort all access to it.
+  // The routine would abort all access to the file, or leave a file that cannot be opened.
   if (record < 0 || !fitsLibrary(record)) raiseLibraryFailure(BAD_REC_NUM, routine);
   const LibraryData values(data);
   checkLibraryStatus(CDFputVarRecordData(libraryHandle(file, routine), kZVariables, number, record,
@@ -111,13 +116,14 @@ void hyperPutVarData(int, qvArray*[], std::int32_t, const qvArray* arguments[],
   }
   requireClassOfDatatype(data, variable.datatype);
   requireUsableRecord(variable, routine);
-  const LibraryHyperslab librarySlab(slab);
-  const LibraryData values(data);
-  const long read = valuesRead(variable, librarySlab);
-  const std::size_t bytes =
-      saturatedProduct({read, variable.elements, datatypeSize(variable.datatype)});
+  const LibraryHyperslab librarySlab(slab, variable.sizes());
+  const std::size_t bytesRead = saturatedProduct(
+      {valuesRead(variable, librarySlab), variable.elements, datatypeSize(variable.datatype)});
   // More counts than dimensions can make the expected number smaller than what the library reads.
-  if (bytes > bytesOfArray(data, variable.datatype)) raiseLibraryFailure(BAD_DIM_COUNT, routine);
+  if (bytesRead > bytesOfArray(data, variable.datatype)) {
+    raiseLibraryFailure(BAD_DIM_COUNT, routine);
+  }
+  const LibraryData values(data);
   moveHyperslab(routine, file, number, librarySlab, PUT_, values.bytes());
 }
 
@@ -128,9 +134,9 @@ void deleteVarRecords(int, qvArray*[], std::int32_t, const qvArray* arguments[],
   const long first = getLongScalarArg(arguments[2], "STARTREC");
   const long last = getLongScalarArg(arguments[3], "ENDREC");
   const char* routine = "CDFdeletezVarRecords";
-  requireDivisibleRecord(file, number, routine);
-  callOnVariable(routine, file, number, DELETE_,  //
-                 zVAR_RECORDS_, libraryNumber(first, kBadNumber), libraryNumber(last, kBadNumber));
+  requireDivisibleRecord(file, inquireVariable(file, number, routine), routine);
+  callOnVariable(routine, file, number, DELETE_, zVAR_RECORDS_,  //
+                 libraryNumber(first, kBadNumber), libraryNumber(last, kBadNumber));
 }
 
 }  // namespace TOLVEX::ambrix
