@@ -6,7 +6,7 @@ import warnings
 
 from readers import cdflib_reader, module_reader, pycdfpp_reader
 from readers.comparison import variable_differences
-from readers.content import Unread, attempt
+from readers.content import CHARACTERS, Unread, attempt, fill_texts
 from readers.known_faults import matching
 from support.ambrix_session import Session
 
@@ -58,8 +58,11 @@ def reference(one, path):
             if name not in one.variables or isinstance(variable, Unread):
                 continue
             texts = [f"variable {name}: {text}"
-                     for text in variable_differences(one.variables[name], variable)]
+                     for text in variable_differences(one.variables[name], variable,
+                                                      one.nul_reads_as)]
             faulty = any(matching(reader.NAME, path.name, text) for text in texts)
             if name not in found and not faulty:
+                if variable.code in CHARACTERS and one.nul_reads_as:
+                    variable.values = fill_texts(variable.values, one.nul_reads_as)
                 found[name] = variable
     return found

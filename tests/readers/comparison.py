@@ -2,7 +2,7 @@
 
 import numpy as np
 
-from readers.content import CHARACTERS, INT8, TT2000, Attribute, Unread, leading_of
+from readers.content import CHARACTERS, INT8, TT2000, Attribute, Unread, fill_texts, leading_of
 
 
 def same_numbers(one, other):
@@ -53,8 +53,8 @@ def without_repetition(variable):
                           + leading_of(variable.code, variable.elements))
 
 
-def variable_differences(one, other):
-    """`one` from the module."""
+def variable_differences(one, other, nul_reads_as=0):
+    """`one` from the module, whose library reads a text's bytes from the first 0 on as these."""
     if isinstance(other, Unread):
         return [f"unread ({other.error!r})"]
     if one is None:
@@ -72,6 +72,8 @@ def variable_differences(one, other):
     if one.sizes != other.sizes:
         mine = without_repetition(one)
         theirs = without_repetition(other).reshape(mine.shape)
+    if one.code in CHARACTERS and nul_reads_as:
+        theirs = fill_texts(theirs, nul_reads_as)
     if not same_numbers(mine, theirs):
         found.append("values: " + first_difference(mine, theirs))
     if _pads_differ(one.pad, other.pad, one.code):
@@ -79,7 +81,7 @@ def variable_differences(one, other):
     return found
 
 
-def entry_difference(one, other):
+def entry_difference(one, other, nul_reads_as=0):
     """`one` from the module. Empty when there is none."""
     if isinstance(other, Unread):
         return f"unread ({other.error!r})"
@@ -87,7 +89,8 @@ def entry_difference(one, other):
     if code is None:
         same = value in (INT8, TT2000) and value == other[0]
     elif code in CHARACTERS:
-        same = code == other[0] and value == other[1].split(b"\0")[0]
+        filler = bytes([nul_reads_as])
+        same = code == other[0] and value.rstrip(filler) == other[1].split(b"\0")[0].rstrip(filler)
     else:
         same = code == other[0] and same_numbers(value, other[1])
     return "" if same else f"{one} and {other}"
@@ -99,7 +102,7 @@ def renumbered(attribute):
     return Attribute(True, dict(enumerate(values)))
 
 
-def attribute_differences(name, one, other, keeps_entry_numbers):
+def attribute_differences(name, one, other, keeps_entry_numbers, nul_reads_as):
     if one.is_global and not keeps_entry_numbers:
         one = renumbered(one)
     if one.is_global != other.is_global:
@@ -107,7 +110,7 @@ def attribute_differences(name, one, other, keeps_entry_numbers):
     if set(one.entries) != set(other.entries):
         yield f"attribute {name}: entries {sorted(one.entries)} and {sorted(other.entries)}"
     for key in one.entries.keys() & other.entries.keys():
-        difference = entry_difference(one.entries[key], other.entries[key])
+        difference = entry_difference(one.entries[key], other.entries[key], nul_reads_as)
         if difference:
             yield f"attribute {name} entry {key}: {difference}"
 
@@ -126,9 +129,10 @@ def differences(one, other):
     if [n for n in one.variables] != [n for n in other.variables]:
         found.append("order of variables")
     for name in one.variables.keys() & other.variables.keys():
-        for text in variable_differences(one.variables[name], other.variables[name]):
+        for text in variable_differences(one.variables[name], other.variables[name],
+                                         one.nul_reads_as):
             found.append(f"variable {name}: {text}")
     for name in one.attributes.keys() & other.attributes.keys():
         found += attribute_differences(name, one.attributes[name], other.attributes[name],
-                                       other.keeps_entry_numbers)
+                                       other.keeps_entry_numbers, one.nul_reads_as)
     return found

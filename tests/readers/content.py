@@ -75,6 +75,8 @@ class Content:
     keeps_entry_numbers: bool = True  # of gEntries, where some were never written
     variables: dict = field(default_factory=dict)
     attributes: dict = field(default_factory=dict)
+    # What the reader makes of a text's bytes from the first 0 on.
+    nul_reads_as: int = 0
 
 
 class Unread:
@@ -90,6 +92,12 @@ def attempt(function, *arguments):
         return function(*arguments)
     except Exception as error:  # readers fail in whatever way; what they may miss is listed
         return Unread(error)
+
+
+def fill_texts(values, filler):
+    """Texts of fixed length with their bytes from the first 0 on replaced."""
+    after = np.maximum.accumulate(values == 0, axis=-1)
+    return np.where(after, np.uint8(filler), values)
 
 
 def text_bytes(texts, elements):

@@ -144,6 +144,8 @@ class ModuleReader:
         """Everything in the file."""
         names = self.names()
         content = Content(self.row_major)
+        if self.session.values("getLibraryVersion") < [3, 9]:
+            content.nul_reads_as = ord(" ")
         for number, name in enumerate(names):
             content.variables[name] = self.variable(number)
         for number in range(int(self.session.values("inquire", self.file)[4])):
