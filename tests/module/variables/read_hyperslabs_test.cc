@@ -57,6 +57,18 @@ TEST_F(ReadHyperslabsTest, CountsBeyondADimensionAreTooLarge) {
             kTooLarge);
 }
 
+// The library would compute the last record and index in 32 bits and read foreign memory.
+TEST_F(ReadHyperslabsTest, RecordsAndIndicesThatWrapAroundAreOutOfRange) {
+  const Given file = create();
+  createVar(file, {.datatype = 22, .sizes = {5}});
+  const auto read = [&](double record, double records, double start, double count, double step) {
+    return does("hyperGetVarData", {file, 0, record, records, 1, {start}, {count}, {step}});
+  };
+  EXPECT_EQ(read(0, 1, 0, 3, 2147483647), failed(kBadDimIndex));
+  EXPECT_EQ(read(0, 1, 1, 2, 2147483647), failed(kBadDimIndex));
+  EXPECT_EQ(read(2147483647, 2, 0, 1, 1), failed(kBadRecNum));
+}
+
 TEST_F(ReadHyperslabsTest, EachVectorMustHaveOneNumberForEachDimension) {
   const Given example = open(distributionSample("example1.cdf"));
   const std::string error = cdflib("badDimSpec", 2L, "Image");

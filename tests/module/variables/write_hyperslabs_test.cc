@@ -43,6 +43,23 @@ TEST_F(WriteHyperslabsTest, ABlockIsGivenInTheHostsOrderInBothMajorities) {
   EXPECT_THAT(fileBytes("columns.cdf"), testing::HasSubstr(expected));
 }
 
+// The library would compute the last record and index in 32 bits and write beyond the variable.
+TEST_F(WriteHyperslabsTest, RecordsAndIndicesThatWrapAroundAreOutOfRange) {
+  const double row5 = createVar(file, {.sizes = {5}, .name = "row"});
+  EXPECT_EQ(does("hyperPutVarData",
+                 {file, row5, 0, 1, 1, {0}, {3}, {2147483647}, row<std::int32_t>({1, 2, 3})}),
+            failed(kBadDimIndex));
+  for (const int sparse : {0, 1}) {
+    const double scalar = createVar(file, {.name = sparse == 0 ? "dense" : "sparse"});
+    results("setVarSparseRecords", {file, scalar, sparse});
+    EXPECT_EQ(does("hyperPutVarData",
+                   {file, scalar, 1, 2, 2147483647, {}, {}, {}, row<std::int32_t>({1, 2})}),
+              failed(kBadRecNum));
+  }
+  results("close", {file});
+  open("new.cdf");
+}
+
 TEST_F(WriteHyperslabsTest, TheWrongNumberIsReportedWithTheCountsInTheLibrarysOrder) {
   const Given columns = createColumnMajor("columns");
   for (const auto& [target, counts] :

@@ -14,7 +14,7 @@ Names guarded(const char* routine) {
   return {routine, routine};
 }
 Names afterFormat(const char* routine) {
-  return {"CDFgetFormat", routine, routine};
+  return {"CDFgetFormat", routine};
 }
 
 }  // namespace

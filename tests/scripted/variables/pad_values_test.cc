@@ -59,6 +59,12 @@ TEST_F(PadValuesTest, ADamagedVariableNeverOverrunsItsArray) {
   EXPECT_EQ(shown(result("getVarPadValue", {file(), 3})), "char 4x1 'abcd'");
 }
 
+TEST_F(PadValuesTest, WhatTheLibraryLeavesUnwrittenOfATextReadsAsZeros) {
+  describe({.datatype = 51, .elements = 4, .sizes = {2}});
+  fake.answerData(std::vector<char>{'a'});
+  EXPECT_EQ(result("getVarPadValue", {file(), 3}).chars(), std::u16string(u"a\0\0\0", 4));
+}
+
 TEST_F(PadValuesTest, NumbersAreSetByteForByte) {
   describe({.datatype = 2});
   fake.readBytes(2);

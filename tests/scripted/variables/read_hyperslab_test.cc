@@ -5,6 +5,7 @@ namespace ambrix_test {
 namespace {
 
 using testing::ElementsAre;
+using testing::HasSubstr;
 
 const std::string kOnVariable = "SELECT_ CDF_ 7 | zVAR_ 3 | ";
 
@@ -51,6 +52,25 @@ TEST_F(ReadHyperslabTest, CountsAreComparedWithTheDimensionsInTheLibrarysOrder) 
 TEST_F(ReadHyperslabTest, StartsAndIntervalsAreLeftToTheLibrary) {
   describe({.sizes = {2, 3}});
   EXPECT_EQ(errorWith({-9, 100}, {1, 1}, {0, -5}), "no error");
+}
+
+// In 32 bits 0 + 2 * 2147483647 is -2, which the library would take for an index.
+TEST_F(ReadHyperslabTest, AnIndexThatWrapsAroundBecomesOneBeyondTheDimension) {
+  describe({.sizes = {2, 5}});
+  EXPECT_EQ(errorWith({1, 0}, {1, 3}, {1, 2147483647}), "no error");
+  EXPECT_THAT(calls().back(), HasSubstr("zVAR_DIMINDICES_ [1 5] | zVAR_DIMCOUNTS_ [1 3] | "
+                                        "zVAR_DIMINTERVALS_ [1 1] | "));
+  EXPECT_EQ(errorWith({1, 1}, {1, 2}, {1, 2147483646}), "no error");
+  EXPECT_THAT(calls().back(), HasSubstr("zVAR_DIMINDICES_ [1 1] | zVAR_DIMCOUNTS_ [1 2] | "
+                                        "zVAR_DIMINTERVALS_ [1 2147483646] | "));
+}
+
+TEST_F(ReadHyperslabTest, ARecordThatWrapsAroundBecomesOneThatTheLibraryRefuses) {
+  describe({.sizes = {}});
+  EXPECT_EQ(errorOf("hyperGetVarData", {file(), 3, 2147483647, 2, 1, {}, {}, {}}), "no error");
+  EXPECT_THAT(calls().back(), HasSubstr("zVAR_RECNUMBER_ -1 | zVAR_RECCOUNT_ 2 | "));
+  EXPECT_EQ(errorOf("hyperGetVarData", {file(), 3, 2147483646, 2, 1, {}, {}, {}}), "no error");
+  EXPECT_THAT(calls().back(), HasSubstr("zVAR_RECNUMBER_ 2147483646 | zVAR_RECCOUNT_ 2 | "));
 }
 
 TEST_F(ReadHyperslabTest, LeadingDimensionsStayInFront) {

@@ -110,23 +110,45 @@ TEST_F(VariableSettingsTest, TheBuffersAreConvertedBeforeTheFormatIsRead) {
   EXPECT_THAT(calls(), IsEmpty());
 }
 
-TEST_F(VariableSettingsTest, WhereTheLibraryWouldDivideByZeroTheVariableIsRefused) {
-  describe({.datatype = 4, .sizes = {65536, 16384}});
-  fake.answer("CDF_FORMAT_", {2});
-  const std::pair<const char*, Arguments> commands[] = {
+/// The commands that make the library divide by the bytes of a record, by their routines.
+class DividingCommandsTest : public VariableSettingsTest {
+ protected:
+  const std::pair<const char*, Arguments> commands[6] = {
       {"CDFgetzVarReservePercent", {file(), 3}},
-      {"CDFgetzVarCacheSize", {file(), 3}},
-      {"CDFsetzVarCacheSize", {file(), 3, 1}},
       {"CDFsetzVarBlockingFactor", {file(), 3, 1}},
       {"CDFsetzVarInitialRecs", {file(), 3, 1}},
       {"CDFsetzVarReservePercent", {file(), 3, 1}},
       {"CDFdeletezVarRecords", {file(), 3, 0, 1}},
       {"CDFsetzVarAllocBlockRecords", {file(), 3, 0, 1}}};
-  for (const auto& [routine, arguments] : commands) {
+
+  static std::string commandOf(const char* routine) {
     std::string command = routine + 3;
-    command.erase(command.find('z'), 1);
-    EXPECT_EQ(errorOf(command, arguments), libraryFailure(routine, -2004));
-    EXPECT_THAT(calls().back(), kInquiry) << command;
+    return command.erase(command.find('z'), 1);
+  }
+};
+
+TEST_F(DividingCommandsTest, RecordsOfNoBytesInThirtyTwoBitsAreRefused) {
+  describe({.datatype = 4, .sizes = {65536, 16384}});
+  fake.answer("CDF_FORMAT_", {1});
+  for (const auto& [routine, arguments] : commands) {
+    EXPECT_EQ(errorOf(commandOf(routine), arguments), libraryFailure(routine, -2004));
+    EXPECT_THAT(calls(), ElementsAre(kInquiry, "SELECT_ CDF_ 7 | GET_ CDF_FORMAT_")) << routine;
+  }
+}
+
+TEST_F(DividingCommandsTest, OfAMultiFileTheyGoThrough) {
+  describe({.datatype = 4, .sizes = {65536, 16384}});
+  fake.answer("CDF_FORMAT_", {2});
+  for (const auto& [routine, arguments] : commands) {
+    EXPECT_EQ(errorOf(commandOf(routine), arguments), "no error");
+  }
+}
+
+TEST_F(DividingCommandsTest, SoDoLargeRecordsOfAnyOtherSize) {
+  describe({.datatype = 4, .sizes = {65536, 16385}});
+  fake.answer("CDF_FORMAT_", {1});
+  for (const auto& [routine, arguments] : commands) {
+    EXPECT_EQ(errorOf(commandOf(routine), arguments), "no error");
   }
 }
 

@@ -113,6 +113,14 @@ TEST_F(WriteHyperslabTest, ADamagedDescriptionIsRefusedInTheLibrarysWords) {
             libraryFailure("CDFhyperPutzVarData", -2004));
 }
 
+TEST_F(WriteHyperslabTest, CountsThatTheLibraryRefusesAreLeftToIt) {
+  describe({.datatype = 4, .sizes = {2}});
+  EXPECT_EQ(
+      errorOf("hyperPutVarData", {file(), 3, 0, -1, 1, {0}, {-2}, {1}, row<std::int32_t>({1, 2})}),
+      "no error");
+  EXPECT_THAT(calls().back(), testing::HasSubstr("zVAR_RECCOUNT_ -1 | "));
+}
+
 TEST_F(WriteHyperslabTest, ArgumentsAreConvertedInOrderUnderTheirLabels) {
   const Given x = "x", cell = Array::cell({1, 1});
   const auto error = [&](const Arguments& arguments) {
