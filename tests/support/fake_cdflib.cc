@@ -2,6 +2,8 @@
 
 #include <gtest/gtest.h>
 
+#include <cstring>
+
 namespace ambrix_test {
 
 FakeCdflib& fakeCdflib() {

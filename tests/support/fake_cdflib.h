@@ -7,7 +7,6 @@
 #pragma once
 
 #include <cstddef>
-#include <cstring>
 #include <map>
 #include <string>
 #include <vector>
@@ -28,8 +27,8 @@ class FakeCdflib {
   /// What every item or routine that gives data writes into the caller's buffer.
   template <typename T>
   void answerData(const std::vector<T>& values) {
-    data_.resize(values.size() * sizeof(T));
-    std::memcpy(data_.data(), values.data(), data_.size());
+    const auto* bytes = reinterpret_cast<const Bytes::value_type*>(values.data());
+    data_.assign(bytes, bytes + values.size() * sizeof(T));
   }
   /// The results of the epoch routines, one call each; the last one stays.
   void answerEpochs(std::vector<double> epochs) { epochs_ = std::move(epochs); }
