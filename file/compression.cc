@@ -1,5 +1,7 @@
 #include "file/compression.h"
 
+#include <cdf.h>
+
 #include "constants/checked_values.h"
 #include "gateway/arguments.h"
 #include "gateway/errors.h"
@@ -13,7 +15,7 @@ namespace {
 
 struct Compression {
   long type = 0;
-  long parameters[CDF_MAX_PARMS] = {};  // the first one only is used
+  long parameters[CDF_MAX_PARMS] = {};  // the library may fill all; the first one counts
   long percentage = 0;
 };
 

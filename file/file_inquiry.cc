@@ -1,5 +1,8 @@
 #include "file/file_inquiry.h"
 
+#include <cdf.h>
+
+#include <algorithm>
 #include <boost/assign/list_of.hpp>
 #include <map>
 #include <string>
@@ -13,6 +16,10 @@
 
 namespace TOLVEX::ambrix {
 namespace {
+
+// The library may be newer than its header here.
+constexpr int kNameLength = std::max(CDF_PATHNAME_LEN, 512);
+constexpr int kCopyrightLength = std::max(CDF_COPYRIGHT_LEN, 256);
 
 // The spellings are the module's own; 10 and the numbers above 16 have no name here.
 const std::map<double, std::string>& encodingNames() {
@@ -93,7 +100,7 @@ void getLibraryVersion(int, qvArray* outputs[], std::int32_t, const qvArray*[],
 void getName(int, qvArray* outputs[], std::int32_t, const qvArray* arguments[],
              const CommandEntry*) {
   const CdfId file = getCdfIdArg(arguments[0]);
-  char name[CDF_PATHNAME_LEN + 1] = {};
+  char name[kNameLength + 1] = {};
   callOnFile("CDFgetName", file, CONFIRM_, CDF_NAME_, name);
   outputs[0] = qvCreateString(name);
 }
@@ -101,14 +108,14 @@ void getName(int, qvArray* outputs[], std::int32_t, const qvArray* arguments[],
 void getCopyright(int, qvArray* outputs[], std::int32_t, const qvArray* arguments[],
                   const CommandEntry*) {
   const CdfId file = getCdfIdArg(arguments[0]);
-  char text[CDF_COPYRIGHT_LEN + 1] = {};
+  char text[kCopyrightLength + 1] = {};
   callOnFile("CDFgetCopyright", file, GET_, CDF_COPYRIGHT_, text);
   outputs[0] = qvCreateString(text);
 }
 
 void getLibraryCopyright(int, qvArray* outputs[], std::int32_t, const qvArray*[],
                          const CommandEntry*) {
-  char text[CDF_COPYRIGHT_LEN + 1] = {};
+  char text[kCopyrightLength + 1] = {};
   callLibrary("CDFgetLibraryCopyright", GET_, LIB_COPYRIGHT_, text);
   outputs[0] = qvCreateString(text);
 }

@@ -8,6 +8,8 @@
 #include "constants/value_names.h"
 #include "gateway/arguments.h"
 #include "gateway/families.h"
+#include "gateway/library.h"
+#include "gateway/open_file_registry.h"
 
 namespace TOLVEX::ambrix {
 
@@ -31,8 +33,8 @@ void getNamedSetting(int, qvArray* outputs[], std::int32_t, const qvArray* argum
   outputs[0] = qvCreateString(lookupValueName(*row.names, value, row.kindName).c_str());
 }
 
-/// A number that is set for a file. A `SELECT_` item follows the selection
-/// that the call begins with; the others follow a `PUT_`.
+/// A number that is set for a file: with PUT_, or as a SELECT_ item that follows the selection of
+/// the file.
 struct FileSetting {
   long operation;  // PUT_ or SELECT_
   long item;

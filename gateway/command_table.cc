@@ -1,6 +1,7 @@
 #include "gateway/command_table.h"
 
-#include <string_view>
+#include <iterator>
+#include <string>
 
 #include "attributes/attribute_counts.h"
 #include "attributes/attribute_entries.h"

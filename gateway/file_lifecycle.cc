@@ -1,5 +1,7 @@
 #include "gateway/file_lifecycle.h"
 
+#include <cdf.h>
+
 #include <string>
 
 #include "gateway/arguments.h"
@@ -17,9 +19,11 @@ void registerAndReturn(void* handle, qvArray* outputs[]) {
   outputs[0] = makeCdfIdScalar(file);
 }
 
-// The library removes what it can and then frees the file, unless it refuses to begin.
+// The library removes what it can and then frees the file, unless it refuses to begin. A warning,
+// which is a failure to users, comes from a deletion that was carried out.
 bool freesFile(long deleteStatus) {
-  return deleteStatus == CDF_DELETE_ERROR || deleteStatus == VAR_DELETE_ERROR ||
+  const bool warning = deleteStatus < CDF_OK && deleteStatus > CDF_WARN;
+  return warning || deleteStatus == CDF_DELETE_ERROR || deleteStatus == VAR_DELETE_ERROR ||
          deleteStatus == SCRATCH_DELETE_ERROR;
 }
 
@@ -70,7 +74,8 @@ void closeAllOnUnload() {
   qvWarningMsgId(cdflib::closingFileHandle());
   for (const CdfId file : registry.files()) {
     if (registry.isFreed(file)) continue;
-    CDFlib(SELECT_, CDF_, libraryHandle(file, ""), CLOSE_, CDF_, NULL_);
+    CDFlib(SELECT_, CDF_, libraryHandle(file, "CDFcloseCDF"), CLOSE_, CDF_, NULL_);
+    registry.markFreed(file);  // it stays registered, should the host call again
   }
 }
 

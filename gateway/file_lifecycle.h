@@ -18,11 +18,11 @@ void openFile(int, qvArray* outputs[], std::int32_t, const qvArray* arguments[],
               const CommandEntry*);
 
 /// "close" (identifier). Raises `libraryFailure` ("CDFcloseCDF"); the identifier then stays
-/// registered.
+/// registered, but every command on it fails until the library hands it out anew.
 void closeFile(int, qvArray*[], std::int32_t, const qvArray* arguments[], const CommandEntry*);
 
 /// "delete" (identifier): removes the file from disk. Raises `libraryFailure` ("CDFdelete"); the
-/// identifier then stays registered.
+/// identifier then stays registered, usable if the library refused to begin.
 void deleteFile(int, qvArray*[], std::int32_t, const qvArray* arguments[], const CommandEntry*);
 
 /// The unload handler: one warning if any file is open, then closes every one, ignoring failures.

@@ -39,9 +39,9 @@ bool isRowMajor(CdfId file) {
   return majority == ROW_MAJOR;
 }
 
-bool isSingleFile(CdfId file) {
+bool isSingleFile(CdfId file, const char* routine) {
   long format = 0;
-  callOnFile("CDFgetFormat", file, GET_, CDF_FORMAT_, &format);
+  callOnFile(routine, file, GET_, CDF_FORMAT_, &format);
   return format == SINGLE_FILE;
 }
 

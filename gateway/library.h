@@ -68,6 +68,7 @@ inline constexpr int kZVariables = 1;
 /// `ROW_MAJOR` files hold their last dimension fastest, the host its first.
 bool isRowMajor(CdfId file);
 
-bool isSingleFile(CdfId file);
+/// Whether variables have no files of their own.
+bool isSingleFile(CdfId file, const char* routine);
 
 }  // namespace TOLVEX::ambrix

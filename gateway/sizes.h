@@ -29,8 +29,8 @@ constexpr long productOf(std::span<const long> factors) {
   return product;
 }
 
-/// A number of bytes or elements: no factor may be negative to any purpose, so a negative product
-/// counts as none, and one too large to count as the largest.
+/// The product as a number of bytes or elements: none if it is negative, and the largest long if it
+/// is too large to count.
 constexpr std::size_t saturatedProduct(std::initializer_list<long> factors) {
   const long product = productOf({factors.begin(), factors.size()});
   return product < 0 ? 0 : static_cast<std::size_t>(product);

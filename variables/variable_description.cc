@@ -67,7 +67,7 @@ void requireDivisibleRecord(CdfId file, const VariableDescription& variable, con
   for (std::size_t i = 0; i < variable.sizes().size(); ++i) {
     if (variable.variances()[i] != NOVARY) bytes *= static_cast<std::uint32_t>(variable.sizes()[i]);
   }
-  if (bytes == 0 && isSingleFile(file)) raiseLibraryFailure(BAD_DIM_SIZE, routine);
+  if (bytes == 0 && isSingleFile(file, routine)) raiseLibraryFailure(BAD_DIM_SIZE, routine);
 }
 
 void requireRoom(const VariableDescription& variable, long values, std::size_t bytes,

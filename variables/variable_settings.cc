@@ -8,7 +8,7 @@ namespace TOLVEX::ambrix {
 namespace {
 
 void requireMultiFile(CdfId file) {
-  if (isSingleFile(file)) raiseError(cdflib::varCacheSizeOpInappropriate());
+  if (isSingleFile(file, "CDFgetFormat")) raiseError(cdflib::varCacheSizeOpInappropriate());
 }
 
 }  // namespace

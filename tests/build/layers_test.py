@@ -19,8 +19,8 @@ MAY_SEE = {
     "constants": {"host", "gateway", "constants"},
     "variables": {"host", "gateway", "constants", "variables"},
     "attributes": {"host", "gateway", "constants", "variables", "attributes"},
-    "file": {"host", "gateway", "constants", "variables", "file"},
-    "epoch": {"host", "gateway", "constants", "epoch"},
+    "file": {"host", "gateway", "constants", "file"},
+    "epoch": {"host", "gateway", "epoch"},
 }
 
 
