@@ -41,9 +41,9 @@ TEST_F(AttributesTest, NamesAreTheLibrarysToJudge) {
   EXPECT_EQ(does("createAttr", {file, "caf\xE9", 1}), refused("CDFcreateAttr", kBadAttrName));
   EXPECT_EQ(does("renameAttr", {file, 1, "G"}), refused("CDFrenameAttr", kAttrExists));
   EXPECT_EQ(does("renameAttr", {file, 1, "a\nb"}), refused("CDFrenameAttr", kBadAttrName));
-  const std::string longest(256, 'n');
+  const std::string longest(255, 'n');
   EXPECT_EQ(does("createAttr", {file, longest.c_str(), 1}), "double 1x1 [2]");
-  EXPECT_EQ(does("getAttrName", {file, 2}), "char 1x256 '" + longest + "'");
+  EXPECT_EQ(does("getAttrName", {file, 2}), "char 1x255 '" + longest + "'");
   EXPECT_EQ(does("createAttr", {file, (std::string(300, 'm')).c_str(), 1}),
             refused("CDFcreateAttr", kAttrNameTrunc));
 }
