@@ -35,6 +35,8 @@ target_compile_options(ambrix_options INTERFACE
   -Wdouble-promotion -Wimplicit-fallthrough -Wextra-semi
   $<$<CXX_COMPILER_ID:GNU>:-Wduplicated-cond -Wduplicated-branches -Wlogical-op
     -Wsuggest-override -Wshadow=local>
+  # Before GCC 13 it finds fault with the standard library's own operator+ of strings.
+  $<$<AND:$<CXX_COMPILER_ID:GNU>,$<VERSION_LESS:$<CXX_COMPILER_VERSION>,13>>:-Wno-restrict>
   $<$<CXX_COMPILER_ID:Clang,AppleClang>:-Wshadow>)
 if(AMBRIX_WERROR)
   target_compile_options(ambrix_options INTERFACE -Werror)
