@@ -103,4 +103,11 @@ std::set<TOLVEX::ambrix::CdfId> openFiles() {
   return TOLVEX::ambrix::openFileRegistry().files();
 }
 
+std::vector<std::string> shown(const std::vector<Array>& arrays) {
+  std::vector<std::string> texts;
+  for (const Array& array : arrays)
+    texts.push_back(shown(array));
+  return texts;
+}
+
 }  // namespace ambrix_test

@@ -13,6 +13,7 @@
 #include "tests/support/fake_cdflib.h"
 #include "tests/support/given.h"
 #include "tests/support/message_text.h"
+#include "tests/support/shown_array.h"
 
 namespace ambrix_test {
 
@@ -60,8 +61,6 @@ inline const std::string kMajority = "SELECT_ CDF_ 7 | GET_ CDF_MAJORITY_";
 /// The files that the module holds open.
 std::set<TOLVEX::ambrix::CdfId> openFiles();
 
-// What an array is, in one comparison: "double 1x2 [3 4.5]", "char 1x3 'abc'", "logical 1x1 [1]".
-std::string shown(ArrayView array);
 std::vector<std::string> shown(const std::vector<Array>& arrays);
 
 }  // namespace ambrix_test

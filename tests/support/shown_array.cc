@@ -1,12 +1,17 @@
-#include <sstream>
+#include "tests/support/shown_array.h"
 
-#include "tests/support/scripted_test.h"
+#include <cstdint>
+#include <iomanip>
+#include <sstream>
 
 namespace ambrix_test {
 namespace {
 
+using ambrix::ArrayView;
+using ambrix::ClassId;
+
 template <typename T>
-void write(std::ostream& out, ArrayView array) {
+void writeNumbers(std::ostream& out, ArrayView array) {
   const char* separator = "";
   out << '[';
   for (const T value : array.data<T>()) {
@@ -29,30 +34,39 @@ void writeText(std::ostream& out, ArrayView array) {
   out << '\'';
 }
 
+void writeCells(std::ostream& out, ArrayView array) {
+  out << '{';
+  for (std::size_t i = 0; i < array.elementCount(); ++i)
+    out << (i > 0 ? ", " : "") << shown(array.element(i));
+  out << '}';
+}
+
 void writeElements(std::ostream& out, ArrayView array) {
   switch (array.classId()) {
     case ClassId::kDouble:
-      return write<double>(out, array);
+      return writeNumbers<double>(out << std::setprecision(17), array);
     case ClassId::kSingle:
-      return write<float>(out, array);
+      return writeNumbers<float>(out << std::setprecision(9), array);
     case ClassId::kInt8:
-      return write<std::int8_t>(out, array);
+      return writeNumbers<std::int8_t>(out, array);
     case ClassId::kUint8:
-      return write<std::uint8_t>(out, array);
+      return writeNumbers<std::uint8_t>(out, array);
     case ClassId::kInt16:
-      return write<std::int16_t>(out, array);
+      return writeNumbers<std::int16_t>(out, array);
     case ClassId::kUint16:
-      return write<std::uint16_t>(out, array);
+      return writeNumbers<std::uint16_t>(out, array);
     case ClassId::kInt32:
-      return write<std::int32_t>(out, array);
+      return writeNumbers<std::int32_t>(out, array);
     case ClassId::kUint32:
-      return write<std::uint32_t>(out, array);
+      return writeNumbers<std::uint32_t>(out, array);
     case ClassId::kUint64:
-      return write<std::uint64_t>(out, array);
+      return writeNumbers<std::uint64_t>(out, array);
     case ClassId::kLogical:
-      return write<bool>(out, array);
+      return writeNumbers<bool>(out, array);
     case ClassId::kChar:
       return writeText(out, array);
+    case ClassId::kCell:
+      return writeCells(out, array);
     default:
       out << '?';
   }
@@ -72,13 +86,6 @@ std::string shown(ArrayView array) {
   out << ' ';
   writeElements(out, array);
   return out.str();
-}
-
-std::vector<std::string> shown(const std::vector<Array>& arrays) {
-  std::vector<std::string> texts;
-  for (const Array& array : arrays)
-    texts.push_back(shown(array));
-  return texts;
 }
 
 }  // namespace ambrix_test

@@ -164,4 +164,11 @@ LibraryDifferences ModuleTest::library() {
   return LibraryDifferences(version);
 }
 
+std::string shown(const std::vector<Array>& arrays) {
+  std::string text;
+  for (const Array& array : arrays)
+    text += (text.empty() ? "" : "; ") + shown(array);
+  return text;
+}
+
 }  // namespace ambrix_test

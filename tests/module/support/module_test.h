@@ -12,6 +12,7 @@
 #include "tests/module/support/status_texts.h"
 #include "tests/support/given.h"
 #include "tests/support/message_text.h"
+#include "tests/support/shown_array.h"
 
 namespace ambrix_test {
 
@@ -71,8 +72,7 @@ class ModuleTest : public testing::Test {
   std::string previousFolder_;
 };
 
-/// An array in one text: "double 1x2 [3 4.5]", "char 1x3 'abc'", "cell 2x1 {...}".
-std::string shown(ArrayView array);
+/// All of them, separated by "; ".
 std::string shown(const std::vector<Array>& arrays);
 
 /// A failure of the library, with the text of its status.
