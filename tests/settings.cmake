@@ -1,6 +1,10 @@
 # What the tests named in `tests` run under: no setting that the CDF library takes from the
 # environment, and what the sanitizers need to know about that library.
 if(tests)
+  set(seconds 120)
+  if(AMBRIX_SANITIZE)
+    set(seconds 600)  # known for programs that read many files; single cases are quick anyhow
+  endif()
   set(supp "${CMAKE_CURRENT_LIST_DIR}/sanitizers")
   set(environment
     "ASAN_OPTIONS=suppressions=${supp}/asan.supp:detect_stack_use_after_return=1"
@@ -11,5 +15,5 @@ if(tests)
   set_tests_properties(${tests} PROPERTIES
     ENVIRONMENT "${environment}"
     ENVIRONMENT_MODIFICATION "${unset}"
-    TIMEOUT 120)
+    TIMEOUT ${seconds})
 endif()

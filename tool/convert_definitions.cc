@@ -1,4 +1,5 @@
 // Settings of the file and definitions of its variables.
+#include <CLI/StringTools.hpp>
 #include <algorithm>
 #include <array>
 #include <cctype>
@@ -27,10 +28,10 @@ struct CompressionChoice {
   std::optional<double> level;  // of gzip
 };
 
-/// "gzip:6", "gzip", "rle", ...
+/// "gzip:6", "GZIP", "rle", ...
 CompressionChoice parseCompression(const std::string& text) {
   const std::size_t colon = std::min(text.find(':'), text.size());
-  const std::string name = text.substr(0, colon);
+  const std::string name = CLI::detail::to_lower(text.substr(0, colon));
   const auto known = std::ranges::find(kCompressions, name, &NamedConstant::name);
   if (known == kCompressions.end()) {
     throw UsageError("--compression: expected none, rle, huff, ahuff or gzip:LEVEL");

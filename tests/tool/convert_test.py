@@ -65,7 +65,7 @@ class CopyTest(ConvertCase):
 
     def test_compression(self):
         for option, kind, parameter in (
-                ("gzip", "GZIP_COMPRESSION", "6"), ("gzip:1", "GZIP_COMPRESSION", "1"),
+                ("gzip", "GZIP_COMPRESSION", "6"), ("GZIP:1", "GZIP_COMPRESSION", "1"),
                 ("rle", "RLE_COMPRESSION", "RLE_OF_ZEROS"),
                 ("huff", "HUFF_COMPRESSION", "OPTIMAL_ENCODING_TREES"),
                 ("ahuff", "AHUFF_COMPRESSION", "OPTIMAL_ENCODING_TREES"),
