@@ -7,7 +7,7 @@ if(tests)
   endif()
   set(supp "${CMAKE_CURRENT_LIST_DIR}/sanitizers")
   set(environment
-    "ASAN_OPTIONS=suppressions=${supp}/asan.supp:detect_stack_use_after_return=1"
+    "ASAN_OPTIONS=suppressions=${supp}/asan.supp:detect_stack_use_after_return=1${asan_options}"
     "UBSAN_OPTIONS=print_stacktrace=1"
     "PYTHONDONTWRITEBYTECODE=1")
   set(unset CDF_VALIDATE=unset: CDF_CHECKSUM=unset: CDF_FILEBACKWARD=unset: CDF_TMP=unset:
