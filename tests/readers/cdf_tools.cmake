@@ -2,17 +2,18 @@
 # a build with -DAMBRIX_CDF=source, or fetched with -DAMBRIX_CDF_TOOLS=ON. They are linked with
 # CDF 3.6.3 whatever library the module uses.
 #
-# Sets cdf_tools_folder to where they will be, or to nothing.
+# Sets cdf_tools_folder to where they will be, or to nothing: also in builds with sanitizers, which would
+# only find what is not ours.
 
 option(AMBRIX_CDF_TOOLS "Fetch the sources of the CDF distribution's tools for the tests" OFF)
 
 set(cdf_tools_folder "")
 set(cdf_tools_source "${AMBRIX_CDF_CACHE}/cdf-3.6.3-source")
-if(AMBRIX_CDF_TOOLS AND NOT EXISTS "${cdf_tools_source}")
+if(AMBRIX_CDF_TOOLS AND NOT AMBRIX_SANITIZE AND NOT EXISTS "${cdf_tools_source}")
   include(CdfProvision)
   cdf_fetch(source cdf-3.6.3-source)
 endif()
-if(NOT EXISTS "${cdf_tools_source}/src/tools")
+if(AMBRIX_SANITIZE OR NOT EXISTS "${cdf_tools_source}/src/tools")
   return()
 endif()
 
