@@ -30,7 +30,9 @@ void* libraryHandle(CdfId file, const char* routine);
 CdfId cdfIdOf(void* handle);
 
 // The library reads numbers as long and keeps only 32 bits of them: 2^32 would address variable 0.
-// A number that does not fit is replaced by one of its kind that the library itself refuses.
+// A number that does not fit is replaced by one of its kind that the library itself refuses: a
+// large one for what exists or not (a variable, an attribute), a negative one for entries, records,
+// counts and amounts.
 inline constexpr long kNoSuchNumber = std::numeric_limits<std::int32_t>::max();
 inline constexpr long kBadNumber = -1;
 

@@ -61,8 +61,9 @@ void validateDatatype(long code) {
 }
 
 qvClassID classIdForDatatype(long code) {
-  validateDatatype(code);
-  return findDatatype(code)->classId;
+  const Datatype* datatype = findDatatype(code);
+  if (datatype == nullptr) raiseUnrecognized(code);
+  return datatype->classId;
 }
 
 long datatypeSize(long code) {
@@ -98,10 +99,11 @@ qvArray* createArrayFromBuffer(const ValueBuffer& buffer, long code) {
     return qvCreateString(reinterpret_cast<const char*>(buffer.data()));
   }
   const qvClassID classId = classIdForDatatype(code);
-  const std::size_t values = buffer.size() / static_cast<std::size_t>(datatypeSize(code));
+  const auto valueSize = static_cast<std::size_t>(datatypeSize(code));
+  const std::size_t values = buffer.size() / valueSize;
   const std::size_t sizes[] = {code == CDF_EPOCH16 ? 2UL : 1UL, values};
   qvArray* array = qvCreateUninitNumericArray(2, sizes, classId, qvREAL);
-  const std::size_t bytes = values * static_cast<std::size_t>(datatypeSize(code));
+  const std::size_t bytes = values * valueSize;
   if (bytes > 0) std::memcpy(qvGetData(array), buffer.data(), bytes);
   return array;
 }

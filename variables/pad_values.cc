@@ -23,7 +23,7 @@ void getVarPadValue(int, qvArray* outputs[], std::int32_t, const qvArray* argume
   const VariableDescription variable = inquireVariable(file, number);
   const HostDimensions dimensions = valueDimensions(variable);
   validateDatatype(variable.datatype);
-  if (variable.elements < 1) raiseLibraryFailure(BAD_NUM_ELEMS, routine);
+  requireElements(variable, routine);
   // More room than one value needs, and never less whatever sizes a damaged file gives.
   const long bufferBytes = std::max(variable.elementsPerRecord(), variable.elements);
   // Of a text that has no pad value in its file the library writes the first character only.
@@ -46,7 +46,7 @@ void setVarPadValue(int, qvArray*[], std::int32_t, const qvArray* arguments[],
   if (!hasElements(value, expected)) {
     raiseError(cdflib::wrongNumberOfPadValueElements(variable.name, expected));
   }
-  if (variable.elements < 1) raiseLibraryFailure(BAD_NUM_ELEMS, routine);
+  requireElements(variable, routine);
   requireDivisibleRecord(file, variable, routine);
   requireRoom(variable, 1, bytesOfArray(value, variable.datatype), routine);
   const LibraryData data(value);

@@ -50,9 +50,9 @@ void getVarData(int, qvArray* outputs[], std::int32_t argumentCount, const qvArr
   requireUsableRecord(variable, routine);
   DimensionVector libraryIndices = libraryVector(indices, kBadNumber);
   outputs[0] = readValues(variable, dimensions, request, [&](void* buffer) {
-    callOnVariable(routine, file, number,  //
-                   zVAR_RECNUMBER_, libraryNumber(record, kBadNumber), zVAR_DIMINDICES_,
-                   libraryIndices.data(),  //
+    callOnVariable(routine, file, number,                               //
+                   zVAR_RECNUMBER_, libraryNumber(record, kBadNumber),  //
+                   zVAR_DIMINDICES_, libraryIndices.data(),             //
                    GET_, zVAR_DATA_, buffer);
   });
 }
@@ -70,8 +70,7 @@ void getVarRecordData(int, qvArray* outputs[], std::int32_t, const qvArray* argu
                             variable.allDimensionsVary()};
   requireUsableRecord(variable, routine);
   outputs[0] = readValues(variable, dimensions, request, [&](void* buffer) {
-    // The routine would abort all access to the file.
-    if (record < 0 || !fitsLibrary(record)) raiseLibraryFailure(BAD_REC_NUM, routine);
+    requireRecordNumber(record, routine);
     checkLibraryStatus(
         CDFgetVarRecordData(libraryHandle(file, routine), kZVariables, number, record, buffer),
         routine);

@@ -50,8 +50,16 @@ VariableDescription inquireVariable(CdfId file, long variable, const char* routi
   return found;
 }
 
-void requireUsableRecord(const VariableDescription& variable, const char* routine) {
+void requireRecordNumber(long record, const char* routine) {
+  if (record < 0 || !fitsLibrary(record)) raiseLibraryFailure(BAD_REC_NUM, routine);
+}
+
+void requireElements(const VariableDescription& variable, const char* routine) {
   if (variable.elements < 1) raiseLibraryFailure(BAD_NUM_ELEMS, routine);
+}
+
+void requireUsableRecord(const VariableDescription& variable, const char* routine) {
+  requireElements(variable, routine);
   if (std::ranges::any_of(variable.sizes(), [](long size) { return size < 1; })) {
     raiseLibraryFailure(BAD_DIM_SIZE, routine);
   }

@@ -39,6 +39,13 @@ struct VariableDescription {
 VariableDescription inquireVariable(CdfId file, long variable,
                                     const char* routine = "CDFinquirezVar");
 
+/// Refuses, as the library's bad record number, a record that its routines for whole records must
+/// not see: they would abort all access to the file, or leave a file that cannot be opened.
+void requireRecordNumber(long record, const char* routine);
+
+/// Refuses, as the library's bad number of elements, values of no elements.
+void requireElements(const VariableDescription& variable, const char* routine);
+
 /// The library counts the bytes of a record in 32 bits: refuses, as its bad dimension size or bad
 /// number of elements, descriptions that only a damaged file or a variable too large to store has.
 /// Readers and writers call this after all their other checks.

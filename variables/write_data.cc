@@ -71,9 +71,9 @@ void putVarData(int, qvArray*[], std::int32_t, const qvArray* arguments[], const
   // hyperslabs.
   const LibraryData value = LibraryData::firstCharacterOf(data);
   DimensionVector libraryIndices = libraryVector(indices, kBadNumber);
-  callOnVariable(routine, file, number,  //
-                 zVAR_RECNUMBER_, libraryNumber(record, kBadNumber), zVAR_DIMINDICES_,
-                 libraryIndices.data(),  //
+  callOnVariable(routine, file, number,                               //
+                 zVAR_RECNUMBER_, libraryNumber(record, kBadNumber),  //
+                 zVAR_DIMINDICES_, libraryIndices.data(),             //
                  PUT_, zVAR_DATA_, value.bytes());
 }
 
@@ -92,8 +92,7 @@ void putVarRecordData(int, qvArray*[], std::int32_t, const qvArray* arguments[],
   requireClassOfDatatype(data, variable.datatype);
   requireUsableRecord(variable, routine);
   requireRoom(variable, variable.valuesPerRecord(), bytesOfArray(data, variable.datatype), routine);
-  // The routine would abort all access to the file, or leave a file that cannot be opened.
-  if (record < 0 || !fitsLibrary(record)) raiseLibraryFailure(BAD_REC_NUM, routine);
+  requireRecordNumber(record, routine);
   const LibraryData values(data);
   checkLibraryStatus(CDFputVarRecordData(libraryHandle(file, routine), kZVariables, number, record,
                                          values.bytes()),
