@@ -2,6 +2,7 @@
 
 #include <cdf.h>
 
+#include <cstdint>
 #include <string>
 
 #include "gateway/arguments.h"
@@ -13,10 +14,24 @@
 namespace TOLVEX::ambrix {
 namespace {
 
-void registerAndReturn(void* handle, qvArray* outputs[]) {
+// The library cuts a longer path, creates or opens the file of the shorter one and then reports a
+// failure, which would leave a file open that nobody can close.
+bool fitsPath(const std::string& name) {
+  return name.size() <= CDF_PATHNAME_LEN;
+}
+
+/// Takes all memory that registering a file needs: once the library has opened one, nothing may
+/// keep its identifier from the user.
+qvArray* prepareIdentifier() {
+  openFileRegistry().reserve();
+  return makeCdfIdScalar(CdfId{});
+}
+
+void registerAndReturn(void* handle, qvArray* identifier, qvArray* outputs[]) {
   const CdfId file = cdfIdOf(handle);
   openFileRegistry().insert(file);
-  outputs[0] = makeCdfIdScalar(file);
+  *static_cast<std::uint64_t*>(qvGetData(identifier)) = static_cast<std::uint64_t>(file);
+  outputs[0] = identifier;
 }
 
 // The library removes what it can and then frees the file, unless it refuses to begin. A warning,
@@ -27,23 +42,44 @@ bool freesFile(long deleteStatus) {
          deleteStatus == SCRATCH_DELETE_ERROR;
 }
 
+/// In its destructor, so that the files are closed even if the host makes an error of the warning
+/// that comes first.
+struct ClosesAllFiles {
+  ClosesAllFiles() = default;
+  ClosesAllFiles(const ClosesAllFiles&) = delete;
+  ClosesAllFiles& operator=(const ClosesAllFiles&) = delete;
+
+  ~ClosesAllFiles() {
+    OpenFileRegistry& registry = openFileRegistry();
+    for (const CdfId file : registry.files()) {
+      if (registry.isFreed(file)) continue;
+      CDFlib(SELECT_, CDF_, libraryHandle(file, "CDFcloseCDF"), CLOSE_, CDF_, NULL_);
+      registry.markFreed(file);  // it stays registered, should the host call again
+    }
+  }
+};
+
 }  // namespace
 
 void createFile(int, qvArray* outputs[], std::int32_t, const qvArray* arguments[],
                 const CommandEntry*) {
   std::string name = getFilenameArg(arguments[0]);
+  if (!fitsPath(name)) raiseError(cdflib::fileCreateError());
+  qvArray* identifier = prepareIdentifier();
   CDFid handle = nullptr;
   if (CDFcreateCDF(name.data(), &handle) < 0) raiseError(cdflib::fileCreateError());
-  registerAndReturn(handle, outputs);
+  registerAndReturn(handle, identifier, outputs);
 }
 
 void openFile(int, qvArray* outputs[], std::int32_t, const qvArray* arguments[],
               const CommandEntry*) {
   const std::string name = getFilenameArg(arguments[0]);
+  if (!fitsPath(name)) raiseError(cdflib::fileOpenError());
+  qvArray* identifier = prepareIdentifier();
   CDFid handle = nullptr;
   if (CDFlib(OPEN_, CDF_, name.c_str(), &handle, NULL_) < 0) raiseError(cdflib::fileOpenError());
   callLibrary("CDFsetzMode", SELECT_, CDF_, handle, CDF_zMODE_, zMODEon2);
-  registerAndReturn(handle, outputs);
+  registerAndReturn(handle, identifier, outputs);
 }
 
 void closeFile(int, qvArray*[], std::int32_t, const qvArray* arguments[], const CommandEntry*) {
@@ -69,14 +105,9 @@ void deleteFile(int, qvArray*[], std::int32_t, const qvArray* arguments[], const
 }
 
 void closeAllOnUnload() {
-  OpenFileRegistry& registry = openFileRegistry();
-  if (registry.size() == 0) return;
+  if (openFileRegistry().size() == 0) return;
+  const ClosesAllFiles closing;
   qvWarningMsgId(cdflib::closingFileHandle());
-  for (const CdfId file : registry.files()) {
-    if (registry.isFreed(file)) continue;
-    CDFlib(SELECT_, CDF_, libraryHandle(file, "CDFcloseCDF"), CLOSE_, CDF_, NULL_);
-    registry.markFreed(file);  // it stays registered, should the host call again
-  }
 }
 
 }  // namespace TOLVEX::ambrix

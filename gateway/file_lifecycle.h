@@ -8,7 +8,8 @@
 namespace TOLVEX::ambrix {
 
 /// "create" (file name): a new CDF with the library's defaults (`CDFcreateCDF`). Output: its
-/// identifier, 1-by-1 uint64. Raises `fileCreateError`, `invalidCharError`.
+/// identifier, 1-by-1 uint64. Raises `fileCreateError`, also for a path too long for the library,
+/// and `invalidCharError`.
 void createFile(int, qvArray* outputs[], std::int32_t, const qvArray* arguments[],
                 const CommandEntry*);
 

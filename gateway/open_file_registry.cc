@@ -10,16 +10,31 @@ namespace {
 
 OpenFileRegistry registry;
 
+void insertInto(std::vector<CdfId>& files, CdfId file) {
+  const auto place = std::ranges::lower_bound(files, file);
+  if (place == files.end() || *place != file) files.insert(place, file);
+}
+
 }  // namespace
 
+void OpenFileRegistry::reserve() {
+  if (open_.size() == open_.capacity()) open_.reserve(2 * open_.size() + 1);
+  freed_.reserve(open_.capacity());  // so that a file can be marked at any time
+}
+
 void OpenFileRegistry::insert(CdfId file) {
-  open_.insert(file);
-  freed_.erase(file);
+  reserve();
+  insertInto(open_, file);
+  std::erase(freed_, file);
 }
 
 void OpenFileRegistry::erase(CdfId file) {
-  open_.erase(file);
-  freed_.erase(file);
+  std::erase(open_, file);
+  std::erase(freed_, file);
+}
+
+void OpenFileRegistry::markFreed(CdfId file) {
+  if (contains(file)) insertInto(freed_, file);
 }
 
 OpenFileRegistry& openFileRegistry() {

@@ -1,8 +1,9 @@
 // The identifiers of the files that the module has opened or created and not yet closed or deleted.
 #pragma once
 
+#include <algorithm>
 #include <cstddef>
-#include <set>
+#include <vector>
 
 #include "gateway/cdf_id.h"
 #include "host/qv.h"
@@ -12,21 +13,27 @@ namespace TOLVEX::ambrix {
 /// A plain set, not synchronised: the host calls from one thread at a time.
 class OpenFileRegistry {
  public:
+  /// Makes room for one more file, so that the next `insert` takes no memory.
+  void reserve();
   /// Registers an identifier that the library has just handed out, which makes it usable (again).
   void insert(CdfId file);
   void erase(CdfId file);
-  [[nodiscard]] bool contains(CdfId file) const { return open_.contains(file); }
+  [[nodiscard]] bool contains(CdfId file) const { return std::ranges::binary_search(open_, file); }
   [[nodiscard]] std::size_t size() const { return open_.size(); }
 
-  /// Notes that the library has freed the file although the identifier stays registered.
-  void markFreed(CdfId file) { freed_.insert(file); }
-  [[nodiscard]] bool isFreed(CdfId file) const { return !freed_.empty() && freed_.contains(file); }
+  /// Notes that the library has freed a registered file although its identifier stays. Takes no
+  /// memory.
+  void markFreed(CdfId file);
+  [[nodiscard]] bool isFreed(CdfId file) const {
+    return !freed_.empty() && std::ranges::binary_search(freed_, file);
+  }
 
-  [[nodiscard]] const std::set<CdfId>& files() const { return open_; }
+  /// In ascending order.
+  [[nodiscard]] const std::vector<CdfId>& files() const { return open_; }
 
  private:
-  std::set<CdfId> open_;
-  std::set<CdfId> freed_;  // a part of open_ that must not reach the library
+  std::vector<CdfId> open_;
+  std::vector<CdfId> freed_;  // a part of open_ that must not reach the library
 };
 
 OpenFileRegistry& openFileRegistry();

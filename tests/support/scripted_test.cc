@@ -100,7 +100,8 @@ void ScriptedTest::describe(const Variable& variable) {
 }
 
 std::set<TOLVEX::ambrix::CdfId> openFiles() {
-  return TOLVEX::ambrix::openFileRegistry().files();
+  const auto& files = TOLVEX::ambrix::openFileRegistry().files();
+  return {files.begin(), files.end()};
 }
 
 std::vector<std::string> shown(const std::vector<Array>& arrays) {

@@ -44,6 +44,18 @@ TEST_F(FileLifecycleTest, NamesThatDoNotConvertAreRefusedBeforeTheLibrary) {
   EXPECT_THAT(calls(), IsEmpty());
 }
 
+// The library would create or open the file of the shorter path and report a failure.
+TEST_F(FileLifecycleTest, PathsThatTheLibraryWouldCutAreRefusedBeforeIt) {
+  const std::string longest(512, 'p');
+  EXPECT_THAT(call("create", {longest.c_str()}), SizeIs(1));
+  EXPECT_THAT(call("open", {longest.c_str()}), SizeIs(1));
+  fake.forgetCalls();
+  const std::string tooLong = longest + ' ';  // blanks at the end count, too
+  EXPECT_EQ(errorOf("create", {tooLong.c_str()}), cdflib("fileCreateError"));
+  EXPECT_EQ(errorOf("open", {tooLong.c_str()}), cdflib("fileOpenError"));
+  EXPECT_THAT(calls(), IsEmpty());
+}
+
 TEST_F(FileLifecycleTest, ARefusedFileHasNoLibraryText) {
   fake.failCall(1, -2013);
   EXPECT_EQ(errorOf("create", {"exists.cdf"}), cdflib("fileCreateError"));

@@ -52,6 +52,13 @@ TEST_F(OpenFileRegistryTest, AFreedFileStaysRegisteredUntilItsIdentifierIsHanded
   EXPECT_FALSE(registry.isFreed(kFive));
 }
 
+TEST_F(OpenFileRegistryTest, OnlyRegisteredFilesAreMarkedAsFreed) {
+  OpenFileRegistry registry;
+  registry.markFreed(kFive);
+  registry.insert(kFive);
+  EXPECT_FALSE(registry.isFreed(kFive));
+}
+
 TEST_F(OpenFileRegistryTest, AnIdentifierIsOneUint64) {
   const Given others[] = {5,
                           {},

@@ -1,4 +1,7 @@
 // What is left open when the module goes.
+#include <stdexcept>
+
+#include "gateway/file_lifecycle.h"
 #include "tests/support/scripted_test.h"
 
 namespace ambrix_test {
@@ -40,6 +43,17 @@ TEST_F(UnloadTest, AFileThatFailsToCloseDoesNotKeepTheOthersOpen) {
   EXPECT_THAT(calls(), ElementsAre("SELECT_ CDF_ 7 | CLOSE_ CDF_", "SELECT_ CDF_ 8 | CLOSE_ CDF_"));
   EXPECT_THAT(fake.statusCalls(), IsEmpty());
   EXPECT_THAT(warnings(), ElementsAre(cdflib("closingFileHandle")));
+}
+
+// In a host that lets errors out of warnings while it unloads; the embedded one does not.
+TEST_F(UnloadTest, AWarningThatBecomesAnErrorDoesNotKeepFilesOpen) {
+  ::ambrix::Module unloading(
+      [](int, qvArray*[], int, const qvArray*[]) { TOLVEX::ambrix::closeAllOnUnload(); });
+  unloading.setWarningHandler(
+      [](const ::ambrix::MessageId&) { throw std::runtime_error("no warnings, please"); });
+  EXPECT_THROW(unloading.call("unload"), std::runtime_error);
+  EXPECT_THAT(calls(), ElementsAre("SELECT_ CDF_ 7 | CLOSE_ CDF_"));
+  EXPECT_EQ(errorOf("getFormat", {file()}), libraryFailure("CDFgetFormat", -2002));
 }
 
 TEST_F(UnloadTest, TheRegistryIsNotEmptied) {
