@@ -91,6 +91,8 @@ constexpr MessageText kTexts[] = {
      "An array can't have a negative size: see that every count asked for is 0 or more."},
     {"TOLVEX:host:outOfMemory",
      "There is not enough memory: ask for less at a time, or raise the limit on array sizes."},
+    {"TOLVEX:host:unexpectedFailure",
+     "The command failed in an unforeseen way ({1}): see that its name and file names are texts."},
 };
 
 bool isFor(const MessageText& entry, std::string_view component, std::string_view identifier) {
