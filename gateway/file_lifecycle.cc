@@ -1,6 +1,7 @@
 #include "gateway/file_lifecycle.h"
 
 #include <cdf.h>
+#include <unistd.h>
 
 #include <cstdint>
 #include <string>
@@ -42,22 +43,37 @@ bool freesFile(long deleteStatus) {
          deleteStatus == SCRATCH_DELETE_ERROR;
 }
 
-/// In its destructor, so that the files are closed even if the host makes an error of the warning
-/// that comes first.
-struct ClosesAllFiles {
-  ClosesAllFiles() = default;
-  ClosesAllFiles(const ClosesAllFiles&) = delete;
-  ClosesAllFiles& operator=(const ClosesAllFiles&) = delete;
-
-  ~ClosesAllFiles() {
-    OpenFileRegistry& registry = openFileRegistry();
-    for (const CdfId file : registry.files()) {
-      if (registry.isFreed(file)) continue;
-      CDFlib(SELECT_, CDF_, libraryHandle(file, "CDFcloseCDF"), CLOSE_, CDF_, NULL_);
-      registry.markFreed(file);  // it stays registered, should the host call again
-    }
+void closeAll() {
+  OpenFileRegistry& registry = openFileRegistry();
+  for (const CdfId file : registry.files()) {
+    if (registry.isFreed(file)) continue;
+    CDFlib(SELECT_, CDF_, libraryHandle(file, "CDFcloseCDF"), CLOSE_, CDF_, NULL_);
+    registry.markFreed(file);  // it stays registered, should the host call again
   }
+}
+
+/// At its end all files are closed, however that comes.
+struct ClosingAll {
+  ClosingAll() = default;
+  ClosingAll(const ClosingAll&) = delete;
+  ClosingAll& operator=(const ClosingAll&) = delete;
+  ~ClosingAll() { closeAll(); }
 };
+
+/// For a process that ends without unloading the module: what was written and not closed would be
+/// lost. The children of the process leave the files to it.
+struct ClosingAtExit {
+  ClosingAtExit() : process(getpid()) {}
+  ClosingAtExit(const ClosingAtExit&) = delete;
+  ClosingAtExit& operator=(const ClosingAtExit&) = delete;
+  ~ClosingAtExit() {
+    if (getpid() == process) closeAll();
+    openFileRegistry().clear();
+  }
+
+  pid_t process;
+};
+const ClosingAtExit closingAtExit;
 
 }  // namespace
 
@@ -106,7 +122,7 @@ void deleteFile(int, qvArray*[], std::int32_t, const qvArray* arguments[], const
 
 void closeAllOnUnload() {
   if (openFileRegistry().size() == 0) return;
-  const ClosesAllFiles closing;
+  const ClosingAll closing;  // even if the host makes an error of the warning
   qvWarningMsgId(cdflib::closingFileHandle());
 }
 

@@ -26,7 +26,8 @@ void closeFile(int, qvArray*[], std::int32_t, const qvArray* arguments[], const 
 /// identifier then stays registered, usable if the library refused to begin.
 void deleteFile(int, qvArray*[], std::int32_t, const qvArray* arguments[], const CommandEntry*);
 
-/// The unload handler: one warning if any file is open, then closes every one, ignoring failures.
+/// The unload handler: one warning if any file is open, then closes every one, ignoring failures. A
+/// process that ends without calling it has its files closed without the warning.
 void closeAllOnUnload();
 
 }  // namespace TOLVEX::ambrix

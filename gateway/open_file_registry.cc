@@ -1,14 +1,13 @@
 #include "gateway/open_file_registry.h"
 
 #include <cstdint>
+#include <new>
 
 #include "gateway/errors.h"
 #include "gateway/raise_error.h"
 
 namespace TOLVEX::ambrix {
 namespace {
-
-OpenFileRegistry registry;
 
 void insertInto(std::vector<CdfId>& files, CdfId file) {
   const auto place = std::ranges::lower_bound(files, file);
@@ -37,7 +36,14 @@ void OpenFileRegistry::markFreed(CdfId file) {
   if (contains(file)) insertInto(freed_, file);
 }
 
+void OpenFileRegistry::clear() {
+  open_ = {};
+  freed_ = {};
+}
+
 OpenFileRegistry& openFileRegistry() {
+  alignas(OpenFileRegistry) static std::byte place[sizeof(OpenFileRegistry)];
+  static auto& registry = *new (place) OpenFileRegistry;
   return registry;
 }
 
@@ -46,7 +52,7 @@ CdfId getCdfIdArg(const qvArray* argument) {
     raiseError(validate::argumentNotUint64Scalar("CDFID"));
   }
   const CdfId file{*static_cast<const std::uint64_t*>(qvGetReadOnlyData(argument))};
-  if (!registry.contains(file)) raiseError(cdflib::invalidFileId());
+  if (!openFileRegistry().contains(file)) raiseError(cdflib::invalidFileId());
   return file;
 }
 

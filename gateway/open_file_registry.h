@@ -18,6 +18,8 @@ class OpenFileRegistry {
   /// Registers an identifier that the library has just handed out, which makes it usable (again).
   void insert(CdfId file);
   void erase(CdfId file);
+  /// Forgets all files and gives its memory back.
+  void clear();
   [[nodiscard]] bool contains(CdfId file) const { return std::ranges::binary_search(open_, file); }
   [[nodiscard]] std::size_t size() const { return open_.size(); }
 
@@ -36,6 +38,8 @@ class OpenFileRegistry {
   std::vector<CdfId> freed_;  // a part of open_ that must not reach the library
 };
 
+/// Is there before the module's other static objects and after them: a process may end in an order
+/// in which the module is unloaded when they are gone already.
 OpenFileRegistry& openFileRegistry();
 
 /// Converts the argument "CDFID". Raises `argumentNotUint64Scalar` unless it is one uint64 element,

@@ -3,8 +3,10 @@
 #include <dlfcn.h>
 
 #include <array>
+#include <cstddef>
 #include <cstdio>
 #include <mutex>
+#include <new>
 #include <set>
 #include <string>
 
@@ -19,8 +21,10 @@ struct LoadedModules {
   std::set<void*> handles;
 };
 
+/// Never destroyed: a program's static modules may go after the static objects of this library.
 LoadedModules& loadedModules() {
-  static LoadedModules modules;
+  alignas(LoadedModules) static std::byte place[sizeof(LoadedModules)];
+  static auto& modules = *new (place) LoadedModules;
   return modules;
 }
 

@@ -1,8 +1,13 @@
 // What unloading does with files that are still open.
+#include <filesystem>
+#include <fstream>
+
 #include "tests/module/support/module_test.h"
 
 namespace ambrix_test {
 namespace {
+
+namespace fs = std::filesystem;
 
 using UnloadTest = ModuleTest;
 const std::string kWarning = "TOLVEX:ambrix:cdflib:closingFileHandle()";
@@ -37,6 +42,63 @@ TEST_F(UnloadTest, AModuleLoadedAgainKnowsNoIdentifierOfTheOneBefore) {
   module.unload();
   module = ::ambrix::Module();
   EXPECT_EQ(does("close", {file}), kInvalidFileId);
+}
+
+/// What this process holds.
+struct Footprint {
+  std::ptrdiff_t files = 0;
+  std::ptrdiff_t mappings = 0;
+  long pages = 0;
+};
+
+Footprint footprint() {
+  Footprint found;
+  found.files = std::distance(fs::directory_iterator("/proc/self/fd"), {});
+  std::ifstream mappings("/proc/self/maps");
+  for (std::string line; std::getline(mappings, line);)
+    ++found.mappings;
+  long all = 0;
+  std::ifstream("/proc/self/statm") >> all >> found.pages;
+  return found;
+}
+
+/// Loads the module, leaves a file open for reading and one for writing, and unloads it.
+void loadAndUnload(const Given& read, const Given& written) {
+  ::ambrix::Module module;
+  const Array first = std::move(module.call("open", {read.view()}).at(0));
+  (void)module.call("getVarRecordData", {first, Array::scalar(0.0), Array::scalar(0.0)});
+  const Array second = std::move(module.call("open", {written.view()}).at(0));
+  module.call("putVarRecordData",
+              {second, Array::scalar(0.0), Array::scalar(0.0), Array::scalar(std::int32_t{8})});
+  module.unload();
+}
+
+TEST_F(UnloadTest, ThousandsOfTimesWithFilesOpenDoNotGrowTheProcess) {
+#ifdef __SANITIZE_ADDRESS__
+  constexpr long kPages = 1L << 40;  // what is freed is kept for a while, to find uses of it
+  constexpr int kCycles = 300;
+#else
+  constexpr long kPages = 256;
+  constexpr int kCycles = 2000;
+#endif
+  for (const char* name : {"read", "written"}) {
+    const Given file = create(name);
+    results("putVarRecordData", {file, createVar(file, {}), 0, row<std::int32_t>({7})});
+    results("close", {file});
+  }
+  module.unload();
+  for (int i = 0; i < 100; ++i)
+    loadAndUnload("read", "written");
+  const Footprint before = footprint();
+  for (int i = 0; i < kCycles; ++i)
+    loadAndUnload("read", "written");
+  const Footprint after = footprint();
+  EXPECT_EQ(after.files, before.files);
+  EXPECT_LE(after.mappings, before.mappings + 2);  // those of the heap vary
+  EXPECT_LE(after.pages, before.pages + kPages);
+  EXPECT_EQ(module.leaks(), ::ambrix::LiveCounts{});
+  module = ::ambrix::Module();
+  EXPECT_EQ(does("getVarRecordData", {open("written"), 0, 0}), "int32 1x1 [8]");
 }
 
 }  // namespace

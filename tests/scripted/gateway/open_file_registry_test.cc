@@ -59,6 +59,15 @@ TEST_F(OpenFileRegistryTest, OnlyRegisteredFilesAreMarkedAsFreed) {
   EXPECT_FALSE(registry.isFreed(kFive));
 }
 
+TEST_F(OpenFileRegistryTest, AClearedRegistryKnowsNoFile) {
+  OpenFileRegistry registry;
+  registry.insert(kFive);
+  registry.markFreed(kFive);
+  registry.clear();
+  EXPECT_EQ(registry.size(), 0U);
+  EXPECT_FALSE(registry.isFreed(kFive));
+}
+
 TEST_F(OpenFileRegistryTest, AnIdentifierIsOneUint64) {
   const Given others[] = {5,
                           {},
