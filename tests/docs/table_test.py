@@ -68,6 +68,13 @@ class TableTest(unittest.TestCase):
         in_table = {routine for command in COMMANDS for routine in command["routines"]}
         self.assertEqual(in_table, in_sources)
 
+    def test_constants_that_arguments_take_are_listed(self):
+        kinds = {row["kind"] for row in TABLE["constants"]}
+        taken = {a["constant"] for command in COMMANDS for a in command["arguments"]
+                 if "constant" in a}
+        self.assertEqual(kinds - taken, {"encoding"})  # which no command sets
+        self.assertEqual(taken - kinds, set())
+
     def test_names_the_labels_that_the_module_names(self):
         labels = {a["label"] for command in COMMANDS for a in command["arguments"] if "label" in a}
         for label in labels - {"VARIANCE"}:  # stands for a value there, not for an argument

@@ -1,0 +1,69 @@
+## -*- texinfo -*-
+## @deftypefn {} {@var{s} =} ambrix.internal.completeStruct (@var{s})
+## Make a struct for @code{ambrix.write} one that has all the parts that @code{ambrix.read} returns,
+## with a description of each variable that there are data of.
+## @end deftypefn
+
+function s = completeStruct (s)
+  if (! isstruct (s) || ! isscalar (s))
+    error ("ambrix:invalidData", "ambrix.write: give a struct of arrays, or what ambrix.read returns");
+  endif
+  areStructs = structfun (@isstruct, s);
+  if (! any (areStructs))
+    s = struct ("data", {s});
+  endif
+  parts = struct ("data", {struct()}, "variables", {struct()}, "attributes", {struct()}, ...
+                  "file", {struct()}, "options", {struct()});
+  parts.attributeList = struct ("name", {}, "scope", {}, "entries", {}, "datatypes", {});
+  s = withDefaults (s, parts);
+  s.file = withDefaults (s.file, struct ("format", "SINGLE_FILE", "majority", "COLUMN_MAJOR", ...
+                                         "checksum", "NO_CHECKSUM"));
+  s.options = withDefaults (s.options, struct ("records", "first", "time", false, "fill", false));
+  s.variables = allVariables (s);
+endfunction
+
+function s = withDefaults (s, defaults)
+  for [value, name] = defaults
+    if (! isfield (s, name))
+      s.(name) = value;
+    elseif (isstruct (value) && ! isstruct (s.(name)))
+      error ("ambrix:invalidData", "ambrix.write: \"%s\" must be a struct", name);
+    endif
+  endfor
+endfunction
+
+## In the order of the file where they were read, else in that of the data. What could not be read
+## can't be written either.
+function variables = allVariables (s)
+  described = s.variables;
+  names = fieldnames (s.data);
+  if (all (structfun (@(v) isfield (v, "number"), described)))
+    names = [fieldnames(described); names];
+  else
+    names = [names; fieldnames(described)];
+  endif
+  variables = struct ();
+  for name = unique (names, "stable")'
+    v = struct ();
+    if (isfield (described, name{1}))
+      v = described.(name{1});
+    endif
+    if (! isfield (v, "supported") || v.supported)
+      variables.(name{1}) = withDefaults (v, struct ("attributes", {struct()}));
+    endif
+  endfor
+endfunction
+
+%!test  # a plain struct of arrays
+%! s = ambrix.internal.completeStruct (struct ("a", 1, "b", "x"));
+%! assert (fieldnames (s.variables), {"a"; "b"});
+%! assert (s.data.b, "x");
+%! assert (s.file.majority, "COLUMN_MAJOR");
+%!test  # variables stay in the order of the data when only some are described
+%! s.data = struct ("time", 1, "flux", 2);
+%! s.variables.flux.attributes.UNITS = "nT";
+%! s = ambrix.internal.completeStruct (s);
+%! assert (fieldnames (s.variables), {"time"; "flux"});
+%!error id=ambrix:invalidData ambrix.internal.completeStruct (1)
+%!error <"attributes" must be a struct>
+%! ambrix.internal.completeStruct (struct ("data", struct ("a", 1), "attributes", 2));

@@ -1,0 +1,111 @@
+## -*- texinfo -*-
+## @deftypefn {} {} ambrix.internal.writeAttributes (@var{id}, @var{s}, @var{numbers})
+## Write the attributes of a complete struct, in the order of its list and then of their names.
+##
+## @var{numbers} are those of the variables by name.
+## @end deftypefn
+
+function writeAttributes (id, s, numbers)
+  for attribute = allAttributes (s)
+    number = ambrix.createAttr (id, attribute.name, attribute.scope);
+    if (strcmp (attribute.scope, "GLOBAL_SCOPE"))
+      writeGlobal (id, number, attribute, s.attributes.(attribute.name));
+    else
+      writeOfVariables (id, number, attribute, s.variables, numbers);
+    endif
+  endfor
+endfunction
+
+## The list, without the global attributes that were removed, and with those that were added.
+function list = allAttributes (s)
+  isGlobal = strcmp ({s.attributeList.scope}, "GLOBAL_SCOPE");
+  list = s.attributeList(! isGlobal | isfield (s.attributes, {s.attributeList.name}));
+  list = withMissing (list, fieldnames (s.attributes), "GLOBAL_SCOPE");
+  for [v, name] = s.variables
+    list = withMissing (list, fieldnames (v.attributes), "VARIABLE_SCOPE");
+  endfor
+endfunction
+
+function list = withMissing (list, names, scope)
+  for name = setdiff (names, {list.name}, "stable")(:)'
+    list(end+1) = struct ("name", name{1}, "scope", scope, "entries", [], "datatypes", {{}});
+  endfor
+endfunction
+
+## Entries keep their numbers as long as there are as many as were read.
+function writeGlobal (id, number, attribute, values)
+  if (! iscell (values))
+    values = {values};
+  endif
+  kept = numel (values) == numel (attribute.entries);
+  for k = 1:numel (values)
+    [entry, datatype] = deal (k - 1, "");
+    if (kept)
+      entry = attribute.entries(k);
+      datatype = attribute.datatypes{k};
+    endif
+    what = sprintf ("attribute \"%s\"", attribute.name);
+    put (id, number, entry, datatype, values{k}, what);
+  endfor
+endfunction
+
+function writeOfVariables (id, number, attribute, variables, numbers)
+  for [v, name] = variables
+    if (! isfield (v.attributes, attribute.name))
+      continue;
+    endif
+    value = v.attributes.(attribute.name);
+    datatype = [attribute.datatypes(strcmp (attribute.entries, name)), {""}]{1};
+    if (isempty (datatype) && isLimit (attribute.name))
+      datatype = v.datatype;
+    endif
+    what = sprintf ("attribute \"%s\" of \"%s\"", attribute.name, name);
+    put (id, number, numbers.(name), datatype, value, what);
+  endfor
+endfunction
+
+## Values that readers compare with those of the variable are of its datatype.
+function limit = isLimit (name)
+  limit = any (strcmp (name, {"FILLVAL", "VALIDMIN", "VALIDMAX", "SCALEMIN", "SCALEMAX"}));
+endfunction
+
+## In the given datatype where the class of the value belongs to it.
+function put (id, number, entry, datatype, value, what)
+  if (islogical (value))
+    value = uint8 (value);
+  endif
+  if (iscell (value) || (ischar (value) && rows (value) > 1))
+    error ("ambrix:invalidData", "ambrix.write: %s must be one text or numbers", what);
+  endif
+  classes = ambrix.internal.datatypes ();
+  if (isempty (datatype) || ! strcmp (classes.(datatype), class (value)))
+    datatype = ambrix.internal.datatypeOf (value, what);
+  endif
+  if (ischar (value) && isempty (value))
+    value = "\0";  # an entry has one character at least
+  endif
+  ambrix.putAttrEntry (id, number, entry, datatype, value);
+endfunction
+
+%!test  # numbers and datatypes are kept as long as they fit
+%! [id, restore] = ambrix.internal.example ();
+%! ambrix.putAttrgEntry (id, 0, 3, "CDF_UCHAR", "more");
+%! s = ambrix.read (id);
+%! ambrix.close (id);
+%! ambrix.write ("same", s);
+%! r = ambrix.info ("same");
+%! assert (r.attributeList, s.attributeList);
+%! s.attributes.Title{end+1} = 7;
+%! s.variables.Flux.attributes.Units = 8;
+%! s.attributes.New = single (9);
+%! ambrix.write ("other", s);
+%! r = ambrix.info ("other");
+%! assert (r.attributes, s.attributes);
+%! assert (r.attributeList(1).entries, 0:2);
+%! assert (r.attributeList(1).datatypes, {"CDF_CHAR", "CDF_CHAR", "CDF_DOUBLE"});
+%! assert (r.variables.Flux.attributes.Units, 8);
+%! assert (r.attributeList(3).name, "New");
+%!error <attribute "a" must be one text>
+%! [id, restore] = ambrix.internal.example ();
+%! ambrix.close (id);
+%! ambrix.write ("bad", struct ("data", struct (), "attributes", struct ("a", {{{1}}})));

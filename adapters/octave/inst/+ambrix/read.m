@@ -1,0 +1,204 @@
+## -*- texinfo -*-
+## @deftypefn  {} {@var{data} =} ambrix.read (@var{file}, @var{name})
+## @deftypefnx {} {@var{s} =} ambrix.read (@var{file})
+## @deftypefnx {} {@var{s} =} ambrix.read (@var{file}, @var{names})
+## @deftypefnx {} {@dots{} =} ambrix.read (@var{file}, @dots{}, @var{option}, @var{value}, @dots{})
+## Read variables of a CDF file, whole or in part.
+##
+## @var{file} is the path of a file, with or without @code{.cdf}, or the identifier of an open one.
+## With the @var{name} of a variable its data are returned. With a cell array of names, or with
+## @code{@{@}} or without any for all variables, a struct is returned that tells all about the file:
+##
+## @table @code
+## @item data
+## the data of the variables by name: @code{s.data.Flux}
+## @item variables
+## @itemx attributes
+## @itemx file
+## @itemx attributeList
+## the description that @code{ambrix.info} gives: @code{s.variables.Flux.attributes.UNITS}
+## @item options
+## how the data were read
+## @end table
+##
+## @code{ambrix.write} makes the same file of it again.
+##
+## The first dimension of data is that of the records, so that a scalar variable is a column; those
+## of the variable follow in the order of the file, whatever its majority. Where values don't differ
+## from record to record there is no dimension for records. Data have the class that belongs to the
+## datatype. Texts are in a cell array, without the blanks that fill them up. The two numbers of an EPOCH16, seconds and picoseconds, are along a last
+## dimension.
+##
+## The options are:
+##
+## @table @asis
+## @item @qcode{"records"}, @qcode{"first"} or @qcode{"last"}
+## With @qcode{"last"} the dimension of the records comes last, and that of the characters or of the
+## two numbers of an EPOCH16 first. It takes the least time and memory.
+## @item @qcode{"range"}, [@var{first}, @var{last}] or [@var{first}, @var{last}, @var{step}]
+## Read these records only, counted from 1.
+## @item @qcode{"slab"}, @{@var{range}, @dots{}@}
+## Read these elements only: a range for each dimension of the variable, empty for all of it.
+## @item @qcode{"time"}
+## Turn epochs into Octave's serial day numbers, as @code{datestr} takes them, and their fill value
+## into NaN.
+## @item @qcode{"fill"}
+## Turn the values of floating point variables that equal their attribute FILLVAL into NaN.
+## @item @qcode{"text"}, @qcode{"cell"} or @qcode{"char"}
+## With @qcode{"char"} texts are arrays of characters, all of them, along a last dimension.
+## @end table
+##
+## Variables and entries of attributes whose datatype is not supported are left out, with the warning
+## @code{ambrix:unsupportedDatatype}. A wrong option is the error @code{ambrix:invalidOption}; other
+## errors are those of the commands.
+##
+## @example
+## @group
+## B = ambrix.read ("magnetometer", "B", "fill");
+## t = ambrix.read ("magnetometer", "Epoch", "time");
+## plot (t, B)
+## @end group
+## @end example
+## @seealso{ambrix.info, ambrix.write, ambrix.plot, ambrix.hyperGetVarData}
+## @end deftypefn
+
+function result = read (file, names = {}, varargin)
+  if (nargin < 1)
+    print_usage ("ambrix.read");
+  endif
+  defaults = struct ("records", {{"first", "last"}}, "range", [], "slab", {[]}, ...
+                     "time", false, "fill", false, "text", {{"cell", "char"}});
+  options = ambrix.internal.parseOptions ("ambrix.read", defaults, varargin);
+  [id, closer] = ambrix.internal.openToRead (file);
+  if (ischar (names))
+    result = readOne (id, names, options);
+  elseif (iscellstr (names) || isempty (names))
+    result = readSeveral (id, names, options);
+  else
+    error ("ambrix:invalidName",
+           "ambrix.read: give the name of a variable, or a cell array of names");
+  endif
+endfunction
+
+function data = readOne (id, name, options)
+  rowMajor = strcmp (__ambrix__ ("getMajority", id), "ROW_MAJOR");
+  number = numberOf (id, name);
+  v = ambrix.internal.describeVariable (id, number, rowMajor);
+  fill = [];
+  if (options.fill)
+    fill = fillOf (id, number);
+  endif
+  data = ambrix.internal.readData (id, v, rowMajor, options, fill);
+endfunction
+
+## The library's own words for a name that there is not are hard to understand.
+function number = numberOf (id, name)
+  try
+    number = __ambrix__ ("getVarNum", id, name);
+  catch err
+    error (err.identifier, "ambrix.read: there is no variable \"%s\" in \"%s\"; %s",
+           name, __ambrix__ ("getName", id), err.message);
+  end_try_catch
+endfunction
+
+function fill = fillOf (id, number)
+  try
+    fill = __ambrix__ ("getAttrEntry", id, __ambrix__ ("getAttrNum", id, "FILLVAL"), number);
+  catch
+    fill = [];  # most variables of most files have one, but none need
+  end_try_catch
+endfunction
+
+function s = readSeveral (id, names, options)
+  if (! isempty (options.slab))
+    error ("ambrix:invalidOption", "ambrix.read: option \"slab\" needs the name of one variable");
+  endif
+  [description, left] = ambrix.internal.describeFile (id);
+  description.variables = chosen (id, description.variables, names);
+  rowMajor = strcmp (description.file.majority, "ROW_MAJOR");
+  s.data = struct ();
+  for [v, name] = description.variables
+    fill = [];
+    if (options.fill && isfield (v.attributes, "FILLVAL"))
+      fill = v.attributes.FILLVAL;
+    endif
+    if (! v.supported)
+      left{end+1} = sprintf ("variable \"%s\" (%s)", name, v.datatype);
+    else
+      [s.data.(name), description.variables.(name)] = ...
+        ambrix.internal.readData (id, v, rowMajor, options, fill);
+    endif
+  endfor
+  for [part, name] = description
+    s.(name) = part;
+  endfor
+  s.options = struct ("records", options.records, "text", options.text, "time", options.time, ...
+                      "fill", options.fill);
+  ambrix.internal.warnOfUnsupported ("ambrix.read", s.file.name, left);
+endfunction
+
+function variables = chosen (id, all, names)
+  variables = all;
+  if (! isempty (names))
+    variables = struct ();
+    for name = names(:)'
+      number = numberOf (id, name{1});
+      variables.(name{1}) = all.(name{1});
+    endfor
+  endif
+endfunction
+
+%!shared file, closer
+%! [id, closer] = ambrix.internal.example ();
+%! ambrix.close (id);
+%! file = fullfile (pwd (), "example.cdf");
+%!assert (size (ambrix.read (file, "Time")), [2, 1])
+%!test  # records first, then the dimensions of the file, here (2, 3)
+%! flux = ambrix.read (file, "Flux");
+%! assert (class (flux), "single");
+%! assert (size (flux), [2, 2, 3]);
+%! assert (squeeze (flux(1,:,:)), single ([1, 3, 5; 2, 4, 6]));
+%!test
+%! flux = ambrix.read (file, "Flux", "records", "last");
+%! assert (flux(:,:,2), single ([7, 9, 11; 8, 10, 12]));
+%!assert (ambrix.read (file, "Mode"), {"fast"; "slow"})
+%!assert (ambrix.read (file, "Mode", "text", "char"), ["fast"; "slow"])
+%!assert (datestr (ambrix.read (file, "Time", "time", "range", [2, 2]), 31), "2024-01-01 00:00:30")
+%!assert (ambrix.read (file, "Mode", "range", [2, 2]), {"slow"})
+%!test
+%! flux = ambrix.read (file, "Flux", "slab", {[], [1, 3, 2]});
+%! assert (size (flux), [2, 2, 2]);
+%! assert (flux(1,:), single ([1, 2, 5, 6]));
+%!test
+%! s = ambrix.read (file);
+%! assert (fieldnames (s), {"data"; "file"; "attributes"; "variables"; "attributeList"; "options"});
+%! assert (s.data.Mode, {"fast"; "slow"});
+%! assert (s.variables.Flux.attributes.Units, "km/s");
+%!test
+%! s = ambrix.read (file, {"Mode", "Time"}, "range", [2, 2]);
+%! assert (fieldnames (s.data), {"Mode"; "Time"});
+%! assert (s.variables.Mode.records, 1);
+%!test  # an open file stays open
+%! id = ambrix.open (file);
+%! assert (ambrix.read (id, "Mode"), {"fast"; "slow"});
+%! ambrix.close (id);
+%!test  # fill values
+%! [id, restore] = ambrix.internal.example ();
+%! ambrix.createAttr (id, "FILLVAL", "VARIABLE_SCOPE");
+%! ambrix.putAttrEntry (id, 2, 1, "CDF_REAL4", single (4));
+%! flux = ambrix.read (id, "Flux", "fill");
+%! assert (isnan (flux)(:), (1:12)(:) == 7);
+%! s = ambrix.read (id, {}, "fill");
+%! assert (s.data.Flux, flux);
+%! ambrix.close (id);
+%!error <there is no variable "None" in ".*example"> ambrix.read (file, "None");
+%!error id=TOLVEX:ambrix:cdflib:libraryFailure ambrix.read (file, "None");
+%!error id=TOLVEX:ambrix:cdflib:fileOpenError ambrix.read ("no such file");
+%!error id=ambrix:invalidName ambrix.read (file, 1);
+%!error id=ambrix:invalidOption ambrix.read (file, "Flux", "wrong");
+%!error id=ambrix:invalidOption ambrix.read (file, "Flux", "slab", [1, 2]);
+%!error id=ambrix:invalidOption ambrix.read (file, {}, "slab", {[]});
+%!error id=ambrix:invalidOption ambrix.read (file, "Flux", "range", [0, 1]);
+%!error id=ambrix:invalidOption ambrix.read (file, "Flux", "range", [1, 3]);
+%!error id=ambrix:invalidOption ambrix.read (file, "Flux", "range", [1, 2, 0]);
+%!error <Invalid call> ambrix.read ()

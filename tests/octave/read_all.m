@@ -1,0 +1,51 @@
+## usage: octave-cli read_all.m FOLDER FILE...
+##
+## Reads each file by ambrix.read, writes what it got to FOLDER/NAME.bin for other programs, and by
+## ambrix.write to FOLDER/NAME.cdf.
+1;
+
+## Each leaf of the struct: its path, its class, its sizes and its bytes. `path` ends in a separator.
+function dump (stream, value, path)
+  if (isstruct (value) && isscalar (value))
+    leaf (stream, path, "struct", [], []);
+    for [part, name] = value
+      dump (stream, part, [path name "\x1f"]);
+    endfor
+  elseif (iscell (value) || isstruct (value))
+    leaf (stream, path, "cell", [], []);
+    for k = 1:numel (value)
+      part = value(k);
+      if (iscell (part))
+        part = part{1};
+      endif
+      dump (stream, part, [path sprintf("%06d\x1f", k)]);
+    endfor
+  else
+    leaf (stream, path, class (value), size (value), value(:).');
+  endif
+endfunction
+
+function leaf (stream, path, class_name, sizes, value)
+  if (ischar (value) || islogical (value))
+    value = uint8 (value);
+  endif
+  numbers = uint32 ([numel(path), numel(class_name), numel(sizes), sizes]);
+  fwrite (stream, [typecast(numbers, "uint8"), uint8([path class_name]), typecast(value, "uint8")]);
+endfunction
+
+warning ("off", "ambrix:unsupportedDatatype");
+warning ("off", "TOLVEX:ambrix:cdflib:invalidCompressionParameter");
+folder = argv (){1};
+for file = argv ()(2:end)'
+  [~, name] = fileparts (file{1});
+  s = ambrix.read (file{1});
+  ambrix.write (fullfile (folder, name), s);
+  for [data, variable] = s.data
+    if (iscell (data))  # many cells, slow to dump
+      s.data.(variable) = ambrix.read (file{1}, variable, "text", "char");
+    endif
+  endfor
+  stream = fopen (fullfile (folder, [name ".bin"]), "w");
+  dump (stream, s, "");
+  fclose (stream);
+endfor
