@@ -1,6 +1,7 @@
 // Errors, warnings and the news that the module is about to be unloaded.
 #include <octave/error.h>
 #include <octave/interpreter.h>
+#include <unistd.h>
 
 #include <cstdlib>
 #include <string>
@@ -15,6 +16,7 @@ namespace {
 using TOLVEX::ambrix::MessageId;
 
 qvhExitHandler exitHandler = nullptr;
+pid_t process = 0;  // that has loaded the module
 bool unloading = false;
 
 /// Octave takes a newline at the end as a wish for no traceback.
@@ -32,8 +34,10 @@ void warn(const MessageId& id) {
 }
 
 /// Nothing may leave this: it runs while the oct-file is unloaded or the process ends, and there
-/// are files to close after the warning, whatever becomes of that.
+/// are files to close after the warning, whatever becomes of that. The children of the process
+/// leave them to it.
 void runExitHandler() {
+  if (getpid() != process) return;
   unloading = true;
   try {
     std::exchange(exitHandler, nullptr)();
@@ -85,7 +89,6 @@ void qvGetMessageText(const MessageId& id, std::string& text) {
 // Registered with the C library, which runs the handler when Octave unloads this oct-file and else
 // when the process ends, as long as the objects of the file live.
 void qvhAtExit(qvhExitHandler handler) {
-  static bool registered = false;
   exitHandler = handler;
-  if (!registered) registered = std::atexit(runExitHandler) == 0;
+  if (process == 0 && std::atexit(runExitHandler) == 0) process = getpid();
 }
