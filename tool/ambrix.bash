@@ -2,12 +2,13 @@
 
 _ambrix() {
   local word=$2 previous=$3 command=${COMP_WORDS[1]}
-  local commands="info dump call convert session"
+  local commands="info dump check call convert session"
   declare -A options=(
-    [info]="--attributes --json --help"
-    [dump]="--records --format --help"
+    [info]="--attributes --json --time-limit --help"
+    [dump]="--records --format --output --time-limit --help"
+    [check]="--json --quiet --time-limit --help"
     [call]="--file --help"
-    [convert]="--compression --majority --checksum --skip-unsupported --help"
+    [convert]="--compression --majority --checksum --skip-unsupported --time-limit --help"
     [session]="--max-array-bytes --help"
   )
   declare -A values=(

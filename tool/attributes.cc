@@ -1,11 +1,15 @@
 #include "tool/attributes.h"
 
+#include <fmt/format.h>
+
 #include <exception>
 #include <optional>
 #include <utility>
 
 #include "ambrix/error.h"
 #include "tool/facts.h"
+#include "tool/steps.h"
+#include "tool/text.h"
 #include "tool/variable.h"
 
 namespace ambrix::tool {
@@ -15,12 +19,14 @@ double countAttributes(CdfFile& file) {
 }
 
 Attribute inquireAttribute(CdfFile& file, double number) {
+  beginStep(fmt::format("reading attribute {}", number));
   const std::vector<Array> facts = file.call("inquireAttr", {number});
   Attribute attribute;
   attribute.number = number;
   attribute.name = bytesOf(facts.at(0));
   attribute.global = bytesOf(facts.at(1)) == "GLOBAL_SCOPE";
   attribute.maxEntry = facts.at(attribute.global ? 2 : 3).data<double>().front();
+  beginStep("reading attribute \"" + printable(attribute.name) + '"');
   return attribute;
 }
 
@@ -58,23 +64,18 @@ void forEachEntry(CdfFile& file, const Attribute& attribute,
   if (remaining > 0 && failure) std::rethrow_exception(failure);
 }
 
-std::vector<AttributeFacts> readAttributes(Module& module, CdfFile& file) {
-  std::vector<AttributeFacts> all;
-  const double count = countAttributes(file);
-  for (double number = 0; number < count; ++number) {
-    const Attribute attribute = inquireAttribute(file, number);
-    AttributeFacts facts{attribute.name, attribute.global, {}};
-    forEachEntry(file, attribute, [&](const EntryHeader& header) {
-      EntryFacts entry{header.number, header.datatype, header.supported, header.elements, {}};
-      if (header.supported) {
-        const Array value = readEntry(file, attribute, header.number);
-        entry.values = formatValues(module, value, header.datatype, value.elementCount());
-      }
-      facts.entries.push_back(std::move(entry));
-    });
-    all.push_back(std::move(facts));
-  }
-  return all;
+AttributeFacts readAttributeFacts(Module& module, CdfFile& file, double number) {
+  const Attribute attribute = inquireAttribute(file, number);
+  AttributeFacts facts{attribute.name, attribute.global, {}};
+  forEachEntry(file, attribute, [&](const EntryHeader& header) {
+    EntryFacts entry{header.number, header.datatype, header.supported, header.elements, {}};
+    if (header.supported) {
+      const Array value = readEntry(file, attribute, header.number);
+      entry.values = formatValues(module, value, header.datatype, value.elementCount());
+    }
+    facts.entries.push_back(std::move(entry));
+  });
+  return facts;
 }
 
 }  // namespace ambrix::tool

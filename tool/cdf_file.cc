@@ -5,6 +5,7 @@
 #include <utility>
 
 #include "tool/failure.h"
+#include "tool/steps.h"
 
 namespace ambrix::tool {
 
@@ -22,6 +23,7 @@ CdfFile CdfFile::from(Module& module, std::string_view command, std::string_view
 }
 
 CdfFile CdfFile::open(Module& module, std::string_view path) {
+  beginStep("opening the file");
   return from(module, "open", path);
 }
 

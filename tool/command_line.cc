@@ -1,5 +1,7 @@
 #include "tool/command_line.h"
 
+#include <fmt/format.h>
+
 #include <algorithm>
 #include <memory>
 
@@ -35,11 +37,21 @@ CLI::App& addCommand(CLI::App& app, const HelpText& help) {
   return command;
 }
 
+void addTimeLimit(CLI::App& command, Arguments& arguments) {
+  command
+      .add_option("--time-limit", arguments.timeLimit,
+                  fmt::format("Give up when nothing was read for so long (default: {}; 0: never)",
+                              kTimeLimit))
+      ->type_name("SECONDS")
+      ->check(CLI::NonNegativeNumber);
+}
+
 void addInfo(CLI::App& app, Arguments& arguments) {
   CLI::App& info = addCommand(app, kInfoHelp);
   info.add_option("FILE", arguments.info.file, "The file")->required()->type_name("");
   info.add_flag("--attributes", arguments.info.attributes, "Also list the attributes and entries");
   info.add_flag("--json", arguments.info.json, "Print a JSON object");
+  addTimeLimit(info, arguments);
 }
 
 void addDump(CLI::App& app, Arguments& arguments) {
@@ -54,6 +66,18 @@ void addDump(CLI::App& app, Arguments& arguments) {
   dump.add_option("--format", arguments.dump.format, "table (the default), csv or json")
       ->type_name("FORMAT")
       ->transform(CLI::IsMember({"table", "csv", "json"}));
+  dump.add_option("--output", arguments.dump.output,
+                  "Write to a new file, which appears when it is complete")
+      ->type_name("OUT");
+  addTimeLimit(dump, arguments);
+}
+
+void addCheck(CLI::App& app, Arguments& arguments) {
+  CLI::App& check = addCommand(app, kCheckHelp);
+  check.add_option("FILE", arguments.check.files, "The files")->required()->type_name("");
+  check.add_flag("--json", arguments.check.json, "Print a JSON list with an object for each file");
+  check.add_flag("--quiet", arguments.check.quiet, "Tell only of files that are not sound");
+  addTimeLimit(check, arguments);
 }
 
 void addConvert(CLI::App& app, Arguments& arguments) {
@@ -74,6 +98,7 @@ void addConvert(CLI::App& app, Arguments& arguments) {
       ->transform(CLI::IsMember({"md5", "none"}));
   convert.add_flag("--skip-unsupported", options.skipUnsupported,
                    "Leave out what the module does not support, and list it");
+  addTimeLimit(convert, arguments);
 }
 
 void addCall(CLI::App& app, Arguments& arguments) {
@@ -103,6 +128,7 @@ std::unique_ptr<CLI::App> makeParser(Arguments& arguments) {
   app->add_flag("--man", arguments.manual)->group("");
   addInfo(*app, arguments);
   addDump(*app, arguments);
+  addCheck(*app, arguments);
   addConvert(*app, arguments);
   addCall(*app, arguments);
   addSession(*app, arguments);

@@ -7,18 +7,22 @@
 #include <vector>
 
 #include "tool/call.h"
+#include "tool/check.h"
 #include "tool/convert.h"
 #include "tool/dump.h"
 #include "tool/info.h"
 #include "tool/session.h"
+#include "tool/supervision.h"
 
 namespace ambrix::tool {
 
 struct Arguments {
   CallOptions call;
+  CheckOptions check;
   ConvertOptions convert;
   DumpOptions dump;
   InfoOptions info;
+  double timeLimit = kTimeLimit;
   std::size_t maxArrayBytes = kSessionArrayBytes;
   bool version = false;
   bool manual = false;

@@ -6,6 +6,7 @@
 #include "tool/attributes.h"
 #include "tool/failure.h"
 #include "tool/output_file.h"
+#include "tool/steps.h"
 #include "tool/text.h"
 
 namespace ambrix::tool {
@@ -33,14 +34,6 @@ void reportUnsupported(CdfFile& input, bool skip) {
                   " (--skip-unsupported leaves it out)");
 }
 
-fs::path chooseOutput(const std::string& wanted) {
-  const fs::path path = withCdfExtension(wanted);
-  if (path != wanted) {
-    std::fprintf(stderr, "ambrix: the file will be %s\n", printable(path.string()).c_str());
-  }
-  return path;
-}
-
 void writeCopy(Module& module, const ConvertOptions& options, CdfFile& input,
                const std::string& name) {
   CdfFile output = CdfFile::create(module, name);
@@ -49,10 +42,19 @@ void writeCopy(Module& module, const ConvertOptions& options, CdfFile& input,
   createVariables(conversion);
   copyAttributes(conversion);
   copyData(conversion);
+  const Pause pause;  // compressing a large file takes its time
   output.close();
 }
 
 }  // namespace
+
+fs::path chooseOutput(const std::string& wanted) {
+  const fs::path path = withCdfExtension(wanted);
+  if (path != wanted) {
+    std::fprintf(stderr, "ambrix: the file will be %s\n", printable(path.string()).c_str());
+  }
+  return path;
+}
 
 std::vector<std::string> listUnsupported(CdfFile& input) {
   std::vector<std::string> lines;
@@ -70,15 +72,11 @@ std::vector<std::string> listUnsupported(CdfFile& input) {
   return lines;
 }
 
-void runConvert(Module& module, const ConvertOptions& options) {
-  checkOptions(options);
-  // Parts of a file may be opened later, when the current folder is that of the output.
-  CdfFile input = CdfFile::open(module, fs::absolute(options.input).string());
+void runConvert(Module& module, const ConvertOptions& options, const std::string& output) {
+  CdfFile input = CdfFile::open(module, options.input);
   input.setReadOnly();
   reportUnsupported(input, options.skipUnsupported);
-  OutputFile file(chooseOutput(options.output));
-  writeCopy(module, options, input, file.temporaryName());
-  file.publish();
+  writeCopy(module, options, input, output);
 }
 
 }  // namespace ambrix::tool

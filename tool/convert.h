@@ -1,6 +1,7 @@
 // `ambrix convert`: a copy of a file with other settings.
 #pragma once
 
+#include <filesystem>
 #include <string>
 #include <vector>
 
@@ -18,7 +19,11 @@ struct ConvertOptions {
   bool skipUnsupported = false;
 };
 
-void runConvert(Module& module, const ConvertOptions& options);
+/// The file to write: the one that was asked for, with its extension, which may be told.
+std::filesystem::path chooseOutput(const std::string& wanted);
+
+/// Writes to `output`, which gets its name from the caller.
+void runConvert(Module& module, const ConvertOptions& options, const std::string& output);
 
 /// A variable on its way from one file to another.
 struct Copied {

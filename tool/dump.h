@@ -15,6 +15,7 @@ struct DumpOptions {
   std::string variable;
   std::string records;
   std::string format = "table";
+  std::string output;  // empty: standard output
 };
 
 /// Throws `UsageError` for records that are no range, and `ToolError` for those that are not there.

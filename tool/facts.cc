@@ -2,22 +2,10 @@
 
 #include <fmt/format.h>
 
+#include "tool/attributes.h"
+
 namespace ambrix::tool {
 namespace {
-
-VariableFacts readVariable(Module& module, CdfFile& file, double number) {
-  VariableFacts facts;
-  facts.definition = inquireVariable(file, number);
-  facts.records = file.number("getVarMaxWrittenRecNum", {number}) + 1;
-  facts.written = file.number("getVarNumRecsWritten", {number});
-  facts.compression = readCompression(file.call("getVarCompression", {number}));
-  facts.sparseRecords = file.text("getVarSparseRecords", {number});
-  const Variable& variable = facts.definition;
-  if (!variable.supported) return facts;
-  const std::vector<Array> pad = file.call("getVarPadValue", {number});
-  facts.padValue = formatValues(module, pad.at(0), variable.datatype, variable.elements);
-  return facts;
-}
 
 std::string readVersion(CdfFile& file) {
   std::string version;
@@ -49,7 +37,7 @@ Compression readCompression(const std::vector<Array>& results) {
   return compression;
 }
 
-FileFacts readFacts(Module& module, CdfFile& file, bool withAttributes) {
+FileFacts readFileFacts(CdfFile& file) {
   FileFacts facts;
   facts.version = readVersion(file);
   facts.format = file.text("getFormat");
@@ -60,10 +48,31 @@ FileFacts readFacts(Module& module, CdfFile& file, bool withAttributes) {
   facts.records = file.number("getVarsMaxWrittenRecNum") + 1;
   facts.globalAttributes = file.number("getNumgAttributes");
   facts.variableAttributes = file.number("getNumvAttributes");
+  return facts;
+}
+
+VariableFacts readVariableFacts(Module& module, CdfFile& file, double number) {
+  VariableFacts facts;
+  facts.definition = inquireVariable(file, number);
+  facts.records = file.number("getVarMaxWrittenRecNum", {number}) + 1;
+  facts.written = file.number("getVarNumRecsWritten", {number});
+  facts.compression = readCompression(file.call("getVarCompression", {number}));
+  facts.sparseRecords = file.text("getVarSparseRecords", {number});
+  const Variable& variable = facts.definition;
+  if (!variable.supported) return facts;
+  const std::vector<Array> pad = file.call("getVarPadValue", {number});
+  facts.padValue = formatValues(module, pad.at(0), variable.datatype, variable.elements);
+  return facts;
+}
+
+FileFacts readFacts(Module& module, CdfFile& file, bool withAttributes) {
+  FileFacts facts = readFileFacts(file);
   const double variables = countVariables(file);
   for (double number = 0; number < variables; ++number)
-    facts.variables.push_back(readVariable(module, file, number));
-  if (withAttributes) facts.attributes = readAttributes(module, file);
+    facts.variables.push_back(readVariableFacts(module, file, number));
+  const double attributes = withAttributes ? countAttributes(file) : 0;
+  for (double number = 0; number < attributes; ++number)
+    facts.attributes.push_back(readAttributeFacts(module, file, number));
   return facts;
 }
 

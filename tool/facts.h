@@ -54,9 +54,12 @@ struct FileFacts {
   std::vector<AttributeFacts> attributes;
 };
 
+/// What the file says of itself, without variables and attributes.
+FileFacts readFileFacts(CdfFile& file);
+VariableFacts readVariableFacts(Module& module, CdfFile& file, double number);
+AttributeFacts readAttributeFacts(Module& module, CdfFile& file, double number);
 FileFacts readFacts(Module& module, CdfFile& file, bool withAttributes);
 
 Compression readCompression(const std::vector<Array>& results);
-std::vector<AttributeFacts> readAttributes(Module& module, CdfFile& file);
 
 }  // namespace ambrix::tool

@@ -23,7 +23,7 @@ inline constexpr HelpText kToolHelp = {
     "  ambrix COMMAND --help\n"};
 
 inline constexpr HelpText kInfoHelp = {
-    "info", "FILE [--attributes] [--json]",
+    "info", "FILE [--attributes] [--json] [--time-limit SECONDS]",
     "Shows what a file is made of: its settings and its variables",
     "Dimensions are listed as a host's arrays have them: the one that varies fastest comes first.\n"
     "A variable of a datatype that is not supported is listed as far as it is known.\n",
@@ -32,7 +32,7 @@ inline constexpr HelpText kInfoHelp = {
     "  ambrix info --json data.cdf | jq .variables[].name\n"};
 
 inline constexpr HelpText kDumpHelp = {
-    "dump", "FILE VARIABLE [--records A:B] [--format table|csv|json]",
+    "dump", "FILE VARIABLE [OPTION...]",
     "Prints the values of a variable, which is given by its name or its number",
     "Record numbers and indices begin at 0, and the first index varies fastest. Epochs are "
     "printed\n"
@@ -41,7 +41,21 @@ inline constexpr HelpText kDumpHelp = {
     "nested with the first index innermost.\n",
     "  ambrix dump data.cdf Epoch\n"
     "  ambrix dump data.cdf 3 --records 10:19\n"
-    "  ambrix dump data.cdf B_GSE --format csv > b_gse.csv\n"};
+    "  ambrix dump data.cdf B_GSE --format csv --output b_gse.csv\n"};
+
+inline constexpr HelpText kCheckHelp = {
+    "check", "FILE... [--json] [--quiet] [--time-limit SECONDS]",
+    "Tells whether files are sound, by reading all that is in them",
+    "The CDF library validates each file, its checksum included if it has one; then every "
+    "attribute,\n"
+    "entry and value is read. What cannot be read is listed, and so is where the library crashed "
+    "or got\n"
+    "nowhere, which does no harm here. What is of a datatype that is not supported is said to be "
+    "so; it\n"
+    "is no damage. The exit status is 0 only if all files are sound.\n",
+    "  ambrix check data.cdf\n"
+    "  ambrix check --quiet archive/*.cdf\n"
+    "  ambrix check --json data.cdf | jq .[].problems\n"};
 
 inline constexpr HelpText kCallHelp = {
     "call", "[--file FILE] COMMAND [ARGUMENT...]",
@@ -69,7 +83,7 @@ inline constexpr HelpText kConvertHelp = {
     "  ambrix convert old.cdf new.cdf --compression gzip:6\n"
     "  ambrix convert rows.cdf columns.cdf --majority column --checksum md5\n"};
 
-inline constexpr std::array kCommandHelp = {kInfoHelp, kDumpHelp, kCallHelp, kConvertHelp,
-                                            kSessionHelp};
+inline constexpr std::array kCommandHelp = {kInfoHelp, kDumpHelp,    kCheckHelp,
+                                            kCallHelp, kConvertHelp, kSessionHelp};
 
 }  // namespace ambrix::tool

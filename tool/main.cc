@@ -6,11 +6,10 @@
 
 #include "ambrix/embedded.h"
 #include "ambrix_version.h"
-#include "tool/cdf_file.h"
-#include "tool/command_line.h"
+#include "tool/commands.h"
+#include "tool/exit_status.h"
 #include "tool/failure.h"
 #include "tool/man_page.h"
-#include "tool/warnings.h"
 
 namespace ambrix::tool {
 namespace {
@@ -29,34 +28,13 @@ void printVersions(StandardOutput& output) {
   output.write("ambrix " + std::string(kAmbrixVersion) + "\nCDF library " + library + "\n");
 }
 
-void runCommand(const std::string& command, const Arguments& arguments, StandardOutput& output) {
-  if (command == "session") return runSession(arguments.maxArrayBytes, output);
-  Module module;
-  module.setWarningHandler(printWarning);
-  if (command == "info") return runInfo(module, arguments.info, output);
-  if (command == "dump") return runDump(module, arguments.dump, output);
-  if (command == "convert") return runConvert(module, arguments.convert);
-  if (command == "call") return runCall(module, arguments.call, output);
-}
-
-void run(const CLI::App& parser, const Arguments& arguments, StandardOutput& output) {
-  const auto commands = parser.get_subcommands();
-  if (arguments.version) return printVersions(output);
-  if (arguments.manual) return output.write(manualPage(parser));
-  if (commands.empty()) throw UsageError("which command?");
-  runCommand(commands.front()->get_name(), arguments, output);
-}
-
-int failUsage(const std::string& message, const CLI::App& parser) {
-  const auto commands = parser.get_subcommands();
-  const std::string topic = commands.empty() ? "" : " " + commands.front()->get_name();
-  std::fprintf(stderr, "ambrix: %s\nTry 'ambrix%s --help'.\n", message.c_str(), topic.c_str());
-  return kExitUsage;
-}
-
-int fail(const std::string& identifier, const char* message) {
-  std::fprintf(stderr, "ambrix: %s: %s\n", identifier.c_str(), message);
-  return kExitFailure;
+int run(const CLI::App& parser, const Arguments& arguments, StandardOutput& output) {
+  const bool answered = arguments.version || arguments.manual;
+  if (arguments.version) printVersions(output);
+  if (arguments.manual) output.write(manualPage(parser));
+  if (answered) return EXIT_SUCCESS;
+  if (parser.get_subcommands().empty()) throw UsageError("which command?");
+  return runCommand(parser, arguments, output);
 }
 
 /// Parses the command line; help that was asked for is printed, and the tool is done.
@@ -77,24 +55,13 @@ bool parse(CLI::App& parser, int count, const char* const* words, StandardOutput
 int guardedMain(int count, const char* const* words) {
   Arguments arguments;
   const auto parser = makeParser(arguments);
-  try {
+  return exitStatusOf(*parser, [&] {
     StandardOutput output;
-    if (parse(*parser, count, words, output)) run(*parser, arguments, output);
+    const bool wanted = parse(*parser, count, words, output);
+    const int status = wanted ? run(*parser, arguments, output) : EXIT_SUCCESS;
     output.flush();
-    return EXIT_SUCCESS;
-  } catch (const OutputClosed&) {
-    return EXIT_SUCCESS;  // the reader has seen enough
-  } catch (const UsageError& error) {
-    return failUsage(error.what(), *parser);
-  } catch (const Error& error) {
-    return fail(error.identifier(), error.what());
-  } catch (const ToolError& error) {
-    return fail(error.identifier(), error.what());
-  } catch (const LoadError& error) {
-    return fail("ambrix:moduleNotLoaded", error.what());
-  } catch (const std::exception& error) {
-    return fail("ambrix:failure", error.what());
-  }
+    return status;
+  });
 }
 
 }  // namespace

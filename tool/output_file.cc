@@ -3,10 +3,7 @@
 #include <strings.h>
 #include <unistd.h>
 
-#include <array>
 #include <cerrno>
-#include <csignal>
-#include <cstring>
 #include <system_error>
 
 #include "tool/failure.h"
@@ -15,17 +12,6 @@ namespace ambrix::tool {
 namespace {
 
 namespace fs = std::filesystem;
-
-constexpr std::array kEndingSignals = {SIGINT, SIGTERM, SIGHUP};
-
-/// What the signal handler removes: it may not touch more than plain memory.
-std::array<char, 64> unfinished{};
-
-void removeUnfinished(int signal) {
-  ::unlink(unfinished.data());
-  std::signal(signal, SIG_DFL);
-  std::raise(signal);
-}
 
 [[noreturn]] void failBecauseExists(const fs::path& path) {
   throw ToolError("outputExists", path.string() + " exists, and is not overwritten");
@@ -39,21 +25,16 @@ void enterFolder(const fs::path& folder) {
 
 }  // namespace
 
-OutputFile::OutputFile(const fs::path& path)
+OutputFile::OutputFile(const fs::path& path, const std::string& extension)
     : name_(path.filename()),
-      temporaryName_(".ambrix-" + std::to_string(::getpid()) + "-unfinished.cdf") {
+      temporaryName_(".ambrix-" + std::to_string(::getpid()) + "-unfinished" + extension) {
   std::error_code ignored;
   if (fs::exists(fs::symlink_status(path, ignored))) failBecauseExists(path);
   enterFolder(path.parent_path());
-  std::memcpy(unfinished.data(), temporaryName_.c_str(), temporaryName_.size() + 1);
-  for (const int signal : kEndingSignals)
-    std::signal(signal, removeUnfinished);
 }
 
 OutputFile::~OutputFile() {
   ::unlink(temporaryName_.c_str());
-  for (const int signal : kEndingSignals)
-    std::signal(signal, SIG_DFL);
 }
 
 void OutputFile::publish() {

@@ -4,6 +4,8 @@
 #include <functional>
 #include <numeric>
 
+#include "tool/steps.h"
+#include "tool/text.h"
 #include "tool/values.h"
 
 namespace ambrix::tool {
@@ -86,6 +88,7 @@ std::vector<Array> slabArguments(const Variable& variable, const Slab& slab) {
 }
 
 Array readSlab(CdfFile& file, const Variable& variable, const Slab& slab) {
+  beginStep("reading variable \"" + printable(variable.name) + '"');
   const std::vector<Array> arguments = slabArguments(variable, slab);
   const std::vector<ArrayView> views(arguments.begin(), arguments.end());
   return std::move(file.call("hyperGetVarData", views).at(0));

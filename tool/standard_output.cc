@@ -8,6 +8,8 @@
 #include <system_error>
 #include <utility>
 
+#include "tool/steps.h"
+
 namespace ambrix::tool {
 namespace {
 
@@ -43,7 +45,15 @@ void StandardOutput::flush() {
   writeNow(text);
 }
 
+void StandardOutput::redirect(const std::string& path) {
+  const int file = ::open(path.c_str(), O_WRONLY | O_CREAT | O_EXCL | O_CLOEXEC, 0666);
+  if (file < 0) throw std::system_error(errno, std::generic_category(), path);
+  ::close(std::exchange(descriptor_, file));
+  name_ = "the output file";
+}
+
 void StandardOutput::writeNow(std::string_view text) {
+  const Pause pause;  // a reader may take its time
   while (!text.empty()) {
     const ssize_t written = ::write(descriptor_, text.data(), text.size());
     if (written >= 0) {
@@ -51,7 +61,7 @@ void StandardOutput::writeNow(std::string_view text) {
     } else if (errno == EPIPE) {
       throw OutputClosed();
     } else if (errno != EINTR) {
-      throw std::system_error(errno, std::generic_category(), "standard output");
+      throw std::system_error(errno, std::generic_category(), name_);
     }
   }
 }

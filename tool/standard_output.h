@@ -24,6 +24,8 @@ class StandardOutput {
   /// Writes all of it, through a buffer. Throws `OutputClosed`, and std::system_error when the
   /// output cannot be written, a full disk for example.
   void write(std::string_view text);
+  /// From now on writes to a new file in place of standard output.
+  void redirect(const std::string& path);
   void flush();
   [[nodiscard]] bool isTerminal() const noexcept;
 
@@ -31,6 +33,7 @@ class StandardOutput {
   void writeNow(std::string_view text);
 
   int descriptor_;
+  std::string name_ = "standard output";
   std::string buffer_;
 };
 

@@ -1,8 +1,11 @@
 #include "tool/variable.h"
 
+#include <fmt/format.h>
+
 #include <string>
 #include <variant>
 
+#include "tool/steps.h"
 #include "tool/values.h"
 
 namespace ambrix::tool {
@@ -32,6 +35,7 @@ std::size_t Variable::recordElements() const {
 }
 
 Variable inquireVariable(CdfFile& file, double number) try {
+  beginStep(fmt::format("reading the definition of variable {}", number));
   return describe(number, file.call("inquireVar", {number}));
 } catch (const Error& error) {
   const auto code = unsupportedDatatype(error);

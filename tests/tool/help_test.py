@@ -7,7 +7,7 @@ import unittest
 
 from tool.support import TOOL, ToolCase
 
-COMMANDS = ("info", "dump", "call", "convert", "session")
+COMMANDS = ("info", "dump", "check", "call", "convert", "session")
 COMPLETION = os.path.join(os.path.dirname(__file__), "..", "..", "tool", "ambrix.bash")
 
 
@@ -70,7 +70,7 @@ class CompletionTest(ToolCase):
         return done.stdout.decode().split()
 
     def test_commands_and_values(self):
-        self.assertEqual(self.complete("ambrix", "c"), ["call", "convert"])
+        self.assertEqual(self.complete("ambrix", "c"), ["check", "call", "convert"])
         self.assertEqual(self.complete("ambrix", "dump", "a.cdf", "v", "--format", "c"), ["csv"])
 
     def test_options_are_those_of_the_help(self):

@@ -1,0 +1,230 @@
+"""What happens to the tool, its output and its users when the process that reads a file fails."""
+
+import errno
+import os
+import resource
+import signal
+import subprocess
+import time
+import unittest
+
+from support.ambrix_session import array
+from tool.example_file import write_example
+from tool.processes import children_of, is_running, wait_until, write_busy
+from tool.support import TOOL, ToolCase
+
+BUSY = "busy.cdf"  # small, and still takes hours to be read
+CRASHES = (signal.SIGSEGV, signal.SIGABRT, signal.SIGBUS, signal.SIGFPE)
+
+
+class ProtectionCase(ToolCase):
+    def setUp(self):
+        super().setUp()
+        write_busy(self.session(), BUSY)
+
+    def start(self, *arguments, **options):
+        process = subprocess.Popen([TOOL, *arguments], cwd=self.folder, stderr=subprocess.PIPE,
+                                   **options)
+        self.addCleanup(process.stderr.close)
+        self.addCleanup(process.wait)
+        self.addCleanup(process.kill)
+        return process
+
+    def converting(self, *options):
+        """A conversion that has begun to write, and its worker."""
+        process = self.start("convert", BUSY, "out.cdf", "--majority", "column", *options)
+        wait_until(lambda: len(self.files()) > 1)
+        return process, wait_until(lambda: children_of(process.pid))[0]
+
+    def dumping(self, *options):
+        """A dump into a file, and its worker."""
+        process = self.start("dump", BUSY, "v", "--format", "csv", "--output", "out.csv", *options)
+        wait_until(lambda: any(os.path.getsize(self.path(f)) > 0 and "unfinished" in f
+                               for f in self.files()))
+        return process, wait_until(lambda: children_of(process.pid))[0]
+
+    def files(self):
+        return sorted(os.listdir(self.folder))
+
+    def error_of(self, process):
+        self.assertEqual(process.wait(), 1)
+        return process.stderr.read().decode()
+
+    def assert_nothing_left(self):
+        self.assertEqual(self.files(), [BUSY])
+
+
+class CrashTest(ProtectionCase):
+    def test_it_is_an_ordinary_error(self):
+        for number in CRASHES:
+            process, worker = self.converting()
+            os.kill(worker, number)
+            text = self.error_of(process)
+            self.assertRegex(text, r"(?m)^ambrix: ambrix:libraryCrashed: busy\.cdf: the CDF library "
+                             r".* while reading [^;]*; .*'ambrix check'")
+            self.assert_nothing_left()
+
+    def test_the_output_of_dump_appears_only_when_it_is_complete(self):
+        process, worker = self.dumping()
+        os.kill(worker, signal.SIGABRT)
+        self.assertIn('while reading variable "v"', self.error_of(process))
+        self.assert_nothing_left()
+
+    def test_json_on_standard_output_breaks_off(self):
+        process = self.start("dump", BUSY, "v", "--format", "json", stdout=subprocess.PIPE)
+        process.stdout.read(1)
+        os.kill(children_of(process.pid)[0], signal.SIGABRT)
+        self.assertNotIn(b"]}", process.stdout.read())
+        process.stdout.close()
+        self.assertIn("ambrix:libraryCrashed", self.error_of(process))
+
+    def test_no_core_file_is_written(self):
+        resource_limit = (resource.RLIM_INFINITY, resource.RLIM_INFINITY)
+        process = self.start(
+            "convert", BUSY, "out.cdf", "--majority", "column",
+            preexec_fn=lambda: resource.setrlimit(resource.RLIMIT_CORE, resource_limit))
+        worker = wait_until(lambda: children_of(process.pid))[0]
+        wait_until(lambda: len(self.files()) > 1)
+        with open(f"/proc/{worker}/limits", encoding="ascii") as limits:
+            self.assertRegex(limits.read(), r"Max core file size +0 +0 ")
+
+    def test_one_that_was_killed_is_no_damage(self):
+        process, worker = self.converting()
+        os.kill(worker, signal.SIGKILL)
+        self.assertIn("ambrix:killed: busy.cdf: ", self.error_of(process))
+        self.assert_nothing_left()
+
+
+class TimeLimitTest(ProtectionCase):
+    def test_a_library_that_does_not_return_is_given_up(self):
+        process, worker = self.converting("--time-limit", "0.5")
+        os.kill(worker, signal.SIGSTOP)  # as if it did not return
+        self.assertRegex(self.error_of(process), "^ambrix: ambrix:timeLimitReached: busy.cdf: nothing "
+                         'was read for 0.5 seconds while reading [^;]*; .*--time-limit')
+        self.assertFalse(is_running(worker))
+        self.assert_nothing_left()
+
+    def test_work_that_goes_on_may_take_any_time(self):
+        process, worker = self.converting("--time-limit", "2.5")
+        for _ in range(4):
+            os.kill(worker, signal.SIGSTOP)
+            time.sleep(0.8)
+            os.kill(worker, signal.SIGCONT)
+            time.sleep(0.2)
+        self.assertIsNone(process.poll())
+
+    def test_time_that_the_reader_takes_does_not_count(self):
+        process = self.start("dump", BUSY, "v", "--records", "0", "--format", "csv",
+                             "--time-limit", "1.5", stdout=subprocess.PIPE)
+        process.stdout.read(1)
+        time.sleep(2.5)
+        lines = process.stdout.read().count(b"\n")
+        process.stdout.close()
+        self.assertEqual((process.wait(), lines), (0, 1_000_001))
+
+    def test_no_limit(self):
+        process, worker = self.converting("--time-limit", "0")
+        os.kill(worker, signal.SIGSTOP)
+        with self.assertRaises(subprocess.TimeoutExpired):
+            process.wait(0.5)
+
+    def test_limits_that_are_none(self):
+        for limit in ("-1", "x", ""):
+            self.assert_misused("info", BUSY, "--time-limit", limit)
+
+
+class SignalTest(ProtectionCase):
+    def test_the_tool_ends_by_the_signal_and_leaves_nothing(self):
+        for begin in (self.converting, self.dumping):
+            for number in (signal.SIGINT, signal.SIGTERM, signal.SIGHUP, signal.SIGQUIT):
+                process, worker = begin()
+                process.send_signal(number)
+                self.assertEqual(process.wait(), -number)
+                self.assertEqual(process.stderr.read(), b"")
+                self.assertFalse(os.path.exists(f"/proc/{worker}"))
+                self.assert_nothing_left()
+
+    def test_the_terminal_signals_all_processes(self):
+        process = self.start("convert", BUSY, "out.cdf", "--majority", "column",
+                             start_new_session=True)
+        wait_until(lambda: len(self.files()) > 1)
+        os.killpg(process.pid, signal.SIGINT)
+        self.assertEqual(process.wait(), -signal.SIGINT)
+        self.assert_nothing_left()
+
+    def test_ignored_signals_stay_ignored(self):
+        process = self.start(
+            "dump", BUSY, "v", "--records", "0", "--format", "csv", "--output", "out.csv",
+            preexec_fn=lambda: signal.signal(signal.SIGHUP, signal.SIG_IGN))
+        wait_until(lambda: len(self.files()) > 1)
+        process.send_signal(signal.SIGHUP)
+        self.assertEqual(process.wait(), 0)
+        self.assertEqual(self.files(), [BUSY, "out.csv"])
+
+    def test_the_worker_does_not_outlive_the_tool(self):
+        process, worker = self.converting()
+        process.kill()
+        self.assertEqual(process.wait(), -signal.SIGKILL)
+        wait_until(lambda: worker not in children_of(1) and not is_running(worker))
+        self.assertEqual([f for f in self.files() if f != BUSY],
+                         [f".ambrix-{process.pid}-unfinished.cdf"])  # nobody could remove it
+
+    def test_a_reader_that_goes_away(self):
+        process = self.start("dump", BUSY, "v", "--format", "csv", stdout=subprocess.PIPE)
+        process.stdout.read(1)
+        process.stdout.close()
+        self.assertEqual((process.wait(), process.stderr.read()), (0, b""))
+
+
+class FullDiskTest(ProtectionCase):
+    def limited(self, *arguments):
+        return self.start(*arguments, preexec_fn=lambda: resource.setrlimit(
+            resource.RLIMIT_FSIZE, (1 << 20, 1 << 20)))
+
+    def test_convert(self):
+        session = self.session()
+        (file,) = session.call("create", "large")
+        session.call("createVar", file, "v", 45, 1, [1000, 1000], True, [True, True])
+        session.call("putVarData", file, 0, 2, [0, 0], array("double", [1.5]))
+        session.call("close", file)
+        process = self.limited("convert", "large.cdf", "out.cdf", "--majority", "column")
+        self.assertIn("TOLVEX:ambrix:cdflib:libraryFailure", self.error_of(process))
+        self.assertEqual(self.files(), [BUSY, "large.cdf"])
+
+    def test_dump(self):
+        process = self.limited("dump", BUSY, "v", "--format", "csv", "--output", "out.csv")
+        self.assertIn("the output file: " + os.strerror(errno.EFBIG), self.error_of(process))
+        self.assert_nothing_left()
+        with open("/dev/full", "wb") as full:
+            process = self.start("dump", BUSY, "v", "--records", "0", stdout=full)
+        self.assertIn("standard output: " + os.strerror(errno.ENOSPC), self.error_of(process))
+
+
+class OutputTest(ProtectionCase):
+    def test_dump_into_a_file_is_what_it_prints(self):
+        write_example(self.session(), "example", "ROW_MAJOR")
+        for variable in ("cube", "texts", "fine"):
+            for form in ("table", "csv", "json"):
+                arguments = ("dump", "example.cdf", variable, "--format", form)
+                printed = self.run_tool(*arguments).stdout
+                self.assertEqual(self.output(*arguments, "--output", "out"), "")
+                with open(self.path("out"), "rb") as file:
+                    self.assertEqual(file.read(), printed)
+                os.remove(self.path("out"))
+
+    def test_no_file_is_overwritten(self):
+        message = self.assert_fails("ambrix:outputExists", "dump", BUSY, "v", "--output", BUSY)
+        self.assertIn(BUSY, message)
+        self.assert_fails("ambrix:noSuchFolder", "dump", BUSY, "v", "--output", "no/such.txt")
+        self.assert_fails("ambrix:noSuchVariable", "dump", BUSY, "w", "--output", "out.txt")
+        self.assert_nothing_left()
+
+    def test_other_folders(self):
+        os.mkdir(self.path("d\u00e9j\u00e0"))
+        out = os.path.join("d\u00e9j\u00e0", "\u6f22.csv")
+        self.assertEqual(self.output("dump", BUSY, "v", "--records", "60", "--output", out), "")
+        self.assertEqual(os.listdir(self.path("d\u00e9j\u00e0")), ["\u6f22.csv"])
+
+
+if __name__ == "__main__":
+    unittest.main()

@@ -1,0 +1,149 @@
+// Reading all that is in a file.
+#include <algorithm>
+#include <filesystem>
+#include <functional>
+#include <optional>
+#include <system_error>
+
+#include "tool/attributes.h"
+#include "tool/check.h"
+#include "tool/facts.h"
+#include "tool/failure.h"
+#include "tool/slabs.h"
+#include "tool/steps.h"
+#include "tool/text.h"
+
+namespace ambrix::tool {
+namespace {
+
+namespace fs = std::filesystem;
+
+/// No compression of the library makes values smaller by more than this; GZIP comes near it.
+constexpr double kBestCompression = 1100;
+
+std::string quoted(const char* kind, const std::string& name) {
+  return std::string(kind) + " \"" + printable(name) + '"';
+}
+
+bool isOpenFailure(const Error& error) {
+  return error.identifier() == "TOLVEX:ambrix:cdflib:fileOpenError";
+}
+
+/// Examines one file part by part: what is wrong with one part keeps no other from being read.
+class Examination {
+ public:
+  Examination(Module& module, const std::string& path) : module_(module), path_(path) { open(); }
+
+  void run() {
+    attempt("", [&] { facts_ = readFileFacts(*file_); });
+    double variables = 0;
+    double attributes = 0;
+    attempt("", [&] {
+      variables = countVariables(*file_);
+      attributes = countAttributes(*file_);
+    });
+    for (double number = 0; number < variables; ++number)
+      readVariable(number);
+    for (double number = 0; number < attributes; ++number)
+      readAttribute(number);
+    attempt("", [&] { file_->close(); });
+  }
+
+ private:
+  void open();
+  void recover();
+  void attempt(const std::string& place, const std::function<void()>& read);
+  void readVariable(double number);
+  void readValues(const VariableFacts& facts);
+  void readAttribute(double number);
+  void requireRoomFor(const VariableFacts& facts) const;
+
+  Module& module_;
+  std::string path_;
+  std::optional<CdfFile> file_;
+  FileFacts facts_;
+};
+
+void Examination::attempt(const std::string& place, const std::function<void()>& read) try {
+  read();
+} catch (const Error& error) {
+  tellProblem({place, error.identifier(), error.what()});
+  recover();
+} catch (const ToolError& error) {
+  tellProblem({place, error.identifier(), error.what()});
+}
+
+void Examination::open() {
+  file_.emplace(CdfFile::open(module_, path_));
+  file_->setReadOnly();
+}
+
+/// After some failures the library refuses everything until the file is opened anew.
+void Examination::recover() try {
+  if (file_ && file_->id()) file_->call("getFormat");
+} catch (const Error&) {
+  file_.reset();
+  open();
+}
+
+void Examination::readVariable(double number) {
+  std::string place = "variable " + std::to_string(static_cast<long>(number));
+  attempt(place, [&] {
+    place = quoted("variable", file_->text("getVarName", {number}));
+    const VariableFacts facts = readVariableFacts(module_, *file_, number);
+    if (facts.definition.supported) return readValues(facts);
+    tellUnsupported(place + " (" + facts.definition.datatype + ")");
+  });
+}
+
+void Examination::readValues(const VariableFacts& facts) {
+  requireRoomFor(facts);
+  const auto records = static_cast<std::size_t>(std::max(facts.records, 0.0));
+  SlabPlan plan(facts.definition, 0, records);
+  while (const auto slab = plan.next())
+    readSlab(*file_, facts.definition, *slab);
+}
+
+/// A file whose counts are damaged may claim to hold more than there is in the world; reading all
+/// of it would take just as long.
+void Examination::requireRoomFor(const VariableFacts& facts) const {
+  std::error_code error;
+  const fs::path path = fs::exists(path_, error) ? path_ : path_ + ".cdf";
+  const auto bytes = static_cast<double>(fs::file_size(path, error));
+  if (error || facts_.format != "SINGLE_FILE") return;
+  const bool compressed =
+      facts.compression.type != "NO_COMPRESSION" || facts_.compression.type != "NO_COMPRESSION";
+  double claimed = facts.written * static_cast<double>(facts.definition.elements);
+  for (std::size_t i = 0; i < facts.definition.sizes.size(); ++i)
+    claimed *= facts.definition.varies.at(i) ? static_cast<double>(facts.definition.sizes[i]) : 1;
+  if (claimed <= bytes * (compressed ? kBestCompression : 1)) return;
+  throw ToolError("moreThanTheFile", "the file is too small for the records that it lists");
+}
+
+void Examination::readAttribute(double number) {
+  std::string place = "attribute " + std::to_string(static_cast<long>(number));
+  attempt(place, [&] {
+    place = quoted("attribute", inquireAttribute(*file_, number).name);
+    for (const EntryFacts& entry : readAttributeFacts(module_, *file_, number).entries) {
+      if (entry.supported) continue;
+      tellUnsupported("entry " + std::to_string(static_cast<long>(entry.number)) + " of " + place +
+                      " (" + entry.datatype + ")");
+    }
+  });
+}
+
+}  // namespace
+
+void examineFile(Module& module, const std::string& path) try {
+  module.call("setValidate", {Array::scalar(constantValue(module, "VALIDATEFILEON"))});
+  Examination(module, path).run();
+} catch (const Error& error) {
+  if (!isOpenFailure(error)) throw;
+  // The module does not say why, and its advice is for those who do not know that there is a file.
+  tellProblem(
+      {"", error.identifier(),
+       "The CDF library refuses the file, which it validates as it opens it: it is "
+       "damaged, no CDF file, or of a kind that this version of the library does not take."});
+}
+
+}  // namespace ambrix::tool

@@ -1,0 +1,71 @@
+// Verdicts on their way from the worker, and to people and programs.
+#include <fmt/format.h>
+
+#include <nlohmann/json.hpp>
+#include <sstream>
+
+#include "tool/check.h"
+#include "tool/steps.h"
+#include "tool/text.h"
+
+namespace ambrix::tool {
+namespace {
+
+using Json = nlohmann::ordered_json;
+
+Json problemAsJson(const Problem& problem) {
+  return {{"place", toUtf8(problem.place)},
+          {"identifier", problem.identifier},
+          {"message", toUtf8(problem.message)}};
+}
+
+}  // namespace
+
+void tellProblem(const Problem& problem) {
+  tell(problemAsJson(problem).dump());
+}
+
+void tellUnsupported(const std::string& what) {
+  tell(Json(toUtf8(what)).dump());
+}
+
+void takeFindings(std::string_view told, Verdict& verdict) {
+  std::istringstream lines{std::string(told)};
+  for (std::string line; std::getline(lines, line);) {
+    const Json finding = Json::parse(line);
+    if (finding.is_string()) {
+      verdict.unsupported.push_back(finding);
+    } else {
+      verdict.problems.push_back(
+          {finding.at("place"), finding.at("identifier"), finding.at("message")});
+    }
+  }
+}
+
+std::string verdictAsText(const Verdict& verdict) {
+  const std::string file = printable(verdict.file);
+  std::string text = fmt::format("{}: {}\n", file, verdict.sound() ? "sound" : "not sound");
+  for (const Problem& problem : verdict.problems) {
+    text += fmt::format("    {}{}{}: {}\n", problem.place, problem.place.empty() ? "" : ": ",
+                        problem.identifier, printable(problem.message));
+  }
+  for (const std::string& what : verdict.unsupported)
+    text += fmt::format("    not supported, so not read: {}\n", what);
+  return text;
+}
+
+std::string verdictsAsJson(const std::vector<Verdict>& verdicts) {
+  Json list = Json::array();
+  for (const Verdict& verdict : verdicts) {
+    Json problems = Json::array();
+    for (const Problem& problem : verdict.problems)
+      problems.push_back(problemAsJson(problem));
+    list.push_back({{"file", toUtf8(verdict.file)},
+                    {"sound", verdict.sound()},
+                    {"problems", problems},
+                    {"unsupported", verdict.unsupported}});
+  }
+  return list.dump(2) + '\n';
+}
+
+}  // namespace ambrix::tool

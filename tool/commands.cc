@@ -1,0 +1,109 @@
+#include "tool/commands.h"
+
+#include <cstdlib>
+#include <filesystem>
+#include <functional>
+#include <optional>
+#include <string>
+
+#include "tool/check.h"
+#include "tool/exit_status.h"
+#include "tool/output_file.h"
+#include "tool/supervision.h"
+#include "tool/warnings.h"
+
+namespace ambrix::tool {
+namespace {
+
+namespace fs = std::filesystem;
+
+/// The command line and what the commands have in common.
+struct Context {
+  const CLI::App& parser;
+  const Arguments& arguments;
+  StandardOutput& output;
+};
+
+/// Reads the file in a worker, which writes to the output as this process would.
+int readInWorker(const Context& context, const std::string& file,
+                 const std::function<void(Module&)>& read) {
+  const double timeLimit = context.arguments.timeLimit;
+  const auto work = [&] {
+    Module module;
+    module.setWarningHandler(printWarning);
+    setByteLimit(kSessionArrayBytes);
+    read(module);
+    context.output.flush();
+    return EXIT_SUCCESS;
+  };
+  const WorkerEnd end = supervise(timeLimit, [&] { return exitStatusOf(context.parser, work); });
+  return statusOf(end, timeLimit, file);
+}
+
+int info(const Context& context) {
+  const InfoOptions& options = context.arguments.info;
+  return readInWorker(context, options.file,
+                      [&](Module& module) { runInfo(module, options, context.output); });
+}
+
+int dump(const Context& context) {
+  DumpOptions options = context.arguments.dump;
+  const std::string file = options.file;
+  options.file = fs::absolute(file).string();  // the folder changes to that of the output
+  std::optional<OutputFile> output;
+  if (!options.output.empty()) output.emplace(options.output);
+  const int status = readInWorker(context, file, [&](Module& module) {
+    if (output) context.output.redirect(output->temporaryName());
+    runDump(module, options, context.output);
+  });
+  if (output && status == EXIT_SUCCESS) output->publish();
+  return status;
+}
+
+int convert(const Context& context) {
+  ConvertOptions options = context.arguments.convert;
+  checkOptions(options);
+  const std::string file = options.input;
+  options.input = fs::absolute(file).string();  // parts of it may be opened later
+  OutputFile output(chooseOutput(options.output), ".cdf");
+  const int status = readInWorker(
+      context, file, [&](Module& module) { runConvert(module, options, output.temporaryName()); });
+  if (status == EXIT_SUCCESS) output.publish();
+  return status;
+}
+
+int call(const Context& context) {
+  Module module;
+  module.setWarningHandler(printWarning);
+  runCall(module, context.arguments.call, context.output);
+  return EXIT_SUCCESS;
+}
+
+int session(const Context& context) {
+  runSession(context.arguments.maxArrayBytes, context.output);
+  return EXIT_SUCCESS;
+}
+
+int check(const Context& context) {
+  const CheckOptions& options = context.arguments.check;
+  return runCheck(options, context.arguments.timeLimit, context.output);
+}
+
+struct Command {
+  const char* name;
+  int (*run)(const Context&);
+};
+
+constexpr Command kCommands[] = {{"info", info},       {"dump", dump}, {"check", check},
+                                 {"convert", convert}, {"call", call}, {"session", session}};
+
+}  // namespace
+
+int runCommand(const CLI::App& parser, const Arguments& arguments, StandardOutput& output) {
+  const std::string name = parser.get_subcommands().front()->get_name();
+  for (const Command& command : kCommands)
+    if (name == command.name) return command.run({parser, arguments, output});
+  return EXIT_FAILURE;  // the parser knows no other
+}
+
+}  // namespace ambrix::tool

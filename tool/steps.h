@@ -1,0 +1,63 @@
+// What a worker is at: it writes this into memory that it shares with the process watching it.
+#pragma once
+
+#include <array>
+#include <atomic>
+#include <cstddef>
+#include <cstdint>
+#include <string>
+#include <string_view>
+
+namespace ambrix::tool {
+
+/// Says what begins now, "reading variable 3" for example. The clock of the time limit starts
+/// anew. Without a watcher, none of what is here does anything.
+void beginStep(std::string_view what);
+
+/// Leaves a line for the watcher, who finds it however the worker ends. Returns whether there was
+/// room for it.
+bool tell(std::string_view line);
+
+/// While one of these exists no time counts, because the worker waits for somebody else.
+class Pause {
+ public:
+  Pause() noexcept;
+  Pause(const Pause&) = delete;
+  Pause& operator=(const Pause&) = delete;
+  ~Pause();
+};
+
+/// The shared memory. The watcher reads the texts when the worker is gone.
+class Steps {
+ public:
+  Steps();
+  Steps(const Steps&) = delete;
+  Steps& operator=(const Steps&) = delete;
+  ~Steps();
+
+  /// Makes this process the one that is watched.
+  void adopt() const noexcept;
+  /// Says that the work has been done to its end.
+  void finish() const noexcept;
+
+  [[nodiscard]] bool finished() const noexcept;
+  [[nodiscard]] bool paused() const noexcept;
+  /// How many steps have begun.
+  [[nodiscard]] std::uint32_t count() const noexcept;
+  [[nodiscard]] std::string last() const;
+  [[nodiscard]] std::string told() const;
+
+  struct Memory {
+    std::atomic<std::uint32_t> count;
+    std::atomic<std::uint32_t> pauses;
+    std::atomic<bool> finished;
+    std::array<char, 1024> last;
+    std::size_t toldBytes;
+    std::array<char, 1 << 18> told;
+  };
+
+ private:
+  Memory* memory_;
+};
+
+}  // namespace ambrix::tool

@@ -1,0 +1,173 @@
+#include "tool/supervision.h"
+
+#include <fmt/format.h>
+#include <sys/resource.h>
+#include <sys/wait.h>
+#include <unistd.h>
+#ifdef __linux__
+#include <sys/prctl.h>
+#endif
+
+#include <cerrno>
+#include <chrono>
+#include <csignal>
+#include <cstdio>
+#include <cstdlib>
+#include <cstring>
+#include <system_error>
+
+#include "tool/failure.h"
+#include "tool/held_signals.h"
+#include "tool/standard_output.h"
+#include "tool/steps.h"
+#include "tool/text.h"
+
+namespace ambrix::tool {
+namespace {
+
+using Kind = WorkerEnd::Kind;
+
+constexpr std::chrono::milliseconds kTick(100);
+
+/// Dies with its watcher, leaves no core file, and takes a file that has become too large for an
+/// error of writing.
+void prepareWorker(pid_t watcher) {
+#ifdef __linux__
+  ::prctl(PR_SET_PDEATHSIG, SIGKILL);
+#endif
+  if (::getppid() != watcher) ::_exit(EXIT_FAILURE);
+  const rlimit none = {0, 0};
+  ::setrlimit(RLIMIT_CORE, &none);
+  std::signal(SIGXFSZ, SIG_IGN);
+}
+
+/// Counts the time in which a worker gets nowhere. It counts ticks, so that the time in which this
+/// process was stopped is left out.
+class Patience {
+ public:
+  Patience(double seconds, const Steps& steps) : left_(seconds), limit_(seconds), steps_(steps) {}
+
+  /// Returns whether it is over.
+  bool tick() {
+    if (steps_.paused() || steps_.count() != step_) left_ = limit_;
+    step_ = steps_.count();
+    left_ -= std::chrono::duration<double>(kTick).count();
+    return limit_ > 0 && left_ <= 0;
+  }
+
+ private:
+  double left_;
+  double limit_;
+  const Steps& steps_;
+  std::uint32_t step_ = 0;
+};
+
+int waitFor(pid_t worker, int options, bool& gone) {
+  int status = 0;
+  pid_t answer = 0;
+  do {
+    answer = ::waitpid(worker, &status, options);
+  } while (answer < 0 && errno == EINTR);
+  gone = answer == worker;
+  return status;
+}
+
+WorkerEnd giveUp(pid_t worker, Kind kind, int signal) {
+  bool gone = false;
+  ::kill(worker, SIGKILL);
+  waitFor(worker, 0, gone);
+  WorkerEnd end;
+  end.kind = kind;
+  end.signal = signal;
+  return end;
+}
+
+WorkerEnd endOf(int status, const Steps& steps) {
+  WorkerEnd end;
+  if (WIFEXITED(status)) {
+    end.kind = steps.finished() ? Kind::kDone : Kind::kQuit;
+    end.status = WEXITSTATUS(status);
+  } else {
+    end.signal = WTERMSIG(status);
+    end.kind = isEndingSignal(end.signal) ? Kind::kInterrupted
+               : end.signal == SIGKILL    ? Kind::kKilled
+                                          : Kind::kCrashed;
+  }
+  return end;
+}
+
+WorkerEnd watch(pid_t worker, const HeldSignals& held, const Steps& steps, double timeLimit) {
+  const timespec tick = {0, std::chrono::nanoseconds(kTick).count()};
+  Patience patience(timeLimit, steps);
+  for (;;) {
+    const int signal = ::sigtimedwait(&held.all(), nullptr, &tick);
+    if (isEndingSignal(signal)) return giveUp(worker, Kind::kInterrupted, signal);
+    bool gone = false;
+    const int status = waitFor(worker, WNOHANG, gone);
+    if (gone) return endOf(status, steps);
+    if (signal < 0 && patience.tick()) return giveUp(worker, Kind::kTooSlow, SIGKILL);
+  }
+}
+
+}  // namespace
+
+WorkerEnd supervise(double timeLimit, const std::function<int()>& work) {
+  const HeldSignals held;
+  const Steps steps;
+  const pid_t watcher = ::getpid();
+  const pid_t worker = ::fork();
+  if (worker < 0) throw std::system_error(errno, std::generic_category(), "fork");
+  if (worker == 0) {
+    prepareWorker(watcher);
+    held.release();
+    steps.adopt();
+    const int status = work();
+    steps.finish();
+    std::exit(status);
+  }
+  WorkerEnd end = watch(worker, held, steps, timeLimit);
+  end.step = steps.last();
+  end.told = steps.told();
+  if (end.kind == Kind::kInterrupted) std::raise(end.signal);
+  return end;
+}
+
+std::string describeEnd(const WorkerEnd& end, double timeLimit) {
+  const std::string during = end.step.empty() ? "" : " while " + end.step;
+  switch (end.kind) {
+    case Kind::kCrashed:
+      return fmt::format("the CDF library crashed ({}){}", ::strsignal(end.signal), during);
+    case Kind::kQuit:
+      return "the CDF library ended the process" + during;
+    case Kind::kKilled:
+      return "the process was killed" + during + ", perhaps for want of memory";
+    case Kind::kTooSlow:
+      return fmt::format("nothing was read for {} seconds{}", timeLimit, during);
+    case Kind::kInterrupted:
+      return "it was interrupted" + during;
+    case Kind::kDone:
+      break;
+  }
+  return "all of it was done";
+}
+
+std::string identifierOf(const WorkerEnd& end) {
+  if (end.kind == Kind::kTooSlow) return "timeLimitReached";
+  if (end.kind == Kind::kKilled) return "killed";
+  return "libraryCrashed";
+}
+
+int statusOf(const WorkerEnd& end, double timeLimit, const std::string& file) {
+  if (end.kind == Kind::kDone) return end.status;
+  if (end.kind == Kind::kInterrupted) return kExitFailure;
+  if (errorIsTerminal()) std::fputs("\r\033[K", stderr);  // where a progress bar was
+  const char* const advice =
+      end.kind == Kind::kTooSlow  ? "the file may be damaged, see 'ambrix check'; --time-limit "
+                                    "allows more time"
+      : end.kind == Kind::kKilled ? "there is no complete output"
+                                  : "the file is probably damaged, see 'ambrix check'";
+  throw ToolError(identifierOf(end),
+                  printable(file) + ": " + describeEnd(end, timeLimit) + "; " + advice);
+}
+
+}  // namespace ambrix::tool
