@@ -3,14 +3,11 @@
 import itertools
 import json
 import os
-import signal
-import subprocess
-import time
 import unittest
 
 from support.ambrix_session import array
 from tool.example_file import write_example
-from tool.support import TOOL, ToolCase, sample
+from tool.support import ToolCase, sample
 
 SETTINGS = ("version", "encoding", "file", "majority", "compression", "checksum")
 
@@ -179,24 +176,6 @@ class RefusalTest(ConvertCase):
             self.assert_misused("convert", "example.cdf", "out.cdf", *options)
         self.assert_misused("convert", "example.cdf")
         self.assertEqual(self.files(), ["example.cdf"])
-
-
-class InterruptionTest(ConvertCase):
-    def test_nothing_stays_behind(self):
-        session = self.session()
-        (file,) = session.call("create", "example")
-        session.call("createVar", file, "v", 45, 1, [1000, 1000], True, [True, True])
-        session.call("putVarData", file, 0, 60, [0, 0], array("double", [1.5]))
-        session.call("close", file)
-        for number in (signal.SIGINT, signal.SIGTERM):
-            process = subprocess.Popen([TOOL, "convert", "example.cdf", "out.cdf",
-                                        "--majority", "column"], cwd=self.folder)
-            deadline = time.monotonic() + 30
-            while len(self.files()) < 2 and time.monotonic() < deadline:
-                time.sleep(0.001)
-            process.send_signal(number)
-            self.assertEqual(process.wait(), -number)
-            self.assertEqual(self.files(), ["example.cdf"])
 
 
 if __name__ == "__main__":
