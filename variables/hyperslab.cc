@@ -1,6 +1,7 @@
 #include "variables/hyperslab.h"
 
 #include <algorithm>
+#include <cstddef>
 
 #include "gateway/arguments.h"
 
@@ -11,6 +12,16 @@ namespace {
 /// within them, so 64 bits hold the result.
 bool wraps(long start, long count, long interval) {
   return start >= 0 && count >= 1 && interval >= 1 && !fitsLibrary(start + (count - 1) * interval);
+}
+
+/// Whether the library moves a record of the hyperslab in one piece.
+bool takesWholeRecords(const VariableDescription& variable, const LibraryHyperslab& slab) {
+  for (std::size_t i = 0; i < variable.sizes().size(); ++i) {
+    const bool whole = variable.variances()[i] == NOVARY ? slab.count[i] <= 1
+                                                         : slab.count[i] == variable.sizes()[i];
+    if (!whole) return false;
+  }
+  return true;
 }
 
 }  // namespace
@@ -44,6 +55,14 @@ LibraryHyperslab::LibraryHyperslab(const Hyperslab& slab, std::span<const long> 
     if (!wraps(start[i], count[i], interval[i])) continue;
     start[i] = sizes[i];
     interval[i] = 1;
+  }
+}
+
+void requireNoRecordsBetween(const VariableDescription& variable, const LibraryHyperslab& slab,
+                             const char* routine) {
+  const bool skips = slab.recordCount > 1 && slab.recordInterval > 1;
+  if (variable.recordVariance == NOVARY && skips && takesWholeRecords(variable, slab)) {
+    raiseLibraryFailure(BAD_REC_INTERVAL, routine);
   }
 }
 

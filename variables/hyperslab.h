@@ -7,6 +7,7 @@
 #include "gateway/library.h"
 #include "host/qv.h"
 #include "variables/host_dimensions.h"
+#include "variables/variable_description.h"
 
 namespace TOLVEX::ambrix {
 
@@ -39,6 +40,11 @@ struct LibraryHyperslab {
   DimensionVector count;
   DimensionVector interval;
 };
+
+/// Of a variable whose records do not vary the library reads whole records with all those between
+/// them, more than were asked for: refuses, as its bad record interval, to skip records there.
+void requireNoRecordsBetween(const VariableDescription& variable, const LibraryHyperslab& slab,
+                             const char* routine);
 
 /// Selects the variable and the hyperslab, then performs GET_ or PUT_ of `zVAR_HYPERDATA_`.
 void moveHyperslab(const char* routine, CdfId file, long variable, const LibraryHyperslab& slab,

@@ -123,6 +123,28 @@ TEST_F(ReadHyperslabTest, ADamagedDescriptionIsRefusedInTheLibrarysWords) {
   EXPECT_EQ(errorWith({0, 0}, {1, 1}, {1, 1}), libraryFailure("CDFhyperGetzVarData", -2004));
 }
 
+TEST_F(ReadHyperslabTest, RecordsThatDoNotVaryCannotBeSkipped) {
+  const std::string error = libraryFailure("CDFhyperGetzVarData", -2038);
+  const auto errorOfWhole = [this](int records, int interval) {
+    return errorOf("hyperGetVarData", {file(), 3, 0, records, interval, {0, 0}, {2, 1}, {1, 1}});
+  };
+  describe({.sizes = {2, 3}, .variances = {-1, 0}, .recordVariance = 0});
+  EXPECT_EQ(errorOfWhole(3, 2), error);
+  EXPECT_EQ(errorOfWhole(3, 1), "no error");
+  EXPECT_EQ(errorOfWhole(1, 2), "no error");
+  describe({.sizes = {2, 3}, .variances = {-1, 0}, .recordVariance = -1});
+  EXPECT_EQ(errorOfWhole(3, 2), "no error");
+}
+
+TEST_F(ReadHyperslabTest, ButPartsOfThemCan) {
+  describe({.sizes = {2, 3}, .variances = {-1, 0}, .recordVariance = 0});
+  const Given skips = 2;
+  EXPECT_EQ(errorOf("hyperGetVarData", {file(), 3, 0, 3, skips, {0, 0}, {1, 1}, {1, 1}}),
+            "no error");
+  EXPECT_EQ(errorOf("hyperGetVarData", {file(), 3, 0, 3, skips, {0, 0}, {2, 2}, {1, 1}}),
+            "no error");
+}
+
 TEST_F(ReadHyperslabTest, ArgumentsAreConvertedInOrderUnderTheirLabels) {
   const Given x = "x", cell = Array::cell({1, 1});
   const auto error = [&](const Arguments& arguments) {
