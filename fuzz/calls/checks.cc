@@ -1,0 +1,215 @@
+#include "fuzz/calls/checks.h"
+
+#include <algorithm>
+#include <iterator>
+#include <set>
+#include <string_view>
+#include <variant>
+
+#include "fuzz/calls/call_log.h"
+#include "fuzz/calls/values.h"
+#include "gateway/open_file_registry.h"
+
+namespace ambrix_fuzz {
+namespace {
+
+/// An identifier and the kinds of its values: i for integer, t for narrow text.
+struct KnownError {
+  const char* identifier;
+  std::string_view values;
+};
+
+constexpr KnownError kErrors[] = {
+    {"TOLVEX:ambrix:cdflib:badDimSpec", "it"},
+    {"TOLVEX:ambrix:cdflib:badDimensionExtent", "ti"},
+    {"TOLVEX:ambrix:cdflib:badEpoch16Modulus", ""},
+    {"TOLVEX:ambrix:cdflib:badEpochVector", "i"},
+    {"TOLVEX:ambrix:cdflib:badPutAttrEntryDatatype", "tt"},
+    {"TOLVEX:ambrix:cdflib:badVarianceDatatype", ""},
+    {"TOLVEX:ambrix:cdflib:cannotOmitDimSpec", ""},
+    {"TOLVEX:ambrix:cdflib:datatypeMismatch", "tt"},
+    {"TOLVEX:ambrix:cdflib:dimSizeTooLarge", ""},
+    {"TOLVEX:ambrix:cdflib:fileCreateError", ""},
+    {"TOLVEX:ambrix:cdflib:fileOpenError", ""},
+    {"TOLVEX:ambrix:cdflib:illegalEpochValue", ""},
+    {"TOLVEX:ambrix:cdflib:invalidCharError", ""},
+    {"TOLVEX:ambrix:cdflib:invalidCompressionParameter", "it"},
+    {"TOLVEX:ambrix:cdflib:invalidFileId", ""},
+    {"TOLVEX:ambrix:cdflib:invalidOperation", "t"},
+    {"TOLVEX:ambrix:cdflib:libraryFailure", "tt"},
+    {"TOLVEX:ambrix:cdflib:mismatchedVarianceSize", "ii"},
+    {"TOLVEX:ambrix:cdflib:unrecognizedConstantName", "t"},
+    {"TOLVEX:ambrix:cdflib:unrecognizedValue", "it"},
+    {"TOLVEX:ambrix:cdflib:unspecifiedGzipCompressionLevel", ""},
+    {"TOLVEX:ambrix:cdflib:varCacheSizeOpInappropriate", ""},
+    {"TOLVEX:ambrix:cdflib:wrongNumberOfHyperPutVarDataElements", "titi"},
+    {"TOLVEX:ambrix:cdflib:wrongNumberOfPadValueElements", "ti"},
+    {"TOLVEX:ambrix:cdflib:wrongNumberOfPutVarDataElements", "ti"},
+    {"TOLVEX:ambrix:cdflib:wrongNumberOfPutVarRecordDataElements", "ti"},
+    {"TOLVEX:ambrix:cdflib:closingFileHandle", ""},
+    {"TOLVEX:ambrix:validate:argumentNotDoublePrecision", "t"},
+    {"TOLVEX:ambrix:validate:argumentNotDoubleScalar", "t"},
+    {"TOLVEX:ambrix:validate:argumentNotUint64Scalar", "t"},
+    {"TOLVEX:ambrix:validate:argumentOutOfBounds", ""},
+    {"TOLVEX:ambrix:validate:wrongNumberOfInputs", ""},
+    {"TOLVEX:host:badDimension", ""},
+    {"TOLVEX:host:outOfMemory", ""},
+    {"not text", ""},
+};
+static_assert(std::size(kErrors) <= kMostErrors);
+
+constexpr std::size_t kMostDimensions = 10;
+constexpr std::size_t kMostStatusText = 200;
+
+std::string kindsOf(const std::vector<ambrix::MessageArg>& values) {
+  std::string kinds;
+  for (const ambrix::MessageArg& value : values)
+    kinds += "itu"[value.index()];
+  return kinds;
+}
+
+bool isMatrix(ArrayView array, ClassId classId, std::size_t rows) {
+  return array.classId() == classId && array.size().size() == 2 && array.size()[0] == rows;
+}
+
+bool isScalar(ArrayView array, ClassId classId) {
+  return isMatrix(array, classId, 1) && array.elementCount() == 1;
+}
+
+bool isEmptyMatrix(ArrayView array, ClassId classId) {
+  return isMatrix(array, classId, 0) && array.size()[1] == 0;
+}
+
+bool isText(ArrayView array) {
+  return isMatrix(array, ClassId::kChar, 1) || isEmptyMatrix(array, ClassId::kChar);
+}
+
+bool isPerDimension(ArrayView array, ClassId classId) {
+  const bool row = isMatrix(array, classId, 1) && array.elementCount() > 0;
+  return (row || isEmptyMatrix(array, classId)) && array.elementCount() <= kMostDimensions;
+}
+
+bool isNames(ArrayView array) {
+  if (!isMatrix(array, ClassId::kCell, 57) || array.elementCount() != 57) return false;
+  for (std::size_t i = 0; i < 57; ++i) {
+    if (!array.element(i) || !isText(array.element(i))) return false;
+  }
+  return true;
+}
+
+bool isValue(ArrayView array) {
+  constexpr ClassId kNever[] = {ClassId::kUnknown, ClassId::kCell, ClassId::kLogical,
+                                ClassId::kInt64, ClassId::kUint64};
+  return std::ranges::find(kNever, array.classId()) == std::end(kNever);
+}
+
+bool isSane(char letter, ArrayView array) {
+  switch (letter) {
+    case 'h':
+      return isScalar(array, ClassId::kUint64);
+    case 'd':
+      return isScalar(array, ClassId::kDouble);
+    case 't':
+      return isText(array);
+    case 'r':
+      return isPerDimension(array, ClassId::kDouble);
+    case 'l':
+      return isScalar(array, ClassId::kLogical);
+    case 'L':
+      return isPerDimension(array, ClassId::kLogical);
+    case 'c':
+      return isNames(array);
+    case 'p':  // of a compression
+      return isText(array) || isScalar(array, ClassId::kDouble) ||
+             isEmptyMatrix(array, ClassId::kDouble);
+    case 'v':
+      return isValue(array);
+    case '0':  // components of an epoch16, over any further dimensions
+      return array.classId() == ClassId::kDouble && array.size()[0] == 10;
+    default:
+      return isMatrix(array, ClassId::kDouble, static_cast<std::size_t>(letter - '0'));
+  }
+}
+
+std::size_t arraysIn(ArrayView array) {
+  std::size_t count = 1;
+  if (array.classId() != ClassId::kCell) return count;
+  for (std::size_t i = 0; i < array.elementCount(); ++i)
+    count += array.element(i) ? arraysIn(array.element(i)) : 0;
+  return count;
+}
+
+}  // namespace
+
+std::size_t knownErrors() {
+  return std::size(kErrors);
+}
+
+const char* errorName(std::size_t place) {
+  return kErrors[place].identifier;
+}
+
+std::size_t placeOfNotText() {
+  return std::size(kErrors) - 1;
+}
+
+std::size_t requireKnown(const ambrix::MessageId& error) {
+  const std::string identifier = error.fullIdentifier();
+  const auto* found = std::ranges::find_if(
+      kErrors, [&identifier](const KnownError& row) { return identifier == row.identifier; });
+  if (found == std::end(kErrors)) violation("no such error: " + identifier);
+  const std::string kinds = kindsOf(error.values);
+  if (kinds != found->values) violation(identifier + " with values of kinds " + kinds);
+  if (identifier.ends_with("libraryFailure")) {
+    const auto& routine = std::get<std::string>(error.values[0]);
+    const auto& text = std::get<std::string>(error.values[1]);
+    const bool sane = routine.starts_with("CDF") && text.size() <= kMostStatusText;
+    if (!sane) violation("libraryFailure of " + routine + ": " + text);
+  }
+  return static_cast<std::size_t>(found - kErrors);
+}
+
+void requireSane(const Command& command, const std::vector<Array>& results, std::size_t outputs) {
+  const std::string_view expected = command.results;
+  if (results.size() != std::min(outputs, expected.size())) {
+    violation(command.name + std::string(" has ") + std::to_string(results.size()) + " results");
+  }
+  for (std::size_t i = 0; i < results.size(); ++i) {
+    if (isSane(expected[i], results[i])) continue;
+    violation(command.name + std::string(" returns ") + shown(results[i]));
+  }
+}
+
+void requireElements(const char* command, ArrayView value, const Variable& variable,
+                     std::size_t values) {
+  const auto elements = static_cast<std::size_t>(isText(variable.datatype) ? variable.elements : 1);
+  const std::size_t expected = values * (variable.datatype == 32 ? 2 : elements);
+  const bool fits =
+      value.classId() == classOfDatatype(variable.datatype) && value.elementCount() == expected;
+  if (fits) return;
+  violation(command + std::string(" returns ") + shown(value) + " for " + std::to_string(expected) +
+            " elements of datatype " + std::to_string(variable.datatype));
+}
+
+void requireNothingLeft(const ambrix::LiveCounts& before, const std::vector<Array>& results) {
+  ambrix::LiveCounts expected = before;
+  for (const Array& result : results)
+    expected.arrays += arraysIn(result);
+  const ambrix::LiveCounts now = ambrix::liveCounts();
+  if (now == expected) return;
+  violation("alive: " + std::to_string(now.arrays) + " arrays of " +
+            std::to_string(expected.arrays) + ", " + std::to_string(now.scratch) +
+            " scratch buffers of " + std::to_string(expected.scratch));
+}
+
+void requireOpen(const World& world) {
+  std::set<std::uint64_t> open;
+  for (const TOLVEX::ambrix::CdfId file : TOLVEX::ambrix::openFileRegistry().files())
+    open.insert(static_cast<std::uint64_t>(file));
+  if (open != world.openIds()) {
+    violation("the registry has " + std::to_string(open.size()) + " files, not the " +
+              std::to_string(world.openIds().size()) + " that are open");
+  }
+}
+
+}  // namespace ambrix_fuzz

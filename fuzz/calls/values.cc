@@ -1,0 +1,174 @@
+#include "fuzz/calls/values.h"
+
+#include <algorithm>
+#include <array>
+#include <cmath>
+#include <cstdio>
+#include <cstring>
+#include <iterator>
+#include <limits>
+#include <vector>
+
+namespace ambrix_fuzz {
+namespace {
+
+constexpr double kInfinity = std::numeric_limits<double>::infinity();
+
+constexpr double kNumbers[] = {
+    0.0,          1.0,          -1.0,         2.0,           3.0,           5.0,
+    0.5,          -0.5,         -1.9,         9.0,           10.0,          11.0,
+    12.0,         33.0,         51.0,         100.0,         255.0,         65536.0,
+    2147483646.0, 2147483647.0, 2147483648.0, -2147483648.0, -2147483649.0, 4294967295.0,
+    4294967296.0, 4294967299.0, 0x1p53,       0x1p62,        -0x1p62,       0x1.fffffffffffffp62,
+    0x1p63,       -0x1p63,      1e19,         1e300,         -1e31,         5e-324,
+    kInfinity,    -kInfinity,   std::nan(""),
+};
+
+constexpr ClassId kClasses[] = {
+    ClassId::kCell,   ClassId::kLogical, ClassId::kChar,   ClassId::kDouble, ClassId::kSingle,
+    ClassId::kInt8,   ClassId::kUint8,   ClassId::kInt16,  ClassId::kUint16, ClassId::kInt32,
+    ClassId::kUint32, ClassId::kInt64,   ClassId::kUint64,
+};
+
+using Shape = std::vector<std::size_t>;
+const Shape kShapes[] = {{1, 1},    {1, 1},    {0, 0},
+                         {1, 0},    {0, 5},    {1, 2},
+                         {2, 1},    {1, 3},    {3, 4},
+                         {1, 7},    {10, 1},   {1, 11},
+                         {2, 3},    {1, 70},   {2, 10},
+                         {1, 1, 2}, {2, 3, 4}, {1, 257},
+                         {2, 0},    {1, 1000}, {2, 1, 1, 1, 1, 1, 1, 1, 1, 1, 1, 3}};
+
+constexpr char16_t kUnits[] = {u'a', u'b', u'v', u'V',   u'_',   u'0',   u'9',   u' ',   u'.', 0, 1,
+                               0x7F, 0x80, 0xE9, 0x20AC, 0xD83D, 0xDE00, 0xD800, 0xFFFF, u'\n'};
+
+template <typename T>
+void fillNumbers(Choices& choices, Array& array) {
+  for (T& element : array.mutableData<T>())
+    element = static_cast<T>(anyNumber(choices));
+}
+
+void fillBytes(Choices& choices, Array& array) {
+  const auto bytes = array.bytes();
+  auto* place = const_cast<std::byte*>(bytes.data());
+  const std::size_t some = std::min<std::size_t>(bytes.size(), 24);
+  for (std::size_t i = 0; i < some; ++i)
+    place[i] = static_cast<std::byte>(choices.byte());
+}
+
+void fill(Choices& choices, Array& array) {
+  switch (array.classId()) {
+    case ClassId::kCell:
+      if (array.elementCount() > 0) array.setElement(0, Array::scalar(1.0));
+      break;
+    case ClassId::kLogical:
+      for (bool& element : array.mutableData<bool>())
+        element = choices.byte() % 2 == 0;
+      break;
+    case ClassId::kDouble:
+      fillNumbers<double>(choices, array);
+      break;
+    default:
+      fillBytes(choices, array);
+  }
+}
+
+struct Datatype {
+  long code;
+  ClassId classId;
+  std::size_t bytes;
+};
+
+constexpr Datatype kDatatypes[] = {
+    {1, ClassId::kInt8, 1},     {2, ClassId::kInt16, 2},   {4, ClassId::kInt32, 4},
+    {11, ClassId::kUint8, 1},   {12, ClassId::kUint16, 2}, {14, ClassId::kUint32, 4},
+    {21, ClassId::kSingle, 4},  {22, ClassId::kDouble, 8}, {31, ClassId::kDouble, 8},
+    {32, ClassId::kDouble, 16}, {41, ClassId::kInt8, 1},   {44, ClassId::kSingle, 4},
+    {45, ClassId::kDouble, 8},  {51, ClassId::kChar, 1},   {52, ClassId::kChar, 1},
+};
+
+const Datatype* findDatatype(long code) {
+  const auto* found =
+      std::ranges::find_if(kDatatypes, [code](const Datatype& row) { return row.code == code; });
+  return found == std::end(kDatatypes) ? nullptr : found;
+}
+
+std::string shownNumber(double number) {
+  std::array<char, 32> text{};
+  std::snprintf(text.data(), text.size(), "%.17g", number);
+  return text.data();
+}
+
+std::string shownElement(ArrayView array, std::size_t index) {
+  if (array.classId() == ClassId::kDouble) return shownNumber(array.data<double>()[index]);
+  if (array.classId() == ClassId::kUint64)
+    return std::to_string(array.data<std::uint64_t>()[index]);
+  if (array.classId() == ClassId::kLogical) return array.data<bool>()[index] ? "true" : "false";
+  return "?";
+}
+
+}  // namespace
+
+double anyNumber(Choices& choices) {
+  const std::size_t at = choices.below(std::size(kNumbers) + 4);
+  if (at < std::size(kNumbers)) return kNumbers[at];
+  const std::uint64_t word = choices.word();
+  double number = 0;
+  std::memcpy(&number, &word, sizeof number);
+  return number;
+}
+
+std::u16string anyText(Choices& choices) {
+  constexpr std::size_t kLengths[] = {0, 1, 2, 3, 5, 8, 40, 255, 256, 257, 300, 5000};
+  std::u16string text(choices.pick(kLengths), u'x');
+  const std::size_t some = std::min<std::size_t>(text.size(), 8);
+  for (std::size_t i = 0; i < some; ++i)
+    text[i] = kUnits[choices.below(std::size(kUnits))];
+  return text;
+}
+
+Array anyArray(Choices& choices) {
+  if (choices.oneIn(4)) return Array::scalar(anyNumber(choices));
+  if (choices.oneIn(4)) return Array::text(anyText(choices));
+  Array array = Array::zeros(choices.pick(kClasses), choices.pick(kShapes));
+  fill(choices, array);
+  return array;
+}
+
+Array valuesOf(Choices& choices, ClassId classId, std::size_t count) {
+  Array array = Array::zeros(classId, {1, count});
+  fillBytes(choices, array);
+  return array;
+}
+
+ClassId classOfDatatype(long datatype) {
+  const Datatype* found = findDatatype(datatype);
+  return found == nullptr ? ClassId::kUnknown : found->classId;
+}
+
+std::size_t bytesOfDatatype(long datatype) {
+  const Datatype* found = findDatatype(datatype);
+  return found == nullptr ? 0 : found->bytes;
+}
+
+bool isText(long datatype) {
+  return datatype == 51 || datatype == 52;
+}
+
+std::string shown(ArrayView array) {
+  constexpr std::size_t kSome = 8;
+  const std::size_t count = array.elementCount();
+  if (array.classId() == ClassId::kChar && count <= 24) return '\'' + array.utf8() + '\'';
+  std::string text;
+  if (array.classId() != ClassId::kDouble) text = array.className() + std::string(" ");
+  if (count == 1) return text + shownElement(array, 0);
+  const auto sizes = array.size();
+  for (std::size_t i = 0; i < sizes.size(); ++i)
+    text += (i == 0 ? "" : "-by-") + std::to_string(sizes[i]);
+  text += " [";
+  for (std::size_t i = 0; i < std::min(count, kSome); ++i)
+    text += (i == 0 ? "" : " ") + shownElement(array, i);
+  return text + (count > kSome ? " ...]" : "]");
+}
+
+}  // namespace ambrix_fuzz
