@@ -76,4 +76,8 @@ endfunction
 
 %!error id=TOLVEX:ambrix:cdflib:fileOpenError ambrix.info ("no such file")
 %!error id=ambrix:invalidFile ambrix.info (1)
-%!error <Invalid call> ambrix.info ()
+%!test
+%! folder = cd (tempdir ());  # the usage text is made with functions that `pkg test` hides here
+%! err = ambrix.internal.raised (@() ambrix.info ());
+%! cd (folder);
+%! assert (err.identifier, "Octave:invalid-fun-call");

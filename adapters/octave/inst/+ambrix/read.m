@@ -201,4 +201,8 @@ endfunction
 %!error id=ambrix:invalidOption ambrix.read (file, "Flux", "range", [0, 1]);
 %!error id=ambrix:invalidOption ambrix.read (file, "Flux", "range", [1, 3]);
 %!error id=ambrix:invalidOption ambrix.read (file, "Flux", "range", [1, 2, 0]);
-%!error <Invalid call> ambrix.read ()
+%!test
+%! folder = cd (tempdir ());  # the usage text is made with functions that `pkg test` hides here
+%! err = ambrix.internal.raised (@() ambrix.read ());
+%! cd (folder);
+%! assert (err.identifier, "Octave:invalid-fun-call");

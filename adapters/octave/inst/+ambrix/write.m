@@ -226,4 +226,8 @@ endfunction
 %!error id=ambrix:invalidData ambrix.write ("x", 1)
 %!error id=ambrix:invalidOption ambrix.write ("x", struct (), "force")
 %!error id=TOLVEX:ambrix:cdflib:fileCreateError ambrix.write ("/no such folder/x", struct ("a", 1))
-%!error <Invalid call> ambrix.write ("x")
+%!test
+%! folder = cd (tempdir ());  # the usage text is made with functions that `pkg test` hides here
+%! err = ambrix.internal.raised (@() ambrix.write ("x"));
+%! cd (folder);
+%! assert (err.identifier, "Octave:invalid-fun-call");

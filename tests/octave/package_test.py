@@ -1,0 +1,146 @@
+"""The package for Octave, made, installed and tested as its users do, offline and from nothing."""
+import os
+import pathlib
+import re
+import shutil
+import subprocess
+import tarfile
+import tempfile
+import unittest
+
+ROOT = pathlib.Path(__file__).resolve().parents[2]
+OCTAVE = os.environ["AMBRIX_OCTAVE_CLI"]
+SAMPLES = os.environ["AMBRIX_CDF_SAMPLES"]
+# Whether processes can be started without a network here.
+OFFLINE = ["unshare", "-rn"] if not shutil.which("unshare") or subprocess.run(
+    ["unshare", "-rn", "true"], stderr=subprocess.DEVNULL, check=False).returncode == 0 else []
+NOTHING_SET = {"PATH": "/usr/bin:/bin"}
+
+
+def run(*command, **settings):
+    return subprocess.run(command, stdout=subprocess.PIPE, stderr=subprocess.STDOUT, text=True,
+                          check=False, **settings)
+
+
+class PackageTest(unittest.TestCase):
+    @classmethod
+    def setUpClass(cls):
+        cls.shared = tempfile.TemporaryDirectory(prefix="ambrix-octave-package-")
+        cls.addClassCleanup(cls.shared.cleanup)
+        cls.package = cls.make("first")
+
+    @classmethod
+    def make(cls, name):
+        folder = pathlib.Path(cls.shared.name, name)
+        done = subprocess.run([ROOT / "script/octave-package", folder], stdout=subprocess.PIPE,
+                              text=True, check=True)
+        package = pathlib.Path(done.stdout.strip())
+        assert package.parent == folder
+        return package
+
+    def setUp(self):
+        folder = tempfile.TemporaryDirectory(prefix="ambrix-octave-home-")
+        self.addCleanup(folder.cleanup)
+        self.folder = pathlib.Path(folder.name)
+
+    def unpack(self):
+        with tarfile.open(self.package) as tar:
+            tar.extractall(self.folder)
+        return self.folder / self.package.name.removesuffix(".tar.gz")
+
+    def configure(self, **environment):
+        """What configure prints and, when it succeeds, the settings that it writes."""
+        folder = self.unpack() / "src"
+        done = run("./configure", cwd=folder, env={**NOTHING_SET, **environment})
+        settings = folder / "settings.mk"
+        self.assertEqual(settings.exists(), done.returncode == 0, done.stdout)
+        return done.stdout, settings.read_text() if settings.exists() else ""
+
+    def test_the_same_sources_make_the_same_package(self):
+        self.assertEqual(self.make("second").read_bytes(), self.package.read_bytes())
+
+    def test_it_holds_sources_only(self):
+        with tarfile.open(self.package) as tar:
+            members = {member.name.partition("/")[2]: member for member in tar}
+        for name in ("DESCRIPTION", "COPYING", "NEWS", "INDEX", "src/configure", "src/Makefile",
+                     "src/gateway/entry_point.cc", "src/adapters/octave/__ambrix__.cc",
+                     "inst/+ambrix/read.m", "inst/+ambrix/hyperGetVarData.m"):
+            self.assertIn(name, members)
+        kinds = {pathlib.Path(name).suffix for name, member in members.items() if member.isfile()}
+        self.assertEqual(kinds, {"", ".c", ".cc", ".h", ".m", ".map"})
+        self.assertEqual({(m.uid, m.gid, m.mtime) for m in members.values()},
+                         {(0, 0, members["NEWS"].mtime)})
+
+    def test_every_function_is_in_the_index(self):
+        folder = self.unpack()
+        listed = re.findall(r"ambrix\.(\w+)", (folder / "INDEX").read_text())
+        functions = [path.stem for path in (folder / "inst/+ambrix").glob("*.m")]
+        self.assertEqual(sorted(listed), sorted(functions))
+
+    def test_installs_offline_and_passes_its_tests(self):
+        code = f"""
+            pkg install -local {self.package}
+            pkg load ambrix
+            ambrix.info ("{SAMPLES}/example1.cdf");
+            data = ambrix.read ("{SAMPLES}/example1.cdf", "Image");
+            printf ("read %s\\n", class (data));
+            pkg test ambrix
+            disp (exist ("__ambrix__"));
+            pkg unload ambrix
+            disp (exist ("__ambrix__"));
+            pkg uninstall ambrix"""
+        done = run(*OFFLINE, OCTAVE, "--norc", "--no-history", "--eval", code, cwd=self.folder,
+                   env={**NOTHING_SET, "HOME": str(self.folder)})
+        self.assertEqual(done.returncode, 0, done.stdout)
+        for expected in ("Latitude", "read int32", r"\n3\n0\n$"):
+            self.assertRegex(done.stdout, expected)
+        passed = re.search(r"PASS +(\d+)\n +FAIL +(\d+)", done.stdout)
+        self.assertIsNotNone(passed, done.stdout)
+        self.assertGreater(int(passed[1]), 91, done.stdout)
+        self.assertEqual(int(passed[2]), 0, done.stdout + self.log())
+        self.assertNotIn("warning", done.stdout)
+
+    def log(self):
+        """What is known of tests that failed."""
+        found = (self.folder / "fntests.log").read_text()
+        return "\n".join(re.findall(r"^!!!!!.*\n.*", found, re.MULTILINE))
+
+    def test_a_place_that_is_named_must_hold_the_library(self):
+        empty = self.folder / "empty"
+        for names in (["CDF_ROOT"], ["CDF_BASE"], ["CDF_INC", "CDF_LIB"]):
+            with self.subTest(names):
+                output, _ = self.configure(**{name: str(empty) for name in names})
+                self.assertIn(f"there is no cdf.h in {empty}", output)
+                self.assertIn("Name a folder that holds include/cdf.h and lib/libcdf.so", output)
+
+    def test_the_place_that_is_named_is_taken(self):
+        place = self.place()
+        for variables in ({"CDF_ROOT": place}, {"CDF_BASE": place},
+                          {"CDF_INC": f"{place}/include", "CDF_LIB": f"{place}/lib"}):
+            with self.subTest(variables):
+                _, settings = self.configure(**variables)
+                self.assertIn(f"-I{place}/include\n", settings)
+                self.assertIn(f"-Wl,-rpath,{place}/lib", settings)
+
+    def place(self):
+        """A folder of its own with the library that was provided for the build."""
+        provided = ROOT / "build/cdf/cdf-3.9.1"
+        if not provided.is_dir():
+            self.skipTest("the build has found an installed CDF library")
+        place = self.folder / "place"
+        place.symlink_to(provided)
+        return place
+
+    def test_without_a_library_it_is_told_what_to_do(self):
+        folder = self.unpack() / "src"
+        if not (folder / "cdf-place").exists():
+            self.skipTest("the CDF library is installed here")
+        (folder / "cdf-place").unlink()
+        done = run("./configure", cwd=folder, env=NOTHING_SET)
+        self.assertEqual(done.returncode, 1)
+        self.assertIn("the CDF library of NASA was not found", done.stdout)
+        self.assertIn("setenv CDF_ROOT /usr/local/cdf", done.stdout)
+
+
+if __name__ == "__main__":
+    unittest.main()
