@@ -40,7 +40,7 @@ function testThereIsAFunctionForEachCommand (commands)
   here = functions(! strcmp (cellfun (@fileparts, functionFiles (), "UniformOutput", false),
                              fullfile (getenv ("AMBRIX_OCTAVE"), "+ambrix", "+internal")));
   assert (numel (names), 91);
-  assert (sort (here), sort ([names; {"info"; "read"; "write"}]));
+  assert (sort (here), sort ([names; {"info"; "read"; "write"; "plot"}]));
 endfunction
 
 function testFunctionsTakeAndReturnAsManyAsTheTableSays (commands)

@@ -114,12 +114,13 @@ def _attribute(listed, content):
     datatypes = list(listed["datatypes"].values())
     if attribute.is_global:
         keys = flat(listed["entries"])
-        values = content["attributes"][name]
+        values = content["attributes"][name.rstrip(" ")]
         values = list(values.values()) if isinstance(values, dict) else [values]
     else:
         entries = listed["entries"]
-        keys = [as_text(key) for key in entries.values()] if isinstance(entries, dict) else []
-        values = [content["variables"][key]["attributes"][name] for key in keys]
+        fields = [as_text(key) for key in entries.values()] if isinstance(entries, dict) else []
+        keys = [as_text(content["variables"][field]["name"]) for field in fields]
+        values = [content["variables"][field]["attributes"][name.rstrip(" ")] for field in fields]
     if not len(keys) == len(values) == len(datatypes):
         raise AssertionError(f"{name}: {len(keys)} keys, {len(values)} values")
     attribute.entries = {key: _entry(datatype, value)
@@ -131,9 +132,10 @@ def content(path):
     """What ambrix.read found; variables of an unsupported datatype are None."""
     read = load(path)
     found = Content(as_text(read["file"]["majority"]) == "ROW_MAJOR")
-    for name, described in read["variables"].items():
+    for field, described in read["variables"].items():
         supported = bool(described["supported"].item())
-        found.variables[name] = _variable(described, read["data"][name]) if supported else None
+        found.variables[as_text(described["name"])] = (
+            _variable(described, read["data"][field]) if supported else None)
     for listed in read["attributeList"].values():
         name, attribute = _attribute(listed, read)
         found.attributes[name] = attribute

@@ -143,7 +143,8 @@ function variables = chosen (id, all, names)
     variables = struct ();
     for name = names(:)'
       number = numberOf (id, name{1});
-      variables.(name{1}) = all.(name{1});
+      field = fieldnames (all){number+1};
+      variables.(field) = all.(field);
     endfor
   endif
 endfunction

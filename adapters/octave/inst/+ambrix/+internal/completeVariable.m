@@ -4,7 +4,9 @@
 ## @end deftypefn
 
 function [v, data] = completeVariable (name, v, s, rowMajor)
-  v.name = name;
+  if (! isfield (v, "name") || ! strcmp (ambrix.internal.fieldName (v.name), name))
+    v.name = name;
+  endif
   data = [];
   if (isfield (s.data, name))
     data = s.data.(name);

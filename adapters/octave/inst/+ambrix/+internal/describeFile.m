@@ -14,8 +14,8 @@ function [s, left] = describeFile (id)
   names = cell (1, 0);
   for number = 0:variables - 1
     v = ambrix.internal.describeVariable (id, number, rowMajor);
-    names{end+1} = v.name;
-    s.variables.(v.name) = withStorage (id, v);
+    names{end+1} = ambrix.internal.fieldName (v.name);
+    s.variables.(names{end}) = withStorage (id, v);
   endfor
   [s, left] = ambrix.internal.readAttributes (id, s, names, attributes);
 endfunction

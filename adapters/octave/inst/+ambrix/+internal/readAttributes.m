@@ -2,7 +2,7 @@
 ## @deftypefn {} {[@var{s}, @var{left}] =} ambrix.internal.readAttributes (@var{id}, @var{s}, @var{names}, @var{count})
 ## Put the attributes of a file into its description.
 ##
-## @var{names} are those of the variables by number. @var{left} lists the entries that had to be left
+## @var{names} are the fields of the variables by number. @var{left} lists the entries that had to be left
 ## out because their datatype is not supported, but for those of variables of such a datatype.
 ## @end deftypefn
 
@@ -16,14 +16,15 @@ function [s, left] = readAttributes (id, s, names, count)
       kind = "g";
       last = lastGlobal;
     endif
+    field = ambrix.internal.fieldName (list(k).name);
     entries = readEntries (id, k - 1, kind, last);
     left = [left, unsupportedIn(list(k).name, entries, kind, names, s.variables)];
     entries = entries(! strcmp ({entries.datatype}, ""));
     if (isempty (kind))
-      [s.variables, entries] = givenToVariables (s.variables, list(k).name, entries, names);
+      [s.variables, entries] = givenToVariables (s.variables, field, entries, names);
       list(k).entries = names([entries.number] + 1);
     else
-      s.attributes.(list(k).name) = together ({entries.value});
+      s.attributes.(field) = together ({entries.value});
       list(k).entries = [entries.number];
     endif
     list(k).datatypes = {entries.datatype};

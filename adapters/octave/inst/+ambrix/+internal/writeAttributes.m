@@ -8,6 +8,7 @@
 function writeAttributes (id, s, numbers)
   for attribute = allAttributes (s)
     number = ambrix.createAttr (id, attribute.name, attribute.scope);
+    attribute.name = ambrix.internal.fieldName (attribute.name);
     if (strcmp (attribute.scope, "GLOBAL_SCOPE"))
       writeGlobal (id, number, attribute, s.attributes.(attribute.name));
     else
@@ -19,7 +20,8 @@ endfunction
 ## The list, without the global attributes that were removed, and with those that were added.
 function list = allAttributes (s)
   isGlobal = strcmp ({s.attributeList.scope}, "GLOBAL_SCOPE");
-  list = s.attributeList(! isGlobal | isfield (s.attributes, {s.attributeList.name}));
+  fields = regexprep ({s.attributeList.name}, ' +$', "");
+  list = s.attributeList(! isGlobal | isfield (s.attributes, fields));
   list = withMissing (list, fieldnames (s.attributes), "GLOBAL_SCOPE");
   for [v, name] = s.variables
     list = withMissing (list, fieldnames (v.attributes), "VARIABLE_SCOPE");
@@ -27,7 +29,8 @@ function list = allAttributes (s)
 endfunction
 
 function list = withMissing (list, names, scope)
-  for name = setdiff (names, {list.name}, "stable")(:)'
+  fields = regexprep ({list.name}, ' +$', "");
+  for name = setdiff (names, fields, "stable")(:)'
     list(end+1) = struct ("name", name{1}, "scope", scope, "entries", [], "datatypes", {{}});
   endfor
 endfunction
