@@ -83,7 +83,8 @@ def flat(values, kind=int):
 def _variable(described, values):
     code = code_of(as_text(described["datatype"]))
     elements = int(described["elements"].item())
-    variable = Variable(code, elements, flat(described["sizes"]), flat(described["variances"], bool),
+    variances = flat(described["variances"], bool)
+    variable = Variable(code, elements, flat(described["sizes"]), variances,
                         bool(described["recordVariance"].item()),
                         sparse=SPARSE[as_text(described["sparseRecords"])])
     variable.pad = described["padValue"].reshape(-1, order="F")

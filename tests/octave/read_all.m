@@ -4,7 +4,8 @@
 ## ambrix.write to FOLDER/NAME.cdf.
 1;
 
-## Each leaf of the struct: its path, its class, its sizes and its bytes. `path` ends in a separator.
+## Each leaf of the struct: its path, its class, its sizes and its bytes. `path` ends in a
+## separator.
 function dump (stream, value, path)
   if (isstruct (value) && isscalar (value))
     leaf (stream, path, "struct", [], []);

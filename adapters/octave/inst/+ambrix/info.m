@@ -16,7 +16,8 @@
 ## @item attributes
 ## the global attributes by name: the value of the only entry, or a cell array of the values of all
 ## @item variables
-## the variables by name, each a struct with its @code{name}, @code{number}, @code{datatype}, number of
+## the variables by name, each a struct with its @code{name}, @code{number}, @code{datatype},
+## number of
 ## @code{elements} (the characters of a text, else 1), @code{sizes} of its dimensions,
 ## @code{recordVariance} and dimension @code{variances}, number of @code{records} and of those
 ## @code{written}, @code{sparseRecords}, @code{compression} and @code{compressionParameter},
@@ -29,8 +30,9 @@
 ## Sizes are in the order of the file, whatever its majority, as are those of what
 ## @code{ambrix.read} returns. Names that Octave has no identifiers for are fields all the same:
 ## @code{s.variables.("B field")}; blanks at
-## the end of a name are left out there, and kept in @code{name}. A variable whose datatype is not supported has @code{supported}
-## false and no pad value; entries of such a datatype are left out, with the warning
+## the end of a name are left out there, and kept in @code{name}. A variable whose datatype is not
+## supported has @code{supported} false and no pad value; entries of such a datatype are left out,
+## with the warning
 ## @code{ambrix:unsupportedDatatype}.
 ##
 ## @example

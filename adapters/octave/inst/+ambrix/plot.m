@@ -6,21 +6,21 @@
 ## Plot variables of a CDF file, with axes as their attributes tell.
 ##
 ## @var{file} is the path of a file, with or without @code{.cdf}, or the identifier of an open one;
-## several @var{names} in a cell array make panels one below the other. With @qcode{"range"} only these
-## records are plotted, counted from 1. @var{h} are the handles of what was plotted.
+## several @var{names} in a cell array make panels one below the other. With @qcode{"range"} only
+## these records are plotted, counted from 1. @var{h} are the handles of what was plotted.
 ##
 ## A scalar variable, or one of some components, becomes lines over the variable that its attribute
 ## DEPEND_0 names, else over the only epochs that there are as many of as records, else over record
 ## numbers. The components have the labels in the variable that LABL_PTR_1 or DEPEND_1 names.
 ##
-## A variable with one dimension whose DEPEND_1 has numbers, and more than four or with a DISPLAY_TYPE
-## of spectrogram, becomes a picture of its values over time and these numbers. A variable with two
-## dimensions becomes a picture of its first record.
+## A variable with one dimension whose DEPEND_1 has numbers, and more than four or with a
+## DISPLAY_TYPE of spectrogram, becomes a picture of its values over time and these numbers. A
+## variable with two dimensions becomes a picture of its first record.
 ##
-## Values that equal FILLVAL, or are not from VALIDMIN to VALIDMAX, are left out. Axes are logarithmic
-## where SCALETYP says so; labels are made of LABLAXIS or the variable's name and of UNITS, titles of
-## CATDESC or FIELDNAM.
-## Texts, and variables with more dimensions, are the error @code{ambrix:cannotPlot}.
+## Values that equal FILLVAL, or are not from VALIDMIN to VALIDMAX, are left out. Axes are
+## logarithmic where SCALETYP says so; labels are made of LABLAXIS or the variable's name and of
+## UNITS, titles of CATDESC or FIELDNAM. Texts, and variables with more dimensions, are the error
+## @code{ambrix:cannotPlot}.
 ##
 ## @example
 ## @group

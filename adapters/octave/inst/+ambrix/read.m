@@ -24,10 +24,10 @@
 ## @code{ambrix.write} makes the same file of it again.
 ##
 ## The first dimension of data is that of the records, so that a scalar variable is a column; those
-## of the variable follow in the order of the file, whatever its majority. Where values don't differ
-## from record to record there is no dimension for records. Data have the class that belongs to the
-## datatype. Texts are in a cell array, without the blanks that fill them up. The two numbers of an EPOCH16, seconds and picoseconds, are along a last
-## dimension.
+## of the variable follow in the order of the file, whatever its majority. Where values don't
+## differ from record to record there is no dimension for records. Data have the class that belongs
+## to the datatype. Texts are in a cell array, without the blanks that fill them up. The two
+## numbers of an EPOCH16, seconds and picoseconds, are along a last dimension.
 ##
 ## The options are:
 ##
@@ -48,7 +48,8 @@
 ## With @qcode{"char"} texts are arrays of characters, all of them, along a last dimension.
 ## @end table
 ##
-## Variables and entries of attributes whose datatype is not supported are left out, with the warning
+## Variables and entries of attributes whose datatype is not supported are left out, with the
+## warning
 ## @code{ambrix:unsupportedDatatype}. A wrong option is the error @code{ambrix:invalidOption}; other
 ## errors are those of the commands.
 ##

@@ -3,8 +3,8 @@
 ## @deftypefnx {} {} ambrix.write (@var{file}, @var{s}, "overwrite")
 ## Write a struct of arrays to a new CDF file.
 ##
-## @var{file} is the path of the file; @code{.cdf} is added where it is missing. A file that exists is
-## the error @code{ambrix:fileExists}, or is replaced when the option @qcode{"overwrite"} is given.
+## @var{file} is the path of the file; @code{.cdf} is added where it is missing. A file that exists
+## is the error @code{ambrix:fileExists}, or is replaced when the option @qcode{"overwrite"} is given.
 ## The new file appears whole or not at all.
 ##
 ## @var{s} is a struct that @code{ambrix.read} has returned, or a struct of arrays, one for each
@@ -37,8 +37,8 @@
 ## The datatypes by class: double CDF_DOUBLE, single CDF_FLOAT, int8 CDF_INT1, int16 CDF_INT2, int32
 ## CDF_INT4, uint8 and logical CDF_UINT1, uint16 CDF_UINT2, uint32 CDF_UINT4, text CDF_CHAR.
 ##
-## What @code{ambrix.read} has read is written back the same, but for the encoding, which becomes that
-## of the computer, for rVariables, which become zVariables, and for what it had to leave out.
+## What @code{ambrix.read} has read is written back the same, but for the encoding, which becomes
+## that of the computer, for rVariables, which become zVariables, and for what it had to leave out.
 ##
 ## @example
 ## @group
@@ -145,8 +145,8 @@ endfunction
 %!endfunction
 
 %!test  # a plain struct of arrays
-%! plain = struct ("a", [1; 2; 3], "b", single (magic (4)), "c", {{"one"; "three"}}, "d", "text", ...
-%!                 "e", uint8 (reshape (1:24, 2, 3, 4)), "f", true, "x y", int16 (7));
+%! plain = struct ("a", [1; 2; 3], "b", single (magic (4)), "c", {{"one"; "three"}}, ...
+%!                 "d", "text", "e", uint8 (reshape (1:24, 2, 3, 4)), "f", true, "x y", int16 (7));
 %! s = back (plain);
 %! plain.d = {"text"};
 %! plain.f = uint8 (1);

@@ -6,7 +6,8 @@
 
 function s = completeStruct (s)
   if (! isstruct (s) || ! isscalar (s))
-    error ("ambrix:invalidData", "ambrix.write: give a struct of arrays, or what ambrix.read returns");
+    error ("ambrix:invalidData",
+           "ambrix.write: give a struct of arrays, or what ambrix.read returns");
   endif
   areStructs = structfun (@isstruct, s);
   if (! any (areStructs))

@@ -74,8 +74,8 @@ function [v, data] = shaped (v, data, records, rowMajor)
   endif
   expected = [lead, sizes, v.records, 1, 1](order);
   if (! isequal (expected(expected != 1), size (data)(size (data) != 1)))
-    error ("ambrix:wrongSize", ["ambrix.write: data of variable \"%s\" are %s, which does not fit " ...
-           "dimensions of sizes [%s]; records come %s"], v.name,
+    error ("ambrix:wrongSize", ["ambrix.write: data of variable \"%s\" are %s, which does not " ...
+           "fit dimensions of sizes [%s]; records come %s"], v.name,
            strjoin (strsplit (num2str (size (data))), "-by-"), num2str (v.sizes), records);
   endif
   data = reshape (data, expected);
@@ -105,7 +105,8 @@ endfunction
 %!test
 %! [v, data] = ambrix.internal.completeVariable ("i", struct (), s, false);
 %! assert ({v.datatype, data}, {"CDF_UINT1", uint8(1)});
-%!error <no datatype holds variable "d"> ambrix.internal.completeVariable ("d", struct (), s, false);
+%!error <no datatype holds variable "d">
+%! ambrix.internal.completeVariable ("d", struct (), s, false);
 %!error id=ambrix:unsupportedClass ambrix.internal.completeVariable ("c", struct (), s, false);
 %!error <neither data> ambrix.internal.completeVariable ("none", struct (), s, false);
 %!error <are 2-by-3, which does not fit dimensions of sizes .4.>

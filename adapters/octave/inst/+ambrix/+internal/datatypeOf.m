@@ -1,7 +1,7 @@
 ## -*- texinfo -*-
 ## @deftypefn {} {@var{datatype} =} ambrix.internal.datatypeOf (@var{value}, @var{what})
-## The datatype that data of this class are written in where none is given. @var{what} names the data
-## in the error for a class that no datatype has.
+## The datatype that data of this class are written in where none is given. @var{what} names the
+## data in the error for a class that no datatype has.
 ## @end deftypefn
 
 function datatype = datatypeOf (value, what)

@@ -1,6 +1,7 @@
 ## -*- texinfo -*-
 ## @deftypefn {} {@var{text} =} ambrix.internal.descriptionText (@var{s})
-## What @code{ambrix.info} prints of a description: the file, its global attributes and its variables.
+## What @code{ambrix.info} prints of a description: the file, its global attributes and its
+## variables.
 ## @end deftypefn
 
 function text = descriptionText (s)
@@ -35,8 +36,8 @@ endfunction
 function lines = variableLines (variables)
   table = {"name", "datatype", "sizes", "records", "units", "description"};
   for [v, name] = variables
-    table(end+1,:) = {name, shownDatatype(v), regexprep(sprintf ("-by-%d", v.sizes), "^-by-", ""), ...
-                      shownRecords(v), ...
+    sizes = regexprep (sprintf ("-by-%d", v.sizes), '^-by-', "");
+    table(end+1,:) = {name, shownDatatype(v), sizes, shownRecords(v), ...
                       shownValue(firstOf (v.attributes, {"UNITS", "Units", "units"})), ...
                       shownValue(firstOf (v.attributes, {"CATDESC", "FIELDNAM", "LABLAXIS"}))};
   endfor

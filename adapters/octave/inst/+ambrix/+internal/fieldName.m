@@ -1,7 +1,7 @@
 ## -*- texinfo -*-
 ## @deftypefn {} {@var{field} =} ambrix.internal.fieldName (@var{name})
-## The field for a variable or an attribute: its name without blanks at the end, which many files have
-## and which look-ups of the CDF library ignore.
+## The field for a variable or an attribute: its name without blanks at the end, which many files
+## have and which look-ups of the CDF library ignore.
 ## @end deftypefn
 
 function field = fieldName (name)

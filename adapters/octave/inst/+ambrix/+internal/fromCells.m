@@ -1,7 +1,8 @@
 ## -*- texinfo -*-
 ## @deftypefn {} {[@var{texts}, @var{v}] =} ambrix.internal.fromCells (@var{cells}, @var{v}, @var{records})
-## Turn a cell array of texts into an array of characters, along the last dimension or, where records
-## come last, along the first. All are filled up to the same number, that of the variable at least.
+## Turn a cell array of texts into an array of characters, along the last dimension or, where
+## records come last, along the first. All are filled up to the same number, that of the variable
+## at least.
 ## @end deftypefn
 
 function [texts, v] = fromCells (cells, v, records)

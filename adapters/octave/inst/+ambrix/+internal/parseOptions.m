@@ -2,9 +2,9 @@
 ## @deftypefn {} {@var{options} =} ambrix.internal.parseOptions (@var{caller}, @var{defaults}, @var{given})
 ## Put the options in the cell array @var{given} in the place of their defaults.
 ##
-## Options whose default is a logical are flags: the name alone switches them on, a logical behind it
-## says whether. The others are followed by their value; where the default is a cell array the value
-## is one of its cells, and the first of these is the default.
+## Options whose default is a logical are flags: the name alone switches them on, a logical behind
+## it says whether. The others are followed by their value; where the default is a cell array the
+## value is one of its cells, and the first of these is the default.
 ## @end deftypefn
 
 function options = parseOptions (caller, defaults, given)

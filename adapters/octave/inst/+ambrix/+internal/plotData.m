@@ -3,8 +3,8 @@
 ## What @code{ambrix.plot} draws of a variable.
 ##
 ## @var{picture} has the @code{values}, without invalid ones, whether their axis @code{isLog}, its
-## @code{label}, the @code{names} of components and a @code{title}; and @code{x}, with @code{values}, a
-## @code{label} and whether it @code{isTime}. Pictures of values over two axes have @code{y}, too.
+## @code{label}, the @code{names} of components and a @code{title}; and @code{x}, with @code{values},
+## a @code{label} and whether it @code{isTime}. Pictures of values over two axes have @code{y}, too.
 ## @end deftypefn
 
 function picture = plotData (id, name, range)
@@ -133,14 +133,14 @@ function axis = dimensionAxis (id, s, v, k)
 endfunction
 
 function numbers = hasNumbers (v)
-  numbers = ! strcmp (v.datatype, "CDF_CHAR") && ! strcmp (v.datatype, "CDF_UCHAR") && v.records > 0;
+  numbers = ! any (strcmp (v.datatype, {"CDF_CHAR", "CDF_UCHAR"})) && v.records > 0;
 endfunction
 
 function spectrogram = isSpectrogram (s, v)
   other = named (s, v, "DEPEND_1");
   type = textOf (v.attributes, {"DISPLAY_TYPE"}, "");
-  spectrogram = v.recordVariance && numel (v.sizes) == 1 && ! isempty (other) && hasNumbers (other) ...
-    && (strncmpi (type, "spect", 5) || (v.sizes > 4 && ! strncmpi (type, "time_series", 11)));
+  spectrogram = v.recordVariance && numel (v.sizes) == 1 && ! isempty (other) ...
+    && hasNumbers (other) && (strncmpi (type, "spect", 5) || (v.sizes > 4 && ! strncmpi (type, "time_series", 11)));
 endfunction
 
 function names = componentNames (id, s, v)

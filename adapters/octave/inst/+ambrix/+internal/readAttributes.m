@@ -2,8 +2,8 @@
 ## @deftypefn {} {[@var{s}, @var{left}] =} ambrix.internal.readAttributes (@var{id}, @var{s}, @var{names}, @var{count})
 ## Put the attributes of a file into its description.
 ##
-## @var{names} are the fields of the variables by number. @var{left} lists the entries that had to be left
-## out because their datatype is not supported, but for those of variables of such a datatype.
+## @var{names} are the fields of the variables by number. @var{left} lists the entries that had to be
+## left out because their datatype is not supported, but for those of variables of such a datatype.
 ## @end deftypefn
 
 function [s, left] = readAttributes (id, s, names, count)

@@ -1,7 +1,7 @@
 ## -*- texinfo -*-
 ## @deftypefn {} {} ambrix.internal.timeTicks (@var{ax}, @var{labelled})
-## Label the x axis of axes whose values are serial day numbers: some five to ten round times, and the
-## day or days below; or put ticks there only, where it is not to be @var{labelled}.
+## Label the x axis of axes whose values are serial day numbers: some five to ten round times, and
+## the day or days below; or put ticks there only, where it is not to be @var{labelled}.
 ## @end deftypefn
 
 function timeTicks (ax, labelled)

@@ -3,7 +3,7 @@
 ## Turn texts, whose characters are along the first axis, into a cell array of texts without the
 ## fillers at their ends.
 ##
-## @var{order} is the permutation of the axes to be applied, where that of the characters is dropped.
+## @var{order} is the permutation of the axes to be applied; that of the characters is dropped.
 ## @end deftypefn
 
 function cells = toCells (texts, order, filler)
