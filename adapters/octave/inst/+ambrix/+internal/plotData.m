@@ -83,7 +83,7 @@ function axis = recordAxis (id, s, v, range, count)
   endif
   axis.values = double (ambrix.read (id, other.name, "time", "fill", "range", range));
   axis.isTime = strncmp (other.datatype, "CDF_EPOCH", 9);
-  axis.label = labelOf (other);
+  axis.label = labelOf (other, {"LABLAXIS", "FIELDNAM"});
   if (axis.isTime)
     axis.first = datestr (axis.values(1), "yyyy-mm-dd HH:MM");
   endif
@@ -127,7 +127,7 @@ function axis = dimensionAxis (id, s, v, k)
   if (! isempty (other) && isequal (other.sizes, v.sizes(k)) && hasNumbers (other))
     values = ambrix.read (id, other.name, "range", [1, 1]);
     axis.values = double (values(:));
-    axis.label = labelOf (other);
+    axis.label = labelOf (other, {"LABLAXIS", "FIELDNAM"});
     axis.isLog = isLogarithmic (other.attributes) && all (axis.values > 0);
   endif
 endfunction
@@ -158,8 +158,8 @@ function log = isLogarithmic (attributes)
   log = strncmpi (textOf (attributes, {"SCALETYP"}, ""), "log", 3);
 endfunction
 
-function label = labelOf (v)
-  label = textOf (v.attributes, {"LABLAXIS"}, ambrix.internal.fieldName (v.name));
+function label = labelOf (v, names = {"LABLAXIS"})
+  label = textOf (v.attributes, names, ambrix.internal.fieldName (v.name));
   units = textOf (v.attributes, {"UNITS"}, "");
   if (! isempty (units))
     label = sprintf ("%s [%s]", label, units);
