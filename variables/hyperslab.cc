@@ -58,11 +58,10 @@ LibraryHyperslab::LibraryHyperslab(const Hyperslab& slab, std::span<const long> 
   }
 }
 
-void requireNoRecordsBetween(const VariableDescription& variable, const LibraryHyperslab& slab,
-                             const char* routine) {
+void skipNoRecordsThatDoNotVary(const VariableDescription& variable, LibraryHyperslab& slab) {
   const bool skips = slab.recordCount > 1 && slab.recordInterval > 1;
   if (variable.recordVariance == NOVARY && skips && takesWholeRecords(variable, slab)) {
-    raiseLibraryFailure(BAD_REC_INTERVAL, routine);
+    slab.recordInterval = 1;
   }
 }
 

@@ -42,9 +42,8 @@ struct LibraryHyperslab {
 };
 
 /// Of a variable whose records do not vary the library reads whole records with all those between
-/// them, more than were asked for: refuses, as its bad record interval, to skip records there.
-void requireNoRecordsBetween(const VariableDescription& variable, const LibraryHyperslab& slab,
-                             const char* routine);
+/// them, more than were asked for. They are all the same one, so none need be skipped.
+void skipNoRecordsThatDoNotVary(const VariableDescription& variable, LibraryHyperslab& slab);
 
 /// Selects the variable and the hyperslab, then performs GET_ or PUT_ of `zVAR_HYPERDATA_`.
 void moveHyperslab(const char* routine, CdfId file, long variable, const LibraryHyperslab& slab,

@@ -96,8 +96,8 @@ void hyperGetVarData(int, qvArray* outputs[], std::int32_t, const qvArray* argum
   const long bufferBytes = multiplySaturated(variable.elementsPerRecord(), slab.recordCount);
   const ReadRequest request{routine, values, bufferBytes, true};
   requireUsableRecord(variable, routine);
-  const LibraryHyperslab librarySlab(slab, variable.sizes());
-  requireNoRecordsBetween(variable, librarySlab, routine);
+  LibraryHyperslab librarySlab(slab, variable.sizes());
+  skipNoRecordsThatDoNotVary(variable, librarySlab);
   outputs[0] = readValues(variable, dimensions, request, [&](void* buffer) {
     moveHyperslab(routine, file, number, librarySlab, GET_, buffer);
   });
