@@ -1,0 +1,26 @@
+"""The oct-file as the loader sees it: one name for others, and none of the hosts' interface open."""
+import os
+import pathlib
+import subprocess
+import unittest
+
+
+def names(kind):
+    oct_file = pathlib.Path(os.environ["AMBRIX_OCTAVE"], "__ambrix__.oct")
+    listed = subprocess.run(["nm", "-D", kind, oct_file], stdout=subprocess.PIPE, text=True,
+                            check=True)
+    return [line.split()[-1] for line in listed.stdout.splitlines()]
+
+
+class BinaryTest(unittest.TestCase):
+    def test_only_the_entry_is_exported(self):
+        self.assertEqual(names("--defined-only"), ["G__ambrix__"])
+
+    def test_the_interface_is_inside(self):
+        wanted = names("--undefined-only")
+        self.assertGreater(len(wanted), 0)
+        self.assertEqual([name for name in wanted if name.startswith("qv")], [])
+
+
+if __name__ == "__main__":
+    unittest.main()
