@@ -113,6 +113,27 @@ class PackageTest(unittest.TestCase):
                 self.assertIn(f"there is no cdf.h in {empty}", output)
                 self.assertIn("Name a folder that holds include/cdf.h and lib/libcdf.so", output)
 
+    def test_what_is_wrong_with_a_place_is_told(self):
+        place = self.folder / "place"
+        (place / "include").mkdir(parents=True)
+        (place / "lib").mkdir()
+        header = place / "include/cdf.h"
+        header.write_text("/* of version 2 */")
+        output, _ = self.configure(CDF_ROOT=str(place))
+        self.assertIn(f"{header} is not the header of CDF version 3", output)
+        header.write_text("/* CDF_EPOCH16 */")
+        output, _ = self.configure(CDF_ROOT=str(place))
+        self.assertIn(f"there is no libcdf in {place}/lib {place}/lib64", output)
+        (place / "lib/libcdf.so").write_text("nothing")
+        output, _ = self.configure(CDF_ROOT=str(place))
+        self.assertIn(f"the library in {place}/lib does not work with {header}", output)
+        (place / "lib/libcdf.so").rename(place / "lib/libcdf.a")
+        output, _ = self.configure(CDF_ROOT=str(place))
+        self.assertIn(f"{place}/lib/libcdf.a is not usable here", output)
+        (self.folder / "a place").symlink_to(place)
+        output, _ = self.configure(CDF_ROOT=str(self.folder / "a place"))
+        self.assertIn("mkoctfile cannot use folders of such names", output)
+
     def test_the_place_that_is_named_is_taken(self):
         place = self.place()
         for variables in ({"CDF_ROOT": place}, {"CDF_BASE": place},
