@@ -39,6 +39,8 @@ struct LibraryHyperslab {
   DimensionVector start;
   DimensionVector count;
   DimensionVector interval;
+
+  [[nodiscard]] long lastRecord() const { return recordStart + (recordCount - 1) * recordInterval; }
 };
 
 /// Of a variable whose records do not vary the library reads whole records with all those between

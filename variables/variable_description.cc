@@ -54,6 +54,11 @@ void requireRecordNumber(long record, const char* routine) {
   if (record < 0 || !fitsLibrary(record)) raiseLibraryFailure(BAD_REC_NUM, routine);
 }
 
+void requireCountableRecord(const VariableDescription& variable, long record, const char* routine) {
+  const bool countable = record != std::numeric_limits<std::int32_t>::max();
+  if (variable.recordVariance != NOVARY && !countable) raiseLibraryFailure(BAD_REC_NUM, routine);
+}
+
 void requireElements(const VariableDescription& variable, const char* routine) {
   if (variable.elements < 1) raiseLibraryFailure(BAD_NUM_ELEMS, routine);
 }

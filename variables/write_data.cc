@@ -67,6 +67,7 @@ void putVarData(int, qvArray*[], std::int32_t, const qvArray* arguments[], const
   requireClassOfDatatype(data, variable.datatype);
   requireUsableRecord(variable, routine);
   requireRoom(variable, 1, bytesOfArray(data, variable.datatype), routine);
+  requireCountableRecord(variable, record, routine);
   // Of a text only the first character is written: users write whole texts as records or
   // hyperslabs.
   const LibraryData value = LibraryData::firstCharacterOf(data);
@@ -93,6 +94,7 @@ void putVarRecordData(int, qvArray*[], std::int32_t, const qvArray* arguments[],
   requireUsableRecord(variable, routine);
   requireRoom(variable, variable.valuesPerRecord(), bytesOfArray(data, variable.datatype), routine);
   requireRecordNumber(record, routine);
+  requireCountableRecord(variable, record, routine);
   const LibraryData values(data);
   checkLibraryStatus(CDFputVarRecordData(libraryHandle(file, routine), kZVariables, number, record,
                                          values.bytes()),
@@ -122,6 +124,7 @@ void hyperPutVarData(int, qvArray*[], std::int32_t, const qvArray* arguments[],
   if (bytesRead > bytesOfArray(data, variable.datatype)) {
     raiseLibraryFailure(BAD_DIM_COUNT, routine);
   }
+  requireCountableRecord(variable, librarySlab.lastRecord(), routine);
   const LibraryData values(data);
   moveHyperslab(routine, file, number, librarySlab, PUT_, values.bytes());
 }

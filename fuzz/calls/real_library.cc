@@ -18,27 +18,51 @@ void layOutOddFiles() {
   std::ofstream("text.cdf") << "no CDF\n";
 }
 
-/// Legal input that makes the library write or compress gigabytes: numbers between `most` and 2^31
-/// are replaced. Larger ones are left, for the module and the library to refuse.
+constexpr double kLast = 2147483647;  // that the library can tell from others
+constexpr double kEnd = 2147483648;
+
+/// Legal input on which the library itself fails or works for hours: of an argument of a command,
+/// the numbers from `first` up to and without `end` are replaced. What is beyond 32 bits is left,
+/// for the module to refuse.
 struct Exclusion {
   const char* command;
   std::size_t argument;
-  double most;
+  double first;
+  double end;
+  double instead;
+  bool onlyBefore39 = false;
 };
 
-// A record is written whole and compressed whole, so records are kept small: their sizes multiply.
 constexpr Exclusion kExclusions[] = {
-    {"createVar", 3, 100},  // number of elements
-    {"createVar", 4, 12},   // sizes of dimensions
+    // A record is written whole, compressed whole and padded whole, and its sizes multiply.
+    {"createVar", 3, 101, kEnd, 100},
+    {"createVar", 4, 13, kEnd, 12},
+    // Records up to the one that is written, allocated or asked for are written, gigabytes of them.
+    {"putVarData", 2, 1001, kLast, 1000},
+    {"putVarRecordData", 2, 1001, kLast, 1000},
+    {"hyperPutVarData", 2, 1001, kLast - 1, 1000},
+    {"hyperPutVarData", 4, 101, kLast - 1000, 100},
+    {"setVarAllocBlockRecords", 2, 1001, kEnd, 1000},
+    {"setVarAllocBlockRecords", 3, 1001, kEnd, 1000},
+    {"setVarInitialRecs", 2, 1001, kEnd, 1000},
+    {"setVarBlockingFactor", 2, 1001, kEnd, 1000},
+    // CDF 3.6.3 gives a file up when it is compressed with little data in it, and then computes the
+    // checksum with memory that it has freed.
+    {"setChecksum", 1, 1, 3, 0, true},
 };
+
+bool isBefore39() {
+  long version = 0, release = 0;
+  CDFlib(GET_, LIB_VERSION_, &version, LIB_RELEASE_, &release, NULL_);
+  return version < 3 || (version == 3 && release < 9);
+}
 
 void exclude(const Exclusion& exclusion, std::vector<ambrix::Array>& arguments) {
-  constexpr double kEnd = 2147483648.0;
   if (exclusion.argument >= arguments.size()) return;
   ambrix::Array& argument = arguments[exclusion.argument];
   if (argument.classId() != ambrix::ClassId::kDouble) return;
   for (double& number : argument.mutableData<double>()) {
-    if (number > exclusion.most && number < kEnd) number = exclusion.most;
+    if (number >= exclusion.first && number < exclusion.end) number = exclusion.instead;
   }
 }
 
@@ -63,8 +87,10 @@ std::optional<Variable> scriptedVariable() {
 }
 
 void confine(const char* command, std::vector<ambrix::Array>& arguments) {
+  static const bool before39 = isBefore39();
   for (const Exclusion& exclusion : kExclusions) {
-    if (std::string_view(command) == exclusion.command) exclude(exclusion, arguments);
+    const bool here = before39 || !exclusion.onlyBefore39;
+    if (here && std::string_view(command) == exclusion.command) exclude(exclusion, arguments);
   }
 }
 

@@ -1,0 +1,32 @@
+// Writing the last record that 32 bits can number.
+#include "tests/module/support/module_test.h"
+
+namespace ambrix_test {
+namespace {
+
+constexpr double kLast = 2147483647;
+
+class LastRecordTest : public ModuleTest {
+ protected:
+  Given file = create();
+};
+
+TEST_F(LastRecordTest, IsRefusedAndTheFileStaysUsable) {
+  const double v = createVar(file, {.datatype = 22});
+  results("putVarData", {file, v, 3, {}, 7});
+  EXPECT_EQ(does("putVarData", {file, v, kLast, {}, 1}), refused("CDFputzVarData", kBadRecNum));
+  EXPECT_EQ(does("putVarRecordData", {file, v, kLast, 1}),
+            refused("CDFputzVarRecordData", kBadRecNum));
+  EXPECT_EQ(does("hyperPutVarData", {file, v, kLast - 1, 2, 1, {}, {}, {}, {1, 2}}),
+            refused("CDFhyperPutzVarData", kBadRecNum));
+  EXPECT_EQ(does("getVarData", {reopen(file), v, 3}), "double 1x1 [7]");
+}
+
+TEST_F(LastRecordTest, WithoutRecordVarianceItIsTheOnlyOne) {
+  const double v = createVar(file, {.datatype = 22, .recordsVary = false});
+  results("putVarRecordData", {file, v, kLast, 7});
+  EXPECT_EQ(does("getVarData", {reopen(file), v, 0}), "double 1x1 [7]");
+}
+
+}  // namespace
+}  // namespace ambrix_test
