@@ -66,6 +66,10 @@ qvArray::qvArray(qvClassID classId, std::span<const std::size_t> sizes, Content 
   create(*dims_, content);
 }
 
+charNDArray qvArray::bytes() const {
+  return argument_.is_defined() ? argument_.char_array_value() : toOctave().char_array_value();
+}
+
 const char* qvArray::className() const {
   if (classId_ != qvUNKNOWN_CLASS) return nameOfClass(classId_);
   if (className_.empty()) className_ = argument_.class_name();
@@ -158,9 +162,10 @@ void qvArray::takeOut() const {
 
 template <typename OctaveArray>
 void qvArray::make(const dim_vector& dims, Content content) {
-  auto& array = elements_.emplace<OctaveArray>(
-      content == Content::kZero ? OctaveArray(dims) : makeUnsetArray<OctaveArray>(dims));
-  data_ = array.fortran_vec();
+  auto& array = elements_.emplace<OctaveArray>(makeUnsetArray<OctaveArray>(dims));
+  auto* const first = array.fortran_vec();
+  if (content == Content::kZero) std::fill_n(first, array.numel(), 0);
+  data_ = first;
 }
 
 void qvArray::create(const dim_vector& dims, Content content) {

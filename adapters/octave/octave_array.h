@@ -46,8 +46,8 @@ struct qvArray {
 
   /// Null for classes without plain elements.
   [[nodiscard]] void* data() const;
-  /// The characters as Octave has them; for arguments of the class char.
-  [[nodiscard]] charNDArray bytes() const { return argument_.char_array_value(); }
+  /// The characters as Octave has them; for the class char.
+  [[nodiscard]] charNDArray bytes() const;
   /// Null for other classes than cell.
   [[nodiscard]] ambrix::octave_host::Cells* cells() const;
 

@@ -43,7 +43,9 @@ endfunction
 function testCharactersAreBytesWidened ()
   assert (__ambrix__ ("units", char (0:255)), 0:255);
   assert (__ambrix__ ("units", ["ab"; "cd"]), double ("acbd"));
-  assert (double (__ambrix__ ("text", [65, 255, 256 + 66, 65536 - 23])), [65, 255, 66, 233]);
+  [text, copy] = __ambrix__ ("text", [65, 255, 256 + 66, 65536 - 23]);
+  assert (double (text), [65, 255, 66, 233]);
+  assert (copy, text);
 endfunction
 
 function testFileNamesAreBytesOfUtf8 ()

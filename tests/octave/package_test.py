@@ -143,6 +143,18 @@ class PackageTest(unittest.TestCase):
                 self.assertIn(f"-I{place}/include\n", settings)
                 self.assertIn(f"-Wl,-rpath,{place}/lib", settings)
 
+    def test_a_static_library_is_preferred(self):
+        library = pathlib.Path(os.environ.get("AMBRIX_STATIC_CDF", "none"))
+        if not library.exists():
+            self.skipTest("no static CDF library was built")
+        place = self.folder / "place"
+        (place / "lib").mkdir(parents=True)
+        (place / "lib/libcdf.so").write_text("not looked at")
+        (place / "lib/libcdf.a").symlink_to(library)
+        (place / "include").symlink_to(ROOT / "build/cdf/cdf-3.6.3-source/src/include")
+        output, settings = self.configure(CDF_ROOT=str(place))
+        self.assertIn(f"libraries = {place}/lib/libcdf.a -lm\n", settings, output)
+
     def place(self):
         """A folder of its own with the library that was provided for the build."""
         provided = ROOT / "build/cdf/cdf-3.9.1"

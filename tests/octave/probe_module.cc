@@ -92,6 +92,9 @@ void text(const Call& call) {
   const std::size_t sizes[] = {1, wanted.size()};
   call.outputs[0] = qvCreateCharArray(2, sizes);
   std::ranges::copy(wanted, qvGetChars(call.outputs[0]));
+  char* const copy = qvArrayToString(call.outputs[0]);
+  call.outputs[1] = qvCreateString(copy);
+  qvFree(copy);
 }
 
 void narrow(const Call& call) {
