@@ -133,6 +133,8 @@ def content(path):
     """What ambrix.read found; variables of an unsupported datatype are None."""
     read = load(path)
     found = Content(as_text(read["file"]["majority"]) == "ROW_MAJOR")
+    if flat(read["library"]) < (3, 9):
+        found.nul_reads_as = ord(" ")
     for field, described in read["variables"].items():
         supported = bool(described["supported"].item())
         found.variables[as_text(described["name"])] = (

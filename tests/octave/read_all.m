@@ -34,6 +34,21 @@ function leaf (stream, path, class_name, sizes, value)
   fwrite (stream, [typecast(numbers, "uint8"), uint8([path class_name]), typecast(value, "uint8")]);
 endfunction
 
+## What was written back has all that can be told of what was read, but for what writing can't keep.
+function assertSame (written, s, file)
+  changing = {"name", "version", "encoding"};
+  assert (isequaln (rmfield (written.file, changing), rmfield (s.file, changing)), file);
+  assert (isequaln (written.attributes, s.attributes), file);
+  assert (numel (fieldnames (written.variables)), sum (structfun (@(v) v.supported, s.variables)));
+  for [v, name] = written.variables
+    before = s.variables.(name);
+    before.number = v.number;  # others may have been left out
+    assert (isequaln (v, before), [file ": " name]);
+    assert (class (written.data.(name)), class (s.data.(name)));
+    assert (isequaln (written.data.(name), s.data.(name)), [file ": " name]);
+  endfor
+endfunction
+
 warning ("off", "ambrix:unsupportedDatatype");
 warning ("off", "TOLVEX:ambrix:cdflib:invalidCompressionParameter");
 folder = argv (){1};
@@ -41,11 +56,13 @@ for file = argv ()(2:end)'
   [~, name] = fileparts (file{1});
   s = ambrix.read (file{1});
   ambrix.write (fullfile (folder, name), s);
+  assertSame (ambrix.read (fullfile (folder, name)), s, name);
   for [data, variable] = s.data
     if (iscell (data))  # many cells, slow to dump
       s.data.(variable) = ambrix.read (file{1}, variable, "text", "char");
     endif
   endfor
+  [s.library(1), s.library(2)] = ambrix.getLibraryVersion ();
   stream = fopen (fullfile (folder, [name ".bin"]), "w");
   dump (stream, s, "");
   fclose (stream);

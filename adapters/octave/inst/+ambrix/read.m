@@ -85,6 +85,9 @@ function data = readOne (id, name, options)
   rowMajor = strcmp (__ambrix__ ("getMajority", id), "ROW_MAJOR");
   number = numberOf (id, name);
   v = ambrix.internal.describeVariable (id, number, rowMajor);
+  if (! v.supported)
+    __ambrix__ ("inquireVar", id, number);  # raises the error that tells
+  endif
   fill = [];
   if (options.fill)
     fill = fillOf (id, number);
