@@ -2,6 +2,7 @@
 #pragma once
 
 #include <cstdint>
+#include <string_view>
 
 #include "host/qv.h"
 
@@ -16,7 +17,7 @@ using Handler = void (*)(int outputCount, qvArray* outputs[], std::int32_t argum
 
 struct CommandEntry {
   std::int32_t id;
-  const char* name;
+  std::string_view name;  // its length is known, so most rows differ at a glance
   std::int32_t minimumArguments;
   std::int32_t maximumArguments;
   Handler handler;

@@ -63,7 +63,7 @@ TEST_F(CommandTableTest, RowsIdsNamesAndCountsAreAsDocumentedInOrder) {
   const auto table = TOLVEX::ambrix::commandTable();
   ASSERT_EQ(table.size(), std::size(kRows));
   for (std::size_t i = 0; i < table.size(); ++i) {
-    EXPECT_STREQ(table[i].name, kRows[i].name);
+    EXPECT_EQ(table[i].name, kRows[i].name);
     EXPECT_EQ(table[i].id, kRows[i].id) << kRows[i].name;
     EXPECT_EQ(table[i].minimumArguments, kRows[i].minimum) << kRows[i].name;
     EXPECT_EQ(table[i].maximumArguments, kRows[i].maximum) << kRows[i].name;
@@ -84,7 +84,7 @@ TEST_F(CommandTableTest, IdsRunFromZeroToNinetyTwoWithoutTwo) {
 TEST_F(CommandTableTest, OnlyTheTwoEntryWritersShareAHandler) {
   std::map<TOLVEX::ambrix::Handler, std::set<std::string>> commands;
   for (const auto& entry : TOLVEX::ambrix::commandTable())
-    commands[entry.handler].insert(entry.name);
+    commands[entry.handler].emplace(entry.name);
   EXPECT_EQ(commands.size(), 90U);
   std::set<std::string> shared;
   for (const auto& [handler, names] : commands) {
