@@ -2,6 +2,7 @@
 
 #include <cdf.h>
 
+#include <algorithm>
 #include <cstddef>
 #include <vector>
 
@@ -37,6 +38,14 @@ const double* doublesOf(const qvArray* array) {
   return static_cast<const double*>(qvGetReadOnlyData(array));
 }
 
+/// The components of times, each of which is an integer to the module: that is settled before any
+/// of them is computed with, and without a copy of them all.
+const double* checkedTimes(const qvArray* times) {
+  const double* components = doublesOf(times);
+  requireInRange({components, qvGetNumberOfElements(times)});
+  return components;
+}
+
 void requireLegal(double epoch) {
   if (epoch == ILLEGAL_EPOCH_VALUE) raiseError(cdflib::illegalEpochValue());
 }
@@ -59,10 +68,11 @@ void computeEpoch(int, qvArray* outputs[], std::int32_t, const qvArray* argument
                   const CommandEntry*) {
   const std::size_t count = requireGroups(arguments[0], kEpochComponents);
   qvArray* epochs = createDoubles({1, count});
-  const std::vector<long> components = getLongVectorArg(arguments[0], "TIMEVAL");
-  const long* c = components.data();
+  const double* time = checkedTimes(arguments[0]);
   double* epoch = doublesOf(epochs);
-  for (std::size_t k = 0; k < count; ++k, c += kEpochComponents, ++epoch) {
+  for (std::size_t k = 0; k < count; ++k, time += kEpochComponents, ++epoch) {
+    long c[kEpochComponents];
+    std::transform(time, time + kEpochComponents, c, truncateToLong);
     *epoch = computeEPOCH(c[0], c[1], c[2], c[3], c[4], c[5], c[6]);
     requireLegal(*epoch);
   }
@@ -73,10 +83,11 @@ void computeEpoch16(int, qvArray* outputs[], std::int32_t, const qvArray* argume
                     const CommandEntry*) {
   const std::size_t count = requireGroups(arguments[0], kEpoch16Components);
   qvArray* epochs = createDoubles({2, count});
-  const std::vector<long> components = getLongVectorArg(arguments[0], "TIMEVAL");
-  const long* c = components.data();
+  const double* time = checkedTimes(arguments[0]);
   double* epoch = doublesOf(epochs);
-  for (std::size_t k = 0; k < count; ++k, c += kEpoch16Components, epoch += 2) {
+  for (std::size_t k = 0; k < count; ++k, time += kEpoch16Components, epoch += 2) {
+    long c[kEpoch16Components];
+    std::transform(time, time + kEpoch16Components, c, truncateToLong);
     requireLegal(computeEPOCH16(c[0], c[1], c[2], c[3], c[4], c[5], c[6], c[7], c[8], c[9], epoch));
   }
   outputs[0] = epochs;

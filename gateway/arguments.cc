@@ -47,9 +47,14 @@ std::vector<long> convertAll(const qvArray* argument) {
 
 }  // namespace
 
-long truncateToLong(double value) {
+long truncateUnusual(double value) {
   if (std::isnan(value)) return std::numeric_limits<long>::min();
   return boost::numeric_cast<long>(value);
+}
+
+void requireInRange(std::span<const double> values) {
+  for (const double value : values)
+    truncateToLong(value);
 }
 
 long getLongScalarArg(const qvArray* argument, const char* label) {

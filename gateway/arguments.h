@@ -3,6 +3,8 @@
 // entry point reports as `argumentOutOfBounds`.
 #pragma once
 
+#include <cmath>
+#include <span>
 #include <string>
 #include <vector>
 
@@ -10,8 +12,21 @@
 
 namespace TOLVEX::ambrix {
 
+/// Of this size on, a value is no long.
+inline constexpr double kFirstTooLarge = 0x1p63;
+
+/// The integer rule for a value that may be out of range or NaN.
+long truncateUnusual(double value);
+
 /// The one integer rule. NaN gives the most negative value.
-long truncateToLong(double value);
+inline long truncateToLong(double value) {
+  if (std::abs(value) < kFirstTooLarge) [[likely]]
+    return static_cast<long>(value);
+  return truncateUnusual(value);
+}
+
+/// Throws for the first value that `truncateToLong` throws for.
+void requireInRange(std::span<const double> values);
 
 /// Raises `argumentNotDoubleScalar` with the label unless the array is one double.
 long getLongScalarArg(const qvArray* argument, const char* label);
