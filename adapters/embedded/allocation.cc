@@ -1,8 +1,12 @@
 #include "adapters/embedded/allocation.h"
 
 #include <atomic>
+#include <cstdint>
 #include <cstdlib>
 #include <limits>
+#ifdef __linux__
+#include <sys/mman.h>
+#endif
 
 #include "adapters/embedded/host_errors.h"
 #include "ambrix/memory.h"
@@ -32,6 +36,26 @@ std::size_t atLeastOne(std::size_t bytes) {
   return bytes == 0 ? 1 : bytes;
 }
 
+#ifdef __linux__
+// Reading into new memory is mostly a matter of the system providing it, page by page. Pages of
+// 2 MiB cost a small fraction; the system gives them where it is asked to and can. What reaches
+// beyond the last whole one is left in small pages, so that no more is used than was asked for.
+constexpr std::size_t kHugePage = std::size_t{2} << 20U;
+constexpr std::size_t kManyBytes = 2 * kHugePage;
+
+void* allocateUnset(std::size_t bytes) {
+  if (bytes < kManyBytes || bytes > PTRDIFF_MAX - kHugePage) return std::malloc(atLeastOne(bytes));
+  void* memory = nullptr;
+  if (posix_memalign(&memory, kHugePage, bytes) != 0) return nullptr;
+  madvise(memory, bytes / kHugePage * kHugePage, MADV_HUGEPAGE);  // a hint: failing is no matter
+  return memory;
+}
+#else
+void* allocateUnset(std::size_t bytes) {
+  return std::malloc(atLeastOne(bytes));
+}
+#endif
+
 }  // namespace
 
 void requireWithinLimit(std::size_t bytes) {
@@ -39,7 +63,7 @@ void requireWithinLimit(std::size_t bytes) {
 }
 
 void* allocate(std::size_t bytes) {
-  return orRaise(failureIsDue() ? nullptr : std::malloc(atLeastOne(bytes)));
+  return orRaise(failureIsDue() ? nullptr : allocateUnset(bytes));
 }
 
 void* allocateZeroed(std::size_t bytes) {

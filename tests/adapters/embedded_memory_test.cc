@@ -2,6 +2,10 @@
 #include <ambrix/embedded.h>
 #include <gtest/gtest.h>
 
+#include <algorithm>
+#include <cstddef>
+#include <cstdint>
+#include <cstring>
 #include <functional>
 #include <limits>
 #include <string>
@@ -74,6 +78,40 @@ TEST_F(EmbeddedMemoryTest, LargeArraysFailWholeAtEitherAllocation) {
     EXPECT_TRUE(isOutOfMemory([] { Array::zeros(ClassId::kDouble, {1000, 1}); }));
     EXPECT_FALSE(ambrix::failurePending());
   }
+}
+
+#ifdef __linux__
+TEST_F(EmbeddedMemoryTest, ArraysOfManyBytesBeginWhereAHugePageCan) {
+  constexpr std::size_t kHugePage = std::size_t{2} << 20U;
+  for (const std::size_t bytes : {2 * kHugePage, 2 * kHugePage + 1, 8 * kHugePage - 1}) {
+    const Array array = Array::uninitialized(ClassId::kInt8, {bytes, 1});
+    const auto data = array.bytes();
+    EXPECT_EQ(reinterpret_cast<std::uintptr_t>(data.data()) % kHugePage, 0U);
+    std::memset(const_cast<std::byte*>(data.data()), 1, bytes);  // all of it is there
+    EXPECT_EQ(data.back(), std::byte{1});
+  }
+}
+#endif
+
+TEST_F(EmbeddedMemoryTest, ArraysOfManyBytesAreZeroWhereTheyAreToBe) {
+  const std::size_t bytes = std::size_t{16} << 20U;
+  for (int i = 0; i < 2; ++i) {  // the second may get the memory that the first has left
+    const Array array = Array::zeros(ClassId::kInt8, {bytes, 1});
+    const auto data = array.bytes();
+    EXPECT_TRUE(std::ranges::all_of(data, [](std::byte byte) { return byte == std::byte{0}; }));
+    std::memset(const_cast<std::byte*>(data.data()), 1, bytes);
+  }
+}
+
+TEST_F(EmbeddedMemoryTest, TheLimitAndFailuresHoldForManyBytes) {
+  const std::size_t bytes = std::size_t{16} << 20U;
+  ambrix::failAllocation(2);
+  EXPECT_TRUE(isOutOfMemory([&] { Array::uninitialized(ClassId::kInt8, {bytes, 1}); }));
+  EXPECT_TRUE(isOutOfMemory([] {
+    Array::uninitialized(ClassId::kInt8, {std::size_t{1} << 60U, 1});
+  }));
+  ambrix::setByteLimit(bytes - 1);
+  EXPECT_TRUE(isOutOfMemory([&] { Array::uninitialized(ClassId::kInt8, {bytes, 1}); }));
 }
 
 TEST_F(EmbeddedMemoryTest, CopiesOfCellsFailWhole) {
