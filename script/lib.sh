@@ -54,4 +54,15 @@ takeTurns() {
   ! command -v flock >/dev/null || flock 9
 }
 
+# makeVenv FOLDER REQUIREMENTS: a Python environment with CDF readers of others, unless it is there.
+makeVenv() {
+  local venv=$root/$1 wanted=$root/$2
+  cmp -s "$wanted" "$venv/requirements.txt" && return
+  say "Installing other readers of CDF files into $1"
+  rm -rf "$venv"
+  quietly "$venv.log" python3 -m venv "$venv"
+  quietly "$venv.log" "$venv/bin/python" -m pip install --quiet -r "$wanted"
+  cp "$wanted" "$venv/requirements.txt"
+}
+
 jobs() { nproc 2>/dev/null || getconf _NPROCESSORS_ONLN; }

@@ -1,0 +1,69 @@
+// What there is to know of many variables.
+#include "bench/module/commands.h"
+
+namespace ambrix_bench {
+namespace {
+
+double countIn(const std::vector<Array>& facts, std::size_t place) {
+  return facts[place].data<double>()[0];
+}
+
+void walk(const Array& file) {
+  const std::vector<Array> facts = theModule().call("inquire", {file});
+  const double variables = countIn(facts, 3), attributes = countIn(facts, 4);
+  for (double attribute = 0; attribute < attributes; ++attribute)
+    call("inquireAttr", {file, number(attribute)});
+  for (double variable = 0; variable < variables; ++variable) {
+    const Array variableNumber = number(variable);
+    call("inquireVar", {file, variableNumber});
+    for (double attribute = 0; attribute < attributes; ++attribute)
+      call("getAttrEntry", {file, number(attribute), variableNumber});
+  }
+}
+
+double openAndClose(const Setup& setup) {
+  const Stopwatch watch;
+  closeFile(openFile(setup, "metadata.cdf"));
+  return watch.seconds();
+}
+
+}  // namespace
+
+double walkMetadata(const Setup& setup) {
+  const Stopwatch watch;
+  const Array file = openFile(setup, "metadata.cdf");
+  walk(file);
+  closeFile(file);
+  return watch.seconds();
+}
+
+double walkReadOnly(const Setup& setup) {
+  const Stopwatch watch;
+  const Array file = openFile(setup, "metadata.cdf");
+  call("setReadOnlyMode", {file, constant("READONLYon")});
+  walk(file);
+  closeFile(file);
+  return watch.seconds();
+}
+
+double walkSmallCache(const Setup& setup) {
+  const Stopwatch watch;
+  const Array file = openFile(setup, "metadata.cdf");
+  call("setCacheSize", {file, number(2)});
+  walk(file);
+  closeFile(file);
+  return watch.seconds();
+}
+
+double openValidated(const Setup& setup) {
+  return openAndClose(setup);
+}
+
+double openUnvalidated(const Setup& setup) {
+  call("setValidate", {constant("VALIDATEFILEoff")});
+  const double seconds = openAndClose(setup);
+  call("setValidate", {constant("VALIDATEFILEon")});
+  return seconds;
+}
+
+}  // namespace ambrix_bench

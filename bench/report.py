@@ -1,0 +1,85 @@
+"""Results as tables, for people: in the terminal, and between two markers of a document."""
+
+import re
+
+BEGIN, END = "<!-- begin: {} (script/bench --document) -->", "<!-- end: {} -->"
+PEOPLE_SAY = {"library": "bare calls", "module": "ambrix", "octave": "in Octave"}
+
+
+def time_text(seconds):
+    for factor, unit in ((1, "s"), (1e3, "ms"), (1e6, "us")):
+        if seconds * factor >= 0.9995:
+            return f"{seconds * factor:#.3g} {unit}".replace(". ", " ")
+    return f"{seconds * 1e9:.0f} ns"
+
+
+def ratio_text(facts):
+    low, high = facts["ratio_quartiles"]
+    return f"{short(facts['ratio'])} ({short(low)}-{short(high)})"
+
+
+def short(number):
+    return f"{number:.2f}" if number < 9.995 else f"{number:.0f}"
+
+
+def cell(workload, facts):
+    if facts is None:
+        return "-"
+    if "ratio" in facts:
+        return ratio_text(facts)
+    if workload.calls:
+        return time_text(facts["median"] / facts["calls"])
+    return time_text(facts["median"])
+
+
+def goal_text(workload, facts):
+    if workload.goal is None or "ratio" not in facts:
+        return ""
+    return f"{workload.goal:.2f} " + ("met" if facts["ratio"] <= workload.goal else "missed")
+
+
+def main_rows(workloads, results, goals=True):
+    names = list(dict.fromkeys(name for facts in results.values() for name in facts))
+    rows = [["workload", *(PEOPLE_SAY.get(name, name) for name in names), "goal" if goals else ""]]
+    for workload in workloads:
+        facts = results.get(workload.name)
+        if facts:
+            rows.append([workload.title, *(cell(workload, facts.get(name)) for name in names),
+                         goal_text(workload, facts.get("module", {})) if goals else ""])
+    return rows
+
+
+def setting_rows(settings, results):
+    rows = [["setting", "without", "with", "ratio"]]
+    for setting in settings:
+        facts = results.get(setting.title)
+        if facts:
+            rows.append([setting.title, time_text(facts["before"]["median"]),
+                         time_text(facts["after"]["median"]), ratio_text(facts["after"])])
+    return rows
+
+
+def terminal(rows):
+    widths = [max(len(row[i]) for row in rows) for i in range(len(rows[0]))]
+    lines = ["  ".join(text.ljust(width) for text, width in zip(row, widths)).rstrip()
+             for row in rows]
+    return "\n".join(lines)
+
+
+def markdown(rows):
+    lines = ["| " + " | ".join(row) + " |" for row in rows]
+    lines.insert(1, "|---" * len(rows[0]) + "|")
+    return "\n".join(lines)
+
+
+def put_into(document, parts):
+    """Replaces what stands between the markers of each part."""
+    text = document.read_text()
+    for name, content in parts.items():
+        begin, end = BEGIN.format(name), END.format(name)
+        pattern = re.escape(begin) + ".*?" + re.escape(end)
+        if not re.search(pattern, text, re.DOTALL):
+            raise SystemExit(f"{document} has no place for: {name}")
+        replacement = f"{begin}\n\n{content}\n\n{end}"
+        text = re.sub(pattern, lambda _, new=replacement: new, text, flags=re.DOTALL)
+    document.write_text(text)

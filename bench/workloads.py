@@ -1,0 +1,47 @@
+"""What is measured, in the order of the table."""
+
+import collections
+
+Workload = collections.namedtuple("Workload", "name title goal calls")
+Setting = collections.namedtuple("Setting", "title before after")
+
+# Names that the programs know, what people read, the most that the ratio to bare calls may be, and
+# the number of calls in a round where a time for each is of more interest than the whole.
+WORKLOADS = (
+    Workload("read", "read 51 MB of doubles, row-major", 0.5, None),
+    Workload("read_column_major", "the same, column-major", 0.5, None),
+    Workload("read_gzip", "the same, gzip", 1.02, None),
+    Workload("write", "write 51 MB of doubles, row-major", 1.02, None),
+    Workload("write_column_major", "the same, column-major", 1.02, None),
+    Workload("write_gzip", "the same, gzip", 1.02, None),
+    Workload("walk_metadata", "walk 500 variables with 20 attributes each", None, None),
+    Workload("write_metadata", "write 500 variables with 20 attributes each", None, None),
+    Workload("read_values", 'read 100,000 values by "getVarData"', 1.3, 100_000),
+    Workload("read_values_hyper", 'read 100,000 values by "hyperGetVarData"', 1.3, 100_000),
+    Workload("read_text", "read 100,000 texts of 32 characters", None, None),
+    Workload("write_text", "write 100,000 texts of 32 characters", None, None),
+    Workload("widen", "widen characters, against memcpy of the same traffic", 1.3, None),
+    Workload("narrow", "narrow characters, likewise", 1.3, None),
+    Workload("read_strided", "read every second value of 2000 images, each way", 1.02, None),
+    Workload("epoch_breakdown", "break 1,000,000 epochs down", 1.05, None),
+    Workload("epoch_compute", "compute 1,000,000 epochs", 1.05, None),
+    Workload("epoch16_breakdown", "break 1,000,000 epoch16s down", 1.05, None),
+    Workload("epoch16_compute", "compute 1,000,000 epoch16s", 1.05, None),
+    Workload("get_constant", 'call "getConstantValue"', None, 200_000),
+    Workload("unknown_command", "call an unknown command", None, 200_000),
+    Workload("refused_argument", "have an argument refused", None, 200_000),
+    Workload("library_failure", "have the library fail", None, 200_000),
+)
+
+# What users can set: the workload without and with it.
+SETTINGS = (
+    Setting("read-only mode, for a metadata walk", "walk_metadata", "walk_metadata_read_only"),
+    Setting("CDF cache of 2 buffers, for the same walk", "walk_metadata", "walk_metadata_cache_2"),
+    Setting("validation off, to open and close 500 variables", "open_close",
+            "open_close_unvalidated"),
+    Setting("CDF cache of 2 buffers, for a strided read", "read_strided", "read_strided_cache_2"),
+    Setting("blocking factor 100, for single values of a gzip variable in random order",
+            "read_values_gzip", "read_values_gzip_100"),
+    Setting("MD5 checksum, reading 51 MB", "read", "read_checksum"),
+    Setting("MD5 checksum, writing 51 MB", "write", "write_checksum"),
+)
