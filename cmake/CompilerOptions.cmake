@@ -47,4 +47,7 @@ if(AMBRIX_SANITIZE)
   add_link_options(-fsanitize=address,undefined)
   target_compile_options(ambrix_options INTERFACE
     -fsanitize=undefined -fno-sanitize-recover=all)
+  if(CMAKE_CXX_COMPILER_ID STREQUAL "Clang")
+    target_compile_options(ambrix_options INTERFACE -fsanitize=fuzzer-no-link)  # libFuzzer's eyes
+  endif()
 endif()

@@ -4,7 +4,7 @@
 #include <ambrix/embedded.h>
 
 #include <cstddef>
-#include <string>
+#include <string_view>
 #include <vector>
 
 #include "fuzz/calls/commands.h"
@@ -25,9 +25,10 @@ std::size_t placeOfNotText();
 void requireSane(const Command& command, const std::vector<ambrix::Array>& results,
                  std::size_t outputs);
 
-/// A value that was read has the class and the number of elements that its description asks for.
-void requireElements(const char* command, ambrix::ArrayView value, const Variable& variable,
-                     std::size_t values);
+/// A value that a reader of variables returns has the class and the number of elements that the
+/// variable and the arguments ask for.
+void requireFitting(std::string_view command, const std::vector<ambrix::Array>& arguments,
+                    ambrix::ArrayView value, const Variable& variable);
 
 /// Nothing is alive but what was before and the results.
 void requireNothingLeft(const ambrix::LiveCounts& before,

@@ -93,6 +93,9 @@ class Sequence {
   void failed(const std::string& what);
   void adoptUnreturned(const CallInput& input);
   void checkWarnings(std::string_view command) const;
+  void checkValue(std::string_view command, const CallInput& input,
+                  const std::vector<Array>& results);
+  Variable described(const CallInput& input);
   void finish();
 
   Choices choices_;
@@ -177,8 +180,30 @@ void Sequence::succeeded(const Command& command, const CallInput& input,
   if (module_.leaks() != ambrix::LiveCounts{}) violation("something was left behind");
   requireSane(command, results, input.outputs);
   checkWarnings(name);
+  checkValue(name, input, results);
   input.apply(name, results, world_);
   if (results.empty()) adoptUnreturned(input);
+}
+
+/// What the library says of the variable that a call was about.
+Variable Sequence::described(const CallInput& input) {
+  if (const auto scripted = scriptedVariable()) return *scripted;
+  ambrix::failAllocation(0);
+  const auto told = module_.call("inquireVar", {input.arguments[0], input.arguments[1]});
+  Variable variable{
+      datatypeOfName(told[1].utf8()), static_cast<long>(told[2].data<double>()[0]), {}};
+  for (const double size : told[3].data<double>())
+    variable.sizes.push_back(static_cast<long>(size));
+  return variable;
+}
+
+void Sequence::checkValue(std::string_view command, const CallInput& input,
+                          const std::vector<Array>& results) {
+  constexpr std::string_view kReaders[] = {"getVarData", "getVarRecordData", "hyperGetVarData",
+                                           "getVarPadValue"};
+  const bool reads = std::ranges::find(kReaders, command) != std::end(kReaders);
+  if (!reads || results.empty()) return;
+  requireFitting(command, input.arguments, results[0], described(input));
 }
 
 void Sequence::checkWarnings(std::string_view command) const {

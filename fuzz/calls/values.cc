@@ -77,15 +77,28 @@ struct Datatype {
   long code;
   ClassId classId;
   std::size_t bytes;
+  const char* name;
 };
 
+// clang-format off
 constexpr Datatype kDatatypes[] = {
-    {1, ClassId::kInt8, 1},     {2, ClassId::kInt16, 2},   {4, ClassId::kInt32, 4},
-    {11, ClassId::kUint8, 1},   {12, ClassId::kUint16, 2}, {14, ClassId::kUint32, 4},
-    {21, ClassId::kSingle, 4},  {22, ClassId::kDouble, 8}, {31, ClassId::kDouble, 8},
-    {32, ClassId::kDouble, 16}, {41, ClassId::kInt8, 1},   {44, ClassId::kSingle, 4},
-    {45, ClassId::kDouble, 8},  {51, ClassId::kChar, 1},   {52, ClassId::kChar, 1},
+    {1,  ClassId::kInt8,   1,  "cdf_int1"},
+    {2,  ClassId::kInt16,  2,  "cdf_int2"},
+    {4,  ClassId::kInt32,  4,  "cdf_int4"},
+    {11, ClassId::kUint8,  1,  "cdf_uint1"},
+    {12, ClassId::kUint16, 2,  "cdf_uint2"},
+    {14, ClassId::kUint32, 4,  "cdf_uint4"},
+    {21, ClassId::kSingle, 4,  "cdf_real4"},
+    {22, ClassId::kDouble, 8,  "cdf_real8"},
+    {31, ClassId::kDouble, 8,  "cdf_epoch"},
+    {32, ClassId::kDouble, 16, "cdf_epoch16"},
+    {41, ClassId::kInt8,   1,  "cdf_byte"},
+    {44, ClassId::kSingle, 4,  "cdf_float"},
+    {45, ClassId::kDouble, 8,  "cdf_double"},
+    {51, ClassId::kChar,   1,  "cdf_char"},
+    {52, ClassId::kChar,   1,  "cdf_uchar"},
 };
+// clang-format on
 
 const Datatype* findDatatype(long code) {
   const auto* found =
@@ -149,6 +162,12 @@ ClassId classOfDatatype(long datatype) {
 std::size_t bytesOfDatatype(long datatype) {
   const Datatype* found = findDatatype(datatype);
   return found == nullptr ? 0 : found->bytes;
+}
+
+long datatypeOfName(std::string_view name) {
+  const auto* found =
+      std::ranges::find_if(kDatatypes, [name](const Datatype& row) { return name == row.name; });
+  return found == std::end(kDatatypes) ? 0 : found->code;
 }
 
 bool isText(long datatype) {

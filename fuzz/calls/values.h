@@ -29,6 +29,8 @@ Array valuesOf(Choices& choices, ClassId classId, std::size_t count);
 ClassId classOfDatatype(long datatype);
 std::size_t bytesOfDatatype(long datatype);
 bool isText(long datatype);
+/// The datatype that an inquiry names, such as "cdf_int4"; 0 for others.
+long datatypeOfName(std::string_view name);
 
 /// The array in a few words, for the log of calls.
 std::string shown(ArrayView array);
