@@ -43,6 +43,14 @@ function testThereIsAFunctionForEachCommand (commands)
   assert (sort (here), sort ([names; {"info"; "read"; "write"; "plot"}]));
 endfunction
 
+## INDEX tells users what there is.
+function testTheIndexListsEachFunction (commands)
+  names = cellfun (@(command) command.name, commands, "UniformOutput", false);
+  index = fileread (fullfile (getenv ("AMBRIX_OCTAVE"), "INDEX"));
+  listed = regexp (index, '^ +ambrix\.(\w+)$', "tokens", "lineanchors");
+  assert (sort ([listed{:}]'), sort ([names; {"info"; "read"; "write"; "plot"}]));
+endfunction
+
 function testFunctionsTakeAndReturnAsManyAsTheTableSays (commands)
   wrong = "TOLVEX:ambrix:validate:wrongNumberOfInputs";
   for k = 1:numel (commands)
@@ -80,6 +88,7 @@ endfunction
 
 commands = table ();
 testThereIsAFunctionForEachCommand (commands);
+testTheIndexListsEachFunction (commands);
 testFunctionsTakeAndReturnAsManyAsTheTableSays (commands);
 testEveryFunctionHasHelp ();
 testTestsInFunctionsPass ();
