@@ -33,7 +33,8 @@ class PackageTest(unittest.TestCase):
     def make(cls, name):
         folder = pathlib.Path(cls.shared.name, name)
         done = subprocess.run([ROOT / "script/octave-package", folder], stdout=subprocess.PIPE,
-                              text=True, check=True)
+                              text=True, check=True,
+                              env={**os.environ, "SOURCE_DATE_EPOCH": "1767225600"})
         package = pathlib.Path(done.stdout.strip())
         assert package.parent == folder
         return package
