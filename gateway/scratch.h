@@ -37,7 +37,7 @@ class ScratchBuffer {
   explicit ScratchBuffer(std::size_t bytes) : memory_(static_cast<char*>(qvMalloc(bytes + 1))) {
     memory_.get()[bytes] = '\0';
   }
-  [[nodiscard]] char* data() const { return memory_.get(); }
+  [[nodiscard]] char* data() const noexcept { return memory_.get(); }
 
  private:
   std::unique_ptr<char, HostFree> memory_;

@@ -51,22 +51,27 @@ const std::string& FakeCdflib::text(const std::string& item) const {
   return found == texts_.end() ? kNone : found->second;
 }
 
-void FakeCdflib::give(void* buffer) const {
+void FakeCdflib::give(void* buffer, std::size_t bytes) {
+  if (fill_ && bytes == 0) return;  // a refused count: it does not look at the buffer
   if (buffer == nullptr) {
     ADD_FAILURE() << "the library would write to a null pointer";
+  } else if (fill_) {
+    bytesMoved_ = bytes;
+    std::memset(buffer, *fill_, bytes);
   } else if (!data_.empty()) {
     std::memcpy(buffer, data_.data(), data_.size());
   }
 }
 
-void FakeCdflib::take(const void* buffer) {
+void FakeCdflib::take(const void* buffer, std::size_t bytes) {
   if (buffer == nullptr) {
     sawNullData_ = true;
     ADD_FAILURE() << "the library would read from a null pointer";
     return;
   }
-  const auto* bytes = static_cast<const unsigned char*>(buffer);
-  bytesRead_.assign(bytes, bytes + bytesToRead_);
+  if (fill_) bytesToRead_ = bytesMoved_ = bytes;
+  const auto* data = static_cast<const unsigned char*>(buffer);
+  bytesRead_.assign(data, data + bytesToRead_);
 }
 
 double FakeCdflib::nextEpoch() {

@@ -8,6 +8,7 @@
 
 #include <cstddef>
 #include <map>
+#include <optional>
 #include <string>
 #include <vector>
 
@@ -30,6 +31,14 @@ class FakeCdflib {
     const auto* bytes = reinterpret_cast<const Bytes::value_type*>(values.data());
     data_.assign(bytes, bytes + values.size() * sizeof(T));
   }
+  /// From now on data are as many bytes as the library moves for the description of the variable or
+  /// entry: it fills that many with this byte, and reads that many of what it is handed.
+  void moveExactly(unsigned char fill) { fill_ = fill; }
+  [[nodiscard]] bool movesExactly() const { return fill_.has_value(); }
+  /// The number of bytes that it filled or read last.
+  [[nodiscard]] std::size_t bytesMoved() const { return bytesMoved_; }
+  void forgetBytesMoved() { bytesMoved_ = 0; }
+
   /// The results of the epoch routines, one call each; the last one stays.
   void answerEpochs(std::vector<double> epochs) { epochs_ = std::move(epochs); }
 
@@ -58,8 +67,9 @@ class FakeCdflib {
   [[nodiscard]] long number(const std::string& item, std::size_t index = 0) const;
   [[nodiscard]] const Numbers& numbers(const std::string& item) const;
   [[nodiscard]] const std::string& text(const std::string& item) const;
-  void give(void* buffer) const;
-  void take(const void* buffer);
+  /// `bytes` is what the library moves, which counts after `moveExactly`.
+  void give(void* buffer, std::size_t bytes);
+  void take(const void* buffer, std::size_t bytes);
   double nextEpoch();
 
  private:
@@ -75,6 +85,8 @@ class FakeCdflib {
   std::size_t bytesToRead_ = 0;
   Bytes bytesRead_;
   bool sawNullData_ = false;
+  std::optional<unsigned char> fill_;
+  std::size_t bytesMoved_ = 0;
 };
 
 /// The one that the program is linked with.

@@ -6,10 +6,13 @@
 #include <cstdarg>
 #include <cstddef>
 #include <cstdint>
+#include <span>
 #include <string>
+#include <string_view>
 
 #include "tests/support/fake_cdflib.h"
 #include "tests/support/fake_cdflib_items.h"
+#include "tests/support/fake_cdflib_sizes.h"
 
 namespace {
 
@@ -64,16 +67,17 @@ class ArgumentList {
 
   void readArgument(const Item& item, char kind) {
     if (kind >= 'a') {
-      readInput(kind);
+      readInput(item, kind);
     } else {
       fill(item.name, kind);
     }
   }
 
-  void readInput(char kind) {
+  void readInput(const Item& item, char kind) {
     switch (kind) {
       case 'n':
         lastNumber_ = number();
+        if (item.name == std::string_view("zVAR_RECCOUNT_")) records_ = lastNumber_;
         return show(std::to_string(lastNumber_));
       case 'h':
         return show(std::to_string(reinterpret_cast<std::uintptr_t>(pointer<void>())));
@@ -81,12 +85,29 @@ class ArgumentList {
         return show('\'' + std::string(pointer<const char>()) + '\'');
       case 'v':
         if (createdDimensions_ < 0 && operation_ == CREATE_) createdDimensions_ = lastNumber_;
-        return showVector(pointer<const long>());
+        return readVector(item.name);
       case 'p':
         return show('[' + std::to_string(*pointer<const long>()) + ']');
       default:
-        fake_.take(pointer<const void>());
+        fake_.take(pointer<const void>(), bytesOfData(item.name));
     }
+  }
+
+  void readVector(std::string_view item) {
+    const auto* entries = pointer<const long>();
+    if (item == "zVAR_DIMCOUNTS_") counts_ = {entries, dimensions()};
+    showVector(entries);
+  }
+
+  /// What the library would move for this item of data.
+  [[nodiscard]] std::size_t bytesOfData(std::string_view item) const {
+    if (item == "zVAR_HYPERDATA_") return ambrix_test::bytesOfHyperslab(records_, counts_);
+    return ambrix_test::bytesOfValue();
+  }
+
+  /// Of the variable that the stand-in was told of.
+  [[nodiscard]] std::size_t dimensions() const {
+    return std::min(fake_.numbers("zVAR_DIMSIZES_").size(), kMaxDims);
   }
 
   void fill(const std::string& item, char kind) {
@@ -113,7 +134,7 @@ class ArgumentList {
         *pointer<CDFid>() = reinterpret_cast<CDFid>(fake_.number("handle"));
         break;
       default:
-        fake_.give(pointer<void>());
+        fake_.give(pointer<void>(), bytesOfData(item));
     }
   }
 
@@ -159,6 +180,8 @@ class ArgumentList {
   long lastNumber_ = 0;  // the status, when its text is asked for
   long operation_ = 0;
   long createdDimensions_ = -1;  // of the variable that the list creates
+  long records_ = 0;             // of the hyperslab
+  std::span<const long> counts_;
   std::size_t given_ = 0;
 };
 

@@ -7,9 +7,12 @@
 #include <string>
 
 #include "tests/support/fake_cdflib.h"
+#include "tests/support/fake_cdflib_sizes.h"
 
 namespace {
 
+using ambrix_test::bytesOfEntry;
+using ambrix_test::bytesOfRecord;
 using ambrix_test::fakeCdflib;
 
 std::string textOf(const char* routine, CDFid id, std::initializer_list<long> numbers) {
@@ -89,13 +92,14 @@ CDFstatus CDFinquireAttrEntry(CDFid id, int kind, long attribute, long entry, lo
 }
 
 CDFstatus CDFgetAttrEntry(CDFid id, int kind, long attribute, long entry, void* value) {
-  fakeCdflib().give(value);
+  fakeCdflib().give(value, bytesOfEntry(fakeCdflib().number("CDFinquireAttrEntry", 0),
+                                        fakeCdflib().number("CDFinquireAttrEntry", 1)));
   return fakeCdflib().finish(textOf("CDFgetAttrEntry", id, {kind, attribute, entry}));
 }
 
 CDFstatus CDFputAttrEntry(CDFid id, int kind, long attribute, long entry, long datatype,
                           long elements, void* value) {
-  fakeCdflib().take(value);
+  fakeCdflib().take(value, bytesOfEntry(datatype, elements));
   return fakeCdflib().finish(
       textOf("CDFputAttrEntry", id, {kind, attribute, entry, datatype, elements}));
 }
@@ -105,12 +109,12 @@ CDFstatus CDFdeleteAttrEntry(CDFid id, int kind, long attribute, long entry) {
 }
 
 CDFstatus CDFgetVarRecordData(CDFid id, int zVar, long variable, long record, void* buffer) {
-  fakeCdflib().give(buffer);
+  fakeCdflib().give(buffer, bytesOfRecord());
   return fakeCdflib().finish(textOf("CDFgetVarRecordData", id, {zVar, variable, record}));
 }
 
 CDFstatus CDFputVarRecordData(CDFid id, int zVar, long variable, long record, void* buffer) {
-  fakeCdflib().take(buffer);
+  fakeCdflib().take(buffer, bytesOfRecord());
   return fakeCdflib().finish(textOf("CDFputVarRecordData", id, {zVar, variable, record}));
 }
 

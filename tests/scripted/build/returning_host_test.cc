@@ -55,6 +55,14 @@ TEST(ReturningHostTest, TheExceptionIsAStandardOne) {
   }
 }
 
+TEST(ReturningHostTest, TheCatalogueIsAskedOnce) {
+  const RaisedError error = raised();
+  const char* const text = error.what();
+  catalogueFails = true;
+  EXPECT_EQ(error.what(), text);
+  catalogueFails = false;
+}
+
 TEST(ReturningHostTest, ACatalogueThatFailsLeavesTheIdentifierAsText) {
   catalogueFails = true;
   EXPECT_STREQ(raised().what(), "mismatchedVarianceSize");

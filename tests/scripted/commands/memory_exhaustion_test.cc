@@ -1,6 +1,8 @@
 // Memory that runs out at each point of each command: that of the host, and the module's own.
 #include <functional>
+#include <new>
 
+#include "gateway/errors.h"
 #include "gateway/open_file_registry.h"
 #include "tests/scripted/commands/command_cases.h"
 #include "tests/support/failing_new.h"
@@ -17,6 +19,7 @@ class MemoryExhaustionTest : public CommandTest, public testing::WithParamInterf
  protected:
   MemoryExhaustionTest() {
     fake.answer("CDFgetValidate", {1});
+    fake.moveExactly(0);
     usual = outcome([](std::uint64_t) {}, 0);
   }
   ~MemoryExhaustionTest() override {
@@ -56,6 +59,7 @@ std::string MemoryExhaustionTest::outcome(const std::function<void(std::uint64_t
 }
 
 std::uint64_t MemoryExhaustionTest::failEach(const std::function<void(std::uint64_t)>& fail) {
+  call("open", {"any.cdf"});
   const auto alive = ::ambrix::liveCounts();
   const auto files = openFiles();
   for (std::uint64_t n = 1; n < kMoreThanAnyCommandTakes; ++n) {
@@ -97,6 +101,52 @@ TEST_P(MemoryExhaustionTest, WhileAFailureIsReportedIsAnErrorLikewise) {
 
 INSTANTIATE_TEST_SUITE_P(Commands, MemoryExhaustionTest, testing::ValuesIn(commandCases()),
                          [](const auto& given) { return given.param.command; });
+
+/// Each error, with texts too long to fit into a string itself.
+std::vector<std::function<TOLVEX::ambrix::MessageId()>> errors() {
+  namespace cdflib = TOLVEX::ambrix::cdflib;
+  namespace validate = TOLVEX::ambrix::validate;
+  static const std::string kText(100, 't');
+  return {[] { return cdflib::badDimSpec(1, kText); },
+          [] { return cdflib::badDimensionExtent(kText, 1); },
+          [] { return cdflib::badEpoch16Modulus(); },
+          [] { return cdflib::badEpochVector(7); },
+          [] { return cdflib::badPutAttrEntryDatatype(kText, kText); },
+          [] { return cdflib::datatypeMismatch(kText, kText); },
+          [] { return cdflib::invalidCompressionParameter(1, kText); },
+          [] { return cdflib::invalidOperation(kText); },
+          [] { return cdflib::libraryFailure(kText, kText); },
+          [] { return cdflib::mismatchedVarianceSize(1, 2); },
+          [] { return cdflib::unrecognizedConstantName(kText); },
+          [] { return cdflib::unrecognizedValue(1, kText); },
+          [] { return cdflib::wrongNumberOfHyperPutVarDataElements(kText, 1, kText, 2); },
+          [] { return cdflib::wrongNumberOfPadValueElements(kText, 1); },
+          [] { return cdflib::wrongNumberOfPutVarDataElements(kText, 1); },
+          [] { return cdflib::wrongNumberOfPutVarRecordDataElements(kText, 1); },
+          [] { return validate::argumentNotDoublePrecision(kText); },
+          [] { return validate::argumentNotDoubleScalar(kText); },
+          [] { return validate::argumentNotUint64Scalar(kText); },
+          [] { return validate::wrongNumberOfInputs(); }};
+}
+
+TEST(ErrorsAndMemoryTest, AnErrorThatCannotBeMadeLeavesNothingBehind) {
+  for (const auto& make : errors()) {
+    const std::string usual = messageText(make());
+    std::uint64_t n = 0;
+    for (bool made = false; !made;) {
+      failNew(++n);
+      try {
+        const TOLVEX::ambrix::MessageId error = make();
+        failNew(0);
+        made = true;
+        EXPECT_EQ(messageText(error), usual);
+      } catch (const std::bad_alloc&) {
+        EXPECT_FALSE(newFailurePending()) << usual;
+      }
+    }
+    EXPECT_GT(n, 1U) << usual;
+  }
+}
 
 using FilesAndMemoryTest = CommandTest;
 
