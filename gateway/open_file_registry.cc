@@ -37,8 +37,8 @@ void OpenFileRegistry::markFreed(CdfId file) {
 }
 
 void OpenFileRegistry::clear() {
-  open_ = {};
-  freed_ = {};
+  open_ = std::vector<CdfId>();  // {} would keep the memory
+  freed_ = std::vector<CdfId>();
 }
 
 OpenFileRegistry& openFileRegistry() {

@@ -1,6 +1,7 @@
 // No room for what is written: an error says so, and nothing else suffers.
 #include <algorithm>
 #include <filesystem>
+#include <ostream>
 #include <random>
 
 #include "tests/module/support/environment.h"
@@ -25,6 +26,10 @@ struct Storage {
   int format = 1;
   int fileCompression = 0;
   int variableCompression = 0;
+
+  friend std::ostream& operator<<(std::ostream& out, const Storage& shown) {
+    return out << shown.name;
+  }
 };
 
 class FullDiskTest : public ModuleTest, public testing::WithParamInterface<Storage> {

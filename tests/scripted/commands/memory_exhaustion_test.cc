@@ -176,6 +176,9 @@ TEST_F(FilesAndMemoryTest, RegisteringAndFreeingTakeNoMemoryOnceThereIsRoom) {
     failNew(0);
   }
   EXPECT_EQ(registry.size(), 100U);
+  registry.clear();
+  failNew(1);
+  EXPECT_THROW(registry.reserve(), std::bad_alloc) << "it has kept its memory";
 }
 
 }  // namespace
