@@ -18,6 +18,7 @@
 
 #include "tool/failure.h"
 #include "tool/held_signals.h"
+#include "tool/scratch_folder.h"
 #include "tool/standard_output.h"
 #include "tool/steps.h"
 #include "tool/text.h"
@@ -114,11 +115,13 @@ WorkerEnd watch(pid_t worker, const HeldSignals& held, const Steps& steps, doubl
 WorkerEnd supervise(double timeLimit, const std::function<int()>& work) {
   const HeldSignals held;
   const Steps steps;
+  const ScratchFolder scratch;
   const pid_t watcher = ::getpid();
   const pid_t worker = ::fork();
   if (worker < 0) throw std::system_error(errno, std::generic_category(), "fork");
   if (worker == 0) {
     prepareWorker(watcher);
+    scratch.use();
     held.release();
     steps.adopt();
     const int status = work();

@@ -133,8 +133,8 @@ void Driver::report(std::uint64_t number, const DamagedFile& file, bool validate
               options_.seed, number, validated ? "on" : "off", file.description.c_str(),
               result.details.c_str());
   if (options_.keep.empty()) return;
-  const fs::path folder =
-      fs::path(options_.keep) / fmt::format("{}-{}-{}", options_.seed, number, validated);
+  const fs::path folder = fs::path(options_.keep) /
+                          fmt::format("{}-{}-{}", options_.seed, number, validated ? "on" : "off");
   fs::create_directories(folder);
   writeFile(file.file, folder);
 }
