@@ -19,26 +19,34 @@ void insertInto(std::vector<CdfId>& files, CdfId file) {
 void OpenFileRegistry::reserve() {
   if (open_.size() == open_.capacity()) open_.reserve(2 * open_.size() + 1);
   freed_.reserve(open_.capacity());  // so that a file can be marked at any time
+  written_.reserve(open_.capacity());
 }
 
 void OpenFileRegistry::insert(CdfId file) {
   reserve();
   insertInto(open_, file);
   std::erase(freed_, file);
+  std::erase(written_, file);
 }
 
 void OpenFileRegistry::erase(CdfId file) {
   std::erase(open_, file);
   std::erase(freed_, file);
+  std::erase(written_, file);
 }
 
 void OpenFileRegistry::markFreed(CdfId file) {
   if (contains(file)) insertInto(freed_, file);
 }
 
+void OpenFileRegistry::markWritten(CdfId file) {
+  if (contains(file)) insertInto(written_, file);
+}
+
 void OpenFileRegistry::clear() {
   open_ = std::vector<CdfId>();  // {} would keep the memory
   freed_ = std::vector<CdfId>();
+  written_ = std::vector<CdfId>();
 }
 
 OpenFileRegistry& openFileRegistry() {

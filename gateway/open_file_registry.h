@@ -30,12 +30,20 @@ class OpenFileRegistry {
     return !freed_.empty() && std::ranges::binary_search(freed_, file);
   }
 
+  /// Notes that records may wait in the library to be written to a registered file. Takes no
+  /// memory.
+  void markWritten(CdfId file);
+  [[nodiscard]] bool isWritten(CdfId file) const {
+    return !written_.empty() && std::ranges::binary_search(written_, file);
+  }
+
   /// In ascending order.
   [[nodiscard]] const std::vector<CdfId>& files() const { return open_; }
 
  private:
   std::vector<CdfId> open_;
-  std::vector<CdfId> freed_;  // a part of open_ that must not reach the library
+  std::vector<CdfId> freed_;    // a part of open_ that must not reach the library
+  std::vector<CdfId> written_;  // a part of open_
 };
 
 /// Is there before the module's other static objects and after them: a process may end in an order

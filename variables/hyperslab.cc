@@ -14,16 +14,6 @@ bool wraps(long start, long count, long interval) {
   return start >= 0 && count >= 1 && interval >= 1 && !fitsLibrary(start + (count - 1) * interval);
 }
 
-/// Whether the library moves a record of the hyperslab in one piece.
-bool takesWholeRecords(const VariableDescription& variable, const LibraryHyperslab& slab) {
-  for (std::size_t i = 0; i < variable.sizes().size(); ++i) {
-    const bool whole = variable.variances()[i] == NOVARY ? slab.count[i] <= 1
-                                                         : slab.count[i] == variable.sizes()[i];
-    if (!whole) return false;
-  }
-  return true;
-}
-
 }  // namespace
 
 void Hyperslab::reverseDimensions() {
@@ -56,6 +46,15 @@ LibraryHyperslab::LibraryHyperslab(const Hyperslab& slab, std::span<const long> 
     start[i] = sizes[i];
     interval[i] = 1;
   }
+}
+
+bool takesWholeRecords(const VariableDescription& variable, const LibraryHyperslab& slab) {
+  for (std::size_t i = 0; i < variable.sizes().size(); ++i) {
+    const bool whole = variable.variances()[i] == NOVARY ? slab.count[i] <= 1
+                                                         : slab.count[i] == variable.sizes()[i];
+    if (!whole) return false;
+  }
+  return true;
 }
 
 void skipNoRecordsThatDoNotVary(const VariableDescription& variable, LibraryHyperslab& slab) {

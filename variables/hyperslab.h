@@ -43,6 +43,9 @@ struct LibraryHyperslab {
   [[nodiscard]] long lastRecord() const { return recordStart + (recordCount - 1) * recordInterval; }
 };
 
+/// Whether the library moves each record of the hyperslab in one piece.
+bool takesWholeRecords(const VariableDescription& variable, const LibraryHyperslab& slab);
+
 /// Of a variable whose records do not vary the library reads whole records with all those between
 /// them, more than were asked for. They are all the same one, so none need be skipped.
 void skipNoRecordsThatDoNotVary(const VariableDescription& variable, LibraryHyperslab& slab);

@@ -14,6 +14,7 @@
 #include "variables/host_dimensions.h"
 #include "variables/hyperslab.h"
 #include "variables/read_values.h"
+#include "variables/sparse_records.h"
 #include "variables/variable_description.h"
 
 namespace TOLVEX::ambrix {
@@ -49,6 +50,7 @@ void getVarData(int, qvArray* outputs[], std::int32_t argumentCount, const qvArr
   const ReadRequest request{routine, 1, variable.elementsPerRecord(), true};
   requireUsableRecord(variable, routine);
   DimensionVector libraryIndices = libraryVector(indices, kBadNumber);
+  writeWaitingRecords(file, number, routine);
   outputs[0] = readValues(variable, dimensions, request, [&](void* buffer) {
     callOnVariable(routine, file, number,                               //
                    zVAR_RECNUMBER_, libraryNumber(record, kBadNumber),  //
@@ -69,6 +71,7 @@ void getVarRecordData(int, qvArray* outputs[], std::int32_t, const qvArray* argu
   const ReadRequest request{routine, variable.valuesPerRecord(), variable.elementsPerRecord(),
                             variable.allDimensionsVary()};
   requireUsableRecord(variable, routine);
+  writeWaitingRecords(file, number, routine);
   outputs[0] = readValues(variable, dimensions, request, [&](void* buffer) {
     requireRecordNumber(record, routine);
     checkLibraryStatus(
@@ -98,6 +101,7 @@ void hyperGetVarData(int, qvArray* outputs[], std::int32_t, const qvArray* argum
   requireUsableRecord(variable, routine);
   LibraryHyperslab librarySlab(slab, variable.sizes());
   skipNoRecordsThatDoNotVary(variable, librarySlab);
+  writeWaitingRecords(file, number, routine);
   outputs[0] = readValues(variable, dimensions, request, [&](void* buffer) {
     moveHyperslab(routine, file, number, librarySlab, GET_, buffer);
   });

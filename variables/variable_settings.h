@@ -52,6 +52,7 @@ void setVariableNumber(int, qvArray*[], std::int32_t, const qvArray* arguments[]
   if constexpr (row.dividesByRecord) {
     requireDivisibleRecord(file, inquireVariable(file, variable, row.routine), row.routine);
   }
+  openFileRegistry().markWritten(file);  // initial records are written as others
   if constexpr (row.operation == SELECT_) {
     callOnVariable(row.routine, file, variable, row.item, value);
   } else {

@@ -16,6 +16,7 @@
 #include "variables/host_dimensions.h"
 #include "variables/hyperslab.h"
 #include "variables/library_data.h"
+#include "variables/sparse_records.h"
 #include "variables/variable_description.h"
 
 namespace TOLVEX::ambrix {
@@ -72,6 +73,7 @@ void putVarData(int, qvArray*[], std::int32_t, const qvArray* arguments[], const
   // hyperslabs.
   const LibraryData value = LibraryData::firstCharacterOf(data);
   DimensionVector libraryIndices = libraryVector(indices, kBadNumber);
+  openFileRegistry().markWritten(file);
   callOnVariable(routine, file, number,                               //
                  zVAR_RECNUMBER_, libraryNumber(record, kBadNumber),  //
                  zVAR_DIMINDICES_, libraryIndices.data(),             //
@@ -96,6 +98,7 @@ void putVarRecordData(int, qvArray*[], std::int32_t, const qvArray* arguments[],
   requireRecordNumber(record, routine);
   requireCountableRecord(variable, record, routine);
   const LibraryData values(data);
+  openFileRegistry().markWritten(file);
   checkLibraryStatus(CDFputVarRecordData(libraryHandle(file, routine), kZVariables, number, record,
                                          values.bytes()),
                      routine);
@@ -126,6 +129,9 @@ void hyperPutVarData(int, qvArray*[], std::int32_t, const qvArray* arguments[],
   }
   requireCountableRecord(variable, librarySlab.lastRecord(), routine);
   const LibraryData values(data);
+  // Parts of records are put into what the library reads first.
+  if (!takesWholeRecords(variable, librarySlab)) writeWaitingRecords(file, number, routine);
+  openFileRegistry().markWritten(file);
   moveHyperslab(routine, file, number, librarySlab, PUT_, values.bytes());
 }
 

@@ -1,0 +1,72 @@
+// Records of sparse variables that wait to be written when others are read.
+#include "tests/support/scripted_test.h"
+
+namespace ambrix_test {
+namespace {
+
+using testing::Contains;
+using testing::HasSubstr;
+using testing::Not;
+
+constexpr const char* kWrite =
+    "SELECT_ CDF_ 7 | zVAR_ 3 | DELETE_ zVAR_RECORDS_ 2147483646 2147483646";
+constexpr const char* kAsk = "SELECT_ CDF_ 7 | zVAR_ 3 | GET_ zVAR_SPARSERECORDS_";
+
+class WaitingRecordsTest : public ScriptedTest {
+ protected:
+  void put() {
+    describe({.sizes = {2}});
+    call("putVarRecordData", {file(), 3, 9, elements<double>(2)});
+    fake.forgetCalls();
+  }
+  const std::vector<std::pair<std::string, Arguments>> readers = {
+      {"getVarData", {file(), 3, 4, 0}},
+      {"getVarRecordData", {file(), 3, 4}},
+      {"hyperGetVarData", {file(), 3, 4, 1, 1, 0, 2, 1}},
+      {"hyperPutVarData", {file(), 3, 4, 1, 1, 0, 1, 1, 8}},
+  };
+};
+
+TEST_F(WaitingRecordsTest, AreWrittenFirst) {
+  fake.answer("zVAR_SPARSERECORDS_", {1});
+  put();
+  for (const auto& [command, arguments] : readers) {
+    call(command, arguments);
+    EXPECT_THAT(calls(), Contains(kWrite)) << command;
+  }
+}
+
+TEST_F(WaitingRecordsTest, NotForVariablesThatHaveAllRecords) {
+  put();
+  for (const auto& [command, arguments] : readers) {
+    call(command, arguments);
+    EXPECT_THAT(fake.calls(), Contains(kAsk)) << command;
+    EXPECT_THAT(calls(), Not(Contains(HasSubstr("DELETE_")))) << command;
+  }
+}
+
+TEST_F(WaitingRecordsTest, NorForFilesThatWereOnlyRead) {
+  describe({.sizes = {2}});
+  fake.answer("zVAR_SPARSERECORDS_", {1});
+  for (std::size_t i = 0; i < 3; ++i) {
+    call(readers[i].first, readers[i].second);
+    EXPECT_THAT(calls(), Not(Contains(kAsk)));
+  }
+}
+
+TEST_F(WaitingRecordsTest, NorBeforeWholeRecordsAreWritten) {
+  fake.answer("zVAR_SPARSERECORDS_", {1});
+  put();
+  call("hyperPutVarData", {file(), 3, 4, 1, 1, 0, 2, 1, elements<double>(2)});
+  EXPECT_THAT(calls(), Not(Contains(kAsk)));
+}
+
+TEST_F(WaitingRecordsTest, AFailureIsThatOfTheReader) {
+  fake.answer("zVAR_SPARSERECORDS_", {1});
+  put();
+  fake.endWith("DELETE_", -2013);
+  EXPECT_EQ(errorOf("getVarData", {file(), 3, 4, 0}), libraryFailure("CDFgetzVarData", -2013));
+}
+
+}  // namespace
+}  // namespace ambrix_test
