@@ -2,7 +2,6 @@
 
 #include <algorithm>
 #include <array>
-#include <cmath>
 #include <cstdio>
 #include <cstring>
 #include <iterator>
@@ -15,13 +14,19 @@ namespace {
 constexpr double kInfinity = std::numeric_limits<double>::infinity();
 
 constexpr double kNumbers[] = {
-    0.0,          1.0,          -1.0,         2.0,           3.0,           5.0,
-    0.5,          -0.5,         -1.9,         9.0,           10.0,          11.0,
-    12.0,         33.0,         51.0,         100.0,         255.0,         65536.0,
-    2147483646.0, 2147483647.0, 2147483648.0, -2147483648.0, -2147483649.0, 4294967295.0,
-    4294967296.0, 4294967299.0, 0x1p53,       0x1p62,        -0x1p62,       0x1.fffffffffffffp62,
-    0x1p63,       -0x1p63,      1e19,         1e300,         -1e31,         5e-324,
-    kInfinity,    -kInfinity,   std::nan(""),
+    0.0,           1.0,           -1.0,
+    2.0,           3.0,           5.0,
+    0.5,           -0.5,          -1.9,
+    9.0,           10.0,          11.0,
+    12.0,          33.0,          51.0,
+    100.0,         255.0,         65536.0,
+    2147483646.0,  2147483647.0,  2147483648.0,
+    -2147483648.0, -2147483649.0, 4294967295.0,
+    4294967296.0,  4294967299.0,  0x1p53,
+    0x1p62,        -0x1p62,       0x1.fffffffffffffp62,
+    0x1p63,        -0x1p63,       1e19,
+    1e300,         -1e31,         5e-324,
+    kInfinity,     -kInfinity,    std::numeric_limits<double>::quiet_NaN(),
 };
 
 constexpr ClassId kClasses[] = {
