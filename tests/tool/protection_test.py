@@ -12,48 +12,10 @@ import unittest
 
 from support.ambrix_session import array
 from tool.example_file import write_example
-from tool.processes import children_of, is_running, wait_until, write_busy
-from tool.support import TOOL, ToolCase
+from tool.processes import BUSY, ProtectionCase, children_of, is_running, wait_until
+from tool.support import ToolCase
 
-BUSY = "busy.cdf"  # small, and still takes hours to be read
 CRASHES = (signal.SIGSEGV, signal.SIGABRT, signal.SIGBUS, signal.SIGFPE)
-
-
-class ProtectionCase(ToolCase):
-    def setUp(self):
-        super().setUp()
-        write_busy(self.session(), BUSY)
-
-    def start(self, *arguments, **options):
-        process = subprocess.Popen([TOOL, *arguments], cwd=self.folder, stderr=subprocess.PIPE,
-                                   **options)
-        self.addCleanup(process.stderr.close)
-        self.addCleanup(process.wait)
-        self.addCleanup(process.kill)
-        return process
-
-    def converting(self, *options):
-        """A conversion that has begun to write, and its worker."""
-        process = self.start("convert", BUSY, "out.cdf", "--majority", "column", *options)
-        wait_until(lambda: len(self.files()) > 1)
-        return process, wait_until(lambda: children_of(process.pid))[0]
-
-    def dumping(self, *options):
-        """A dump into a file, and its worker."""
-        process = self.start("dump", BUSY, "v", "--format", "csv", "--output", "out.csv", *options)
-        wait_until(lambda: any(os.path.getsize(self.path(f)) > 0 and "unfinished" in f
-                               for f in self.files()))
-        return process, wait_until(lambda: children_of(process.pid))[0]
-
-    def files(self):
-        return sorted(os.listdir(self.folder))
-
-    def error_of(self, process):
-        self.assertEqual(process.wait(), 1)
-        return process.stderr.read().decode()
-
-    def assert_nothing_left(self):
-        self.assertEqual(self.files(), [BUSY])
 
 
 class CrashTest(ProtectionCase):
