@@ -51,3 +51,11 @@ if(AMBRIX_SANITIZE)
     target_compile_options(ambrix_options INTERFACE -fsanitize=fuzzer-no-link)  # libFuzzer's eyes
   endif()
 endif()
+
+# Coverage is counted in the layers of the module only; whatever takes in their objects is linked
+# for it.
+add_library(ambrix_coverage INTERFACE)
+if(AMBRIX_COVERAGE)
+  target_compile_options(ambrix_coverage INTERFACE --coverage)
+  add_link_options(--coverage)
+endif()

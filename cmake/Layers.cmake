@@ -30,7 +30,7 @@ function(ambrix_layer name)
     VISIBILITY_INLINES_HIDDEN ON)
   list(TRANSFORM arg_SEES PREPEND ambrix_root_ OUTPUT_VARIABLE seen)
   target_link_libraries(ambrix_${name} PRIVATE
-    ambrix_options ambrix_root_${name} ${seen} CDF::headers Boost::headers)
+    ambrix_options ambrix_coverage ambrix_root_${name} ${seen} CDF::headers Boost::headers)
   set_property(GLOBAL APPEND PROPERTY AMBRIX_LAYERS ${name})
 endfunction()
 
