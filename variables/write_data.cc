@@ -121,8 +121,9 @@ void hyperPutVarData(int, qvArray*[], std::int32_t, const qvArray* arguments[],
   requireClassOfDatatype(data, variable.datatype);
   requireUsableRecord(variable, routine);
   const LibraryHyperslab librarySlab(slab, variable.sizes());
-  const std::size_t bytesRead = saturatedProduct(
-      {valuesRead(variable, librarySlab), variable.elements, datatypeSize(variable.datatype)});
+  const long count = valuesRead(variable, librarySlab);
+  const long bytesPerValue = multiplySaturated(variable.elements, datatypeSize(variable.datatype));
+  const std::size_t bytesRead = saturatedProduct({count, bytesPerValue});
   // More counts than dimensions can make the expected number smaller than what the library reads.
   if (bytesRead > bytesOfArray(data, variable.datatype)) {
     raiseLibraryFailure(BAD_DIM_COUNT, routine);
