@@ -5,6 +5,7 @@
 #include <fmt/format.h>
 #include <unistd.h>
 
+#include <algorithm>
 #include <array>
 #include <csignal>
 #include <cstdio>
@@ -78,14 +79,23 @@ Frame frameOfCrash(const std::string& line) {
   return frame;
 }
 
-/// "#0 0x7f in FUNCTION FILE:LINE", of a sanitizer.
+/// "#0 0x7f in FUNCTION FILE:LINE", of a sanitizer; the file may be relative to the build.
 Frame frameOfSanitizer(const std::string& line) {
   const std::size_t in = line.find(" in ");
   if (in == std::string::npos) return {"?", line};
-  const std::string_view rest = std::string_view(line).substr(in + 4);
-  const std::size_t blank = rest.rfind(" /");
-  if (blank == std::string_view::npos) return {std::string(rest), ""};
-  return {std::string(rest.substr(0, blank)), std::string(rest.substr(blank + 1))};
+  const std::string rest = line.substr(in + 4);
+  const std::size_t blank = std::min(rest.rfind(' '), rest.size());
+  return {rest.substr(0, blank), rest.substr(std::min(blank + 1, rest.size()))};
+}
+
+/// Whether a source is one of the module, of its host or of this program.
+bool isOurSource(std::string_view file) {
+  if (file.starts_with("/usr/")) return false;
+  constexpr const char* kFolders[] = {"adapters/", "attributes/", "constants/", "epoch/",
+                                      "file/",     "fuzz/",       "gateway/",   "variables/"};
+  return std::ranges::any_of(kFolders, [&](const char* folder) {
+    return contains(file, std::string("/") + folder) && contains(file, ":");
+  });
 }
 
 enum class Owner { kLibrary, kOurs, kSystem };
@@ -94,8 +104,7 @@ enum class Owner { kLibrary, kOurs, kSystem };
 /// the library. Names of C++ are ours there.
 Owner ownerOf(const Frame& frame) {
   if (contains(frame.file, "/cdf-3.") || contains(frame.file, "/libcdf.")) return Owner::kLibrary;
-  if (contains(frame.file, AMBRIX_ROOT) && contains(frame.file, ".cc:")) return Owner::kOurs;
-  if (contains(frame.file, AMBRIX_ROOT) && contains(frame.file, ".h:")) return Owner::kOurs;
+  if (isOurSource(frame.file)) return Owner::kOurs;
   if (contains(frame.file, "ambrix_module")) {
     return frame.function.starts_with("_Z") ? Owner::kOurs : Owner::kLibrary;
   }

@@ -32,6 +32,17 @@ TEST(BlameTest, MemoryOfOursThatTheLibraryOverrunsIsOurFault) {
   EXPECT_FALSE(blameOf(overrun + allocated + kLibrary + kModule).ours);
 }
 
+TEST(BlameTest, SourcesMayBeRelativeToTheBuild) {
+  const std::string library =
+      "    #0 0x7f02 in CDFlib ../cdf/cdf-3.6.3-source/src/lib/cdflib.c:1\n";
+  const std::string module =
+      "    #1 0x7f03 in TOLVEX::ambrix::f() ../../variables/read_data.cc:50\n";
+  const std::string header = "    #1 0x7f03 in g() layers/gateway/gateway/library.h:54\n";
+  EXPECT_FALSE(blameOf("ERROR\n" + library + module).ours);
+  EXPECT_TRUE(blameOf("ERROR\n" + kSystem + module + library).ours);
+  EXPECT_TRUE(blameOf("ERROR\n" + kSystem + header + library).ours);
+}
+
 TEST(BlameTest, ALogWithoutAStackTellsNothing) {
   const Blame blame = blameOf("free(): double free detected\n");
   EXPECT_FALSE(blame.known);
