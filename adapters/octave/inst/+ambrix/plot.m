@@ -19,8 +19,8 @@
 ##
 ## Values that equal FILLVAL, or are not from VALIDMIN to VALIDMAX, are left out. Axes are
 ## logarithmic where SCALETYP says so; labels are made of LABLAXIS or the variable's name and of
-## UNITS, titles of CATDESC or FIELDNAM. Texts, and variables with more dimensions, are the error
-## @code{ambrix:cannotPlot}.
+## UNITS, titles of CATDESC or FIELDNAM. Texts, variables with more dimensions and those without
+## records are the error @code{ambrix:cannotPlot}.
 ##
 ## @example
 ## @group
@@ -36,7 +36,7 @@ function h = plot (file, names, varargin)
     print_usage ("ambrix.plot");
   endif
   options = ambrix.internal.parseOptions ("ambrix.plot", struct ("range", []), varargin);
-  if (ischar (names))
+  if (ischar (names) && rows (names) == 1)
     names = {names};
   endif
   if (! iscellstr (names) || isempty (names))
@@ -224,6 +224,10 @@ endfunction
 %! assert (err.identifier, "ambrix:cannotPlot");
 %! err = ambrix.internal.raised (@() ambrix.plot (id, "None"));
 %! assert (err.identifier, "TOLVEX:ambrix:cdflib:libraryFailure");
+%! err = ambrix.internal.raised (@() ambrix.plot (id, ["Flux"; "Mode"]));
+%! assert (err.identifier, "ambrix:invalidName");
+%! err = ambrix.internal.raised (@() ambrix.plot (id, "Flux", "range", [2, 1]));
+%! assert (err.identifier, "ambrix:cannotPlot");
 %! err = ambrix.internal.raised (@() ambrix.plot (id, 1));
 %! assert (err.identifier, "ambrix:invalidName");
 %! ambrix.close (id);

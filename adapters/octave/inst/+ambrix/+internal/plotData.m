@@ -16,6 +16,9 @@ function picture = plotData (id, name, range)
     error ("ambrix:cannotPlot", ["ambrix.plot: \"%s\" is text or has more than two dimensions; " ...
            "read it, and plot what you need"], name);
   endif
+  if (isempty (values))
+    error ("ambrix:cannotPlot", "ambrix.plot: there are no records of \"%s\" to plot", name);
+  endif
   values = validOf (values, v.attributes);
   picture = struct ("isLog", isLogarithmic (v.attributes), "label", labelOf (v), ...
                     "title", textOf (v.attributes, {"CATDESC", "FIELDNAM"}, name), "names", {{}});
@@ -25,7 +28,7 @@ function picture = plotData (id, name, range)
     picture = imageOf (id, s, v, picture);
   elseif (isSpectrogram (s, v))
     picture.y = dimensionAxis (id, s, v, 1);
-  elseif (! v.recordVariance)
+  elseif (! v.recordVariance && ! isempty (v.sizes))
     picture.x = dimensionAxis (id, s, v, 1);
   else
     picture.names = componentNames (id, s, v);
@@ -78,13 +81,13 @@ function axis = recordAxis (id, s, v, range, count)
     other = onlyEpochs (s, v.records);
   endif
   if (isempty (other) || ! v.recordVariance || ! isempty (other.sizes)
-      || other.records != v.records || strncmp (other.datatype, "CDF_CHAR", 8))
+      || other.records != v.records || ! hasNumbers (other))
     return;
   endif
   axis.values = double (ambrix.read (id, other.name, "time", "fill", "range", range));
   axis.isTime = strncmp (other.datatype, "CDF_EPOCH", 9);
   axis.label = labelOf (other, {"LABLAXIS", "FIELDNAM"});
-  if (axis.isTime)
+  if (axis.isTime && ! isnan (axis.values(1)))
     axis.first = datestr (axis.values(1), "yyyy-mm-dd HH:MM");
   endif
 endfunction
@@ -186,4 +189,22 @@ endfunction
 %! assert (picture.title, "Flux 2024-01-01 00:00");
 %! assert (picture.x.label, "index 1");
 %! assert (picture.y.values, [1; 2; 3]);
+%! ambrix.close (id);
+%!test  # what some files hold: one number, texts or fill values for times
+%! s.data = struct ("one", 5, "a", [1; 2], "b", [3; 4], "missing", [-1e31; 63e12], "c", {{"x"; "y"}});
+%! s.variables.one.recordVariance = false;
+%! s.variables.missing.datatype = "CDF_EPOCH";
+%! s.variables.c.datatype = "CDF_UCHAR";
+%! s.variables.a.attributes.DEPEND_0 = "c";
+%! s.variables.b.attributes.DEPEND_0 = "missing";
+%! [id, restore] = ambrix.internal.example ();
+%! ambrix.close (id);
+%! ambrix.write ("odd", s);
+%! id = ambrix.open ("odd");
+%! picture = ambrix.internal.plotData (id, "one", []);
+%! assert (picture.values, 5);
+%! picture = ambrix.internal.plotData (id, "a", []);
+%! assert (picture.x.values, [1; 2]);
+%! picture = ambrix.internal.plotData (id, "b", []);
+%! assert (isnan (picture.x.values), [true; false]);
 %! ambrix.close (id);
