@@ -71,9 +71,9 @@ function result = read (file, names = {}, varargin)
                      "time", false, "fill", false, "text", {{"cell", "char"}});
   options = ambrix.internal.parseOptions ("ambrix.read", defaults, varargin);
   [id, closer] = ambrix.internal.openToRead (file);
-  if (ischar (names))
+  if (ischar (names) && rows (names) < 2)
     result = readOne (id, names, options);
-  elseif (iscellstr (names) || isempty (names))
+  elseif (iscellstr (names) || (isempty (names) && ! ischar (names)))
     result = readSeveral (id, names, options);
   else
     error ("ambrix:invalidName",
@@ -187,6 +187,23 @@ endfunction
 %! id = ambrix.open (file);
 %! assert (ambrix.read (id, "Mode"), {"fast"; "slow"});
 %! ambrix.close (id);
+%!test  # an EPOCH16 is missing where both of its numbers say so; other fill values are left alone
+%! s.data.t = [-1e31, 0; 5, 0; -1e31, 7];
+%! s.data.v = [1, 2; 3, 4];
+%! s.variables.t.datatype = "CDF_EPOCH16";
+%! s.variables.t.attributes.FILLVAL = [-1e31, 0];
+%! s.variables.v.attributes.FILLVAL = "none";
+%! [id, restore] = ambrix.internal.example ();
+%! ambrix.close (id);
+%! ambrix.write ("filled", s);
+%! r = ambrix.read ("filled", {}, "fill");
+%! assert (r.data.t, [NaN, NaN; 5, 0; -1e31, 7]);
+%! assert (r.data.v, s.data.v);
+%! for records = {"first", "last"}
+%!   ambrix.write ("again", ambrix.read ("filled", {}, "fill", "records", records{1}), "overwrite");
+%!   r = ambrix.read ("again");
+%!   assert (r.data, s.data);
+%! endfor
 %!test  # fill values
 %! [id, restore] = ambrix.internal.example ();
 %! ambrix.createAttr (id, "FILLVAL", "VARIABLE_SCOPE");
@@ -200,6 +217,9 @@ endfunction
 %!error id=TOLVEX:ambrix:cdflib:libraryFailure ambrix.read (file, "None");
 %!error id=TOLVEX:ambrix:cdflib:fileOpenError ambrix.read ("no such file");
 %!error id=ambrix:invalidName ambrix.read (file, 1);
+%!error id=ambrix:invalidName ambrix.read (file, ["Mode"; "Flux"]);
+%!error id=ambrix:invalidOption ambrix.read (file, "Flux", "range", {1, 2});
+%!error id=ambrix:invalidOption ambrix.read (file, "Flux", "slab", {[], "a"});
 %!error id=ambrix:invalidOption ambrix.read (file, "Flux", "wrong");
 %!error id=ambrix:invalidOption ambrix.read (file, "Flux", "slab", [1, 2]);
 %!error id=ambrix:invalidOption ambrix.read (file, {}, "slab", {[]});

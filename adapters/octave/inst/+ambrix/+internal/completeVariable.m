@@ -49,10 +49,26 @@ function [v, data] = storable (v, data, options)
   if (options.time && strncmp (v.datatype, "CDF_EPOCH", 9))
     data = ambrix.internal.fromDays (data, v.datatype, options.records);
   elseif (options.fill && isfloat (data) && isfield (v.attributes, "FILLVAL"))
-    data(isnan (data)) = v.attributes.FILLVAL;
+    data = withFill (data, v, options.records);
   endif
   if (iscellstr (data))
     [data, v] = ambrix.internal.fromCells (data, v, options.records);
+  endif
+endfunction
+
+## A fill value that is no number, or none for each value, was not looked for in reading either.
+function data = withFill (data, v, records)
+  fill = v.attributes.FILLVAL;
+  missing = isnan (data);
+  if (isnumeric (fill) && isscalar (fill))
+    data(missing) = fill;
+  elseif (isnumeric (fill) && numel (fill) == 2 && strcmp (v.datatype, "CDF_EPOCH16"))
+    times = numel (data) / 2;
+    fills = kron (fill(:), ones (times, 1));
+    if (strcmp (records, "last"))
+      fills = repmat (fill(:), times, 1);
+    endif
+    data(missing) = fills(missing(:));
   endif
 endfunction
 

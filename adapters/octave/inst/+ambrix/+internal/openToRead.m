@@ -12,11 +12,11 @@ function [id, closer] = openToRead (file)
     id = file;
     return;
   endif
-  if (! ischar (file))
+  if (! ischar (file) || rows (file) > 1)
     error ("ambrix:invalidFile",
            "ambrix: give the file as a path, or as an identifier from ambrix.open");
   endif
-  id = __ambrix__ ("open", file);
+  id = __ambrix__ ("open", tilde_expand (file));
   closer = onCleanup (@() __ambrix__ ("close", id));
   __ambrix__ ("setReadOnlyMode", id, -1);
 endfunction
@@ -34,4 +34,5 @@ endfunction
 %! err = ambrix.internal.raised (@() ambrix.close (id));
 %! assert (err.identifier, "TOLVEX:ambrix:cdflib:invalidFileId");
 %!error id=ambrix:invalidFile ambrix.internal.openToRead (1)
+%!error id=ambrix:invalidFile ambrix.internal.openToRead (["a"; "b"])
 %!error id=TOLVEX:ambrix:cdflib:fileOpenError ambrix.internal.openToRead ("no such file")

@@ -20,8 +20,8 @@ function options = parseOptions (caller, defaults, given)
     if (! islogical (defaults.(name)))
       options.(name) = valueOf (caller, name, defaults.(name), given(k+1:end));
       k += 2;
-    elseif (k < numel (given) && (islogical (given{k+1}) || isnumeric (given{k+1})))
-      options.(name) = logical (given{k+1});
+    elseif (k < numel (given) && ! ischar (given{k+1}))
+      options.(name) = flagOf (caller, name, given{k+1});
       k += 2;
     else
       options.(name) = true;
@@ -37,6 +37,14 @@ function name = knownName (caller, names, given)
            caller, strjoin (names', ", "));
   endif
   name = names{known};
+endfunction
+
+function flag = flagOf (caller, name, given)
+  if (! isscalar (given) || ! any (cellfun (@(value) isequal (given, value), {true, false})))
+    error ("ambrix:invalidOption", "%s: what is behind option \"%s\" must be true or false",
+           caller, name);
+  endif
+  flag = logical (given);
 endfunction
 
 function value = valueOf (caller, name, default, rest)
@@ -66,4 +74,10 @@ endfunction
 %!error id=ambrix:invalidOption ambrix.internal.parseOptions ("f", defaults, {7});
 %!error <"order" must be one of: up, down>
 %! ambrix.internal.parseOptions ("f", defaults, {"order", "left"});
+%!test
+%! for value = {NaN, [true, false], {true}, 2}
+%!   given = {"deep", value{1}};
+%!   err = ambrix.internal.raised (@() ambrix.internal.parseOptions ("f", defaults, given));
+%!   assert (err.identifier, "ambrix:invalidOption");
+%! endfor
 %!error <"range" needs a value> ambrix.internal.parseOptions ("f", defaults, {"range"});

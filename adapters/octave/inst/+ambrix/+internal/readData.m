@@ -24,8 +24,8 @@ function [data, v] = readData (id, v, rowMajor, options, fill)
     v.filler = fillerOf (data);
   elseif (options.time && strncmp (v.datatype, "CDF_EPOCH", 9))
     [data, order] = ambrix.internal.toDays (data, order, v.datatype);
-  elseif (! isempty (fill) && isfloat (data))
-    data(data == fill) = NaN;
+  elseif (isfloat (data) && isnumeric (fill))
+    data = withoutFill (data, fill, lead);
   endif
   if (isText && strcmp (options.text, "cell"))
     data = ambrix.internal.toCells (data, order, v.filler);
@@ -34,6 +34,15 @@ function [data, v] = readData (id, v, rowMajor, options, fill)
   endif
   if (! v.recordVariance && range.count == 0)
     data = reshape (data, 0, 0);
+  endif
+endfunction
+
+## An EPOCH16 is missing where both of its numbers are those of the fill value.
+function data = withoutFill (data, fill, lead)
+  if (isscalar (fill))
+    data(data == fill) = NaN;
+  elseif (numel (fill) == lead)
+    data(:,all (data(:,:) == fill(:), 1)) = NaN;
   endif
 endfunction
 
@@ -69,13 +78,14 @@ function part = span (option, limits, size)
     part = struct ("start", 0, "count", size, "step", 1);
     return;
   endif
-  limits = double (limits);
-  if (! any (numel (limits) == [2, 3]) || any (limits != fix (limits)) || limits(1) < 1
-      || limits(2) > size || (numel (limits) == 3 && limits(3) < 1))
+  isRange = isnumeric (limits) && isreal (limits) && any (numel (limits) == [2, 3]);
+  if (! isRange || any (limits != fix (limits)) || limits(1) < 1 || limits(2) > size
+      || (numel (limits) == 3 && limits(3) < 1))
     error ("ambrix:invalidOption",
            ["ambrix.read: a range of option \"%s\" must be [first, last] or " ...
             "[first, last, step], in whole numbers from 1 to %d"], option, size);
   endif
+  limits = double (limits);
   step = [limits(3:end), 1](1);
   count = max (0, floor ((limits(2) - limits(1)) / step) + 1);
   part = struct ("start", limits(1) - 1, "count", count, "step", step);
