@@ -63,7 +63,7 @@ function write (file, s, varargin)
     error ("ambrix:invalidFile", "ambrix.write: give the path of the file as a text");
   endif
   s = ambrix.internal.completeStruct (s);
-  target = regexprep (file, '\.cdf$', "", "ignorecase");
+  target = targetOf (file);
   if (! options.overwrite && ! isempty (stat ([target ".cdf"])))
     error ("ambrix:fileExists",
            "ambrix.write: there is a file \"%s.cdf\"; option \"overwrite\" replaces it", target);
@@ -73,7 +73,20 @@ function write (file, s, varargin)
   discard = onCleanup (@() discardFile (id, temporary));
   fillFile (id, s);
   __ambrix__ ("close", id);
-  moveFile (temporary, target);
+  ambrix.internal.moveFile (temporary, target, options.overwrite);
+endfunction
+
+## The path without ".cdf", of the file itself where there is a link to it.
+function target = targetOf (file)
+  target = regexprep (tilde_expand (file), '\.cdf$', "", "ignorecase");
+  if (isempty (target) || target(end) == "/")
+    error ("ambrix:invalidFile", "ambrix.write: \"%s\" holds no name of a file", file);
+  endif
+  there = lstat ([target ".cdf"]);
+  if (! isempty (there) && S_ISLNK (there.mode))
+    linked = regexp (canonicalize_file_name ([target ".cdf"]), '^(.+)\.cdf$', "tokens", "once");
+    target = [linked, {target}]{1};
+  endif
 endfunction
 
 function fillFile (id, s)
@@ -101,36 +114,13 @@ function applySettings (id, file)
   endif
 endfunction
 
-## A CDF of several files has, beside NAME.cdf, a file NAME.z0, NAME.z1, ... for each variable.
-function moveFile (from, to)
-  cellfun (@unlink, partsOf (to));  # of a file that is replaced
-  for part = partsOf (from)
-    moveOne (part{1}, [to part{1}(numel (from)+1:end)]);
-  endfor
-  moveOne ([from ".cdf"], [to ".cdf"]);
-endfunction
-
-function parts = partsOf (name)
-  parts = {};
-  while (! isempty (stat (sprintf ("%s.z%d", name, numel (parts)))))
-    parts{end+1} = sprintf ("%s.z%d", name, numel (parts));
-  endwhile
-endfunction
-
-function moveOne (from, to)
-  [status, message] = rename (from, to);
-  if (status != 0)
-    error ("ambrix:cannotRename", "ambrix.write: \"%s\" can't be written: %s", to, message);
-  endif
-endfunction
-
 function discardFile (id, temporary)
   try
     __ambrix__ ("delete", id);
   catch
     # it was closed, and most likely renamed
   end_try_catch
-  for part = [partsOf(temporary), {[temporary ".cdf"]}]
+  for part = [ambrix.internal.partsOf(temporary), {[temporary ".cdf"]}]
     if (! isempty (stat (part{1})))
       unlink (part{1});
     endif
@@ -222,6 +212,32 @@ endfunction
 %! assert (readdir ("."), {"."; ".."; "example.cdf"; "several.cdf"; "several.z0"});
 %! assert (ambrix.read ("several", "a"), 1);
 
+%!testif ; isunix ()  # a link stays one
+%! [id, restore] = ambrix.internal.example ();
+%! ambrix.close (id);
+%! symlink ("example.cdf", "link.cdf");
+%! ambrix.write ("link", struct ("a", 1), "overwrite");
+%! assert (ambrix.read ("example", "a"), 1);
+%! assert (S_ISLNK (lstat ("link.cdf").mode));
+
+%!test  # the home folder
+%! [id, restore] = ambrix.internal.example ();
+%! ambrix.close (id);
+%! home = getenv ("HOME");
+%! unwind_protect
+%!   setenv ("HOME", pwd ());
+%!   ambrix.write ("~/mine", struct ("a", 1));
+%!   assert (ambrix.read ("~/mine.cdf", "a"), 1);
+%! unwind_protect_cleanup
+%!   setenv ("HOME", home);
+%! end_unwind_protect
+%! assert (readdir ("."), {"."; ".."; "example.cdf"; "mine.cdf"});
+
+%!test  # no data are no records of a scalar variable
+%! s = back (struct ("a", [], "t", "", "c", {{}}));
+%! assert (s.data, struct ("a", zeros (0, 1), "t", {cell(0, 1)}, "c", {cell(0, 1)}));
+%!error id=ambrix:invalidFile ambrix.write ("", struct ())
+%!error id=ambrix:invalidFile ambrix.write ("/tmp/.cdf", struct ())
 %!error id=ambrix:invalidFile ambrix.write (1, struct ())
 %!error id=ambrix:invalidData ambrix.write ("x", 1)
 %!error id=ambrix:invalidOption ambrix.write ("x", struct (), "force")

@@ -16,6 +16,11 @@ function s = completeStruct (s)
   parts = struct ("data", {struct()}, "variables", {struct()}, "attributes", {struct()}, ...
                   "file", {struct()}, "options", {struct()});
   parts.attributeList = struct ("name", {}, "scope", {}, "entries", {}, "datatypes", {});
+  for unknown = setdiff (fieldnames (s), fieldnames (parts))'
+    error ("ambrix:invalidData", ["ambrix.write: \"%s\" is no part of what is written, which are: " ...
+           "%s; and a struct of arrays holds no structs"],
+           unknown{1}, strjoin (fieldnames (parts)', ", "));
+  endfor
   s = withDefaults (s, parts);
   s.file = withDefaults (s.file, struct ("format", "SINGLE_FILE", "majority", "COLUMN_MAJOR", ...
                                          "checksum", "NO_CHECKSUM"));
@@ -66,5 +71,7 @@ endfunction
 %! s = ambrix.internal.completeStruct (s);
 %! assert (fieldnames (s.variables), {"time"; "flux"});
 %!error id=ambrix:invalidData ambrix.internal.completeStruct (1)
+%!error <"position" is no part of what is written>
+%! ambrix.internal.completeStruct (struct ("position", struct ("x", 1)));
 %!error <"attributes" must be a struct>
 %! ambrix.internal.completeStruct (struct ("data", struct ("a", 1), "attributes", 2));

@@ -28,7 +28,9 @@ endfunction
 
 ## Octave's arrays have two dimensions at least: a column has one here.
 function sizes = dimensions (sizes, recordVariance, isLast)
-  if (recordVariance && isLast && ! (numel (sizes) == 2 && sizes(2) == 1))
+  if (isequal (sizes, [0, 0]) || isequal (sizes, 0))
+    sizes = [];  # no data
+  elseif (recordVariance && isLast && ! (numel (sizes) == 2 && sizes(2) == 1))
     sizes(end) = [];
   elseif (recordVariance)
     sizes(1) = [];
@@ -57,3 +59,8 @@ endfunction
 %!assert (deduced ("CDF_CHAR", true, ["ab"; "cd"; "ef"].', "last"), [])
 %!assert (deduced ("CDF_CHAR", true, repmat ("a", [5, 3, 2]), "first"), 3)
 %!assert (deduced ("CDF_EPOCH16", true, zeros (5, 2), "first"), [])
+%!assert (deduced ("CDF_REAL8", true, [], "first"), [])
+%!assert (deduced ("CDF_REAL8", false, [], "last"), [])
+%!assert (deduced ("CDF_CHAR", false, "", "last"), [])
+%!assert (deduced ("CDF_REAL8", true, zeros (3, 0), "first"), 0)
+%!assert (deduced ("CDF_REAL8", true, zeros (0, 3), "first"), 3)

@@ -6,6 +6,10 @@
 ## @end deftypefn
 
 function [texts, v] = fromCells (cells, v, records)
+  if (any (cellfun ("size", cells(:), 1) > 1))
+    error ("ambrix:invalidData",
+           "ambrix.write: the texts of variable \"%s\" must be rows of characters", v.name);
+  endif
   if (! isfield (v, "elements"))
     v.elements = 1;
   endif
@@ -43,4 +47,6 @@ endfunction
 %! texts = ambrix.internal.fromCells ({"a", "bc"; "d", "e"}, struct (), "first");
 %! assert (size (texts), [2, 2, 2]);
 %! assert (squeeze (texts(1,2,:)).', "bc");
+%!error id=ambrix:invalidData
+%! ambrix.internal.fromCells ({["ab"; "cd"]; "e"}, struct ("name", "x"), "first");
 %!assert (size (ambrix.internal.fromCells (cell (0, 1), struct ("elements", 4), "first")), [0, 4])

@@ -30,6 +30,10 @@ endfunction
 
 function list = withMissing (list, names, scope)
   fields = regexprep ({list.name}, ' +$', "");
+  for name = intersect (names, fields(! strcmp ({list.scope}, scope)))(:)'
+    error ("ambrix:invalidData", ["ambrix.write: attribute \"%s\" is given for the file and for " ...
+           "variables, and can be of one scope only"], name{1});
+  endfor
   for name = setdiff (names, fields, "stable")(:)'
     list(end+1) = struct ("name", name{1}, "scope", scope, "entries", [], "datatypes", {{}});
   endfor
@@ -108,6 +112,14 @@ endfunction
 %! assert (r.attributeList(1).datatypes, {"CDF_CHAR", "CDF_CHAR", "CDF_DOUBLE"});
 %! assert (r.variables.Flux.attributes.Units, 8);
 %! assert (r.attributeList(3).name, "New");
+%!test  # a name belongs to the file or to variables
+%! [id, restore] = ambrix.internal.example ();
+%! ambrix.close (id);
+%! s.data = struct ("x", 1);
+%! s.attributes.UNITS = "km";
+%! s.variables.x.attributes.UNITS = "nT";
+%! err = ambrix.internal.raised (@() ambrix.write ("bad", s));
+%! assert (err.identifier, "ambrix:invalidData");
 %!error <attribute "a" must be one text>
 %! [id, restore] = ambrix.internal.example ();
 %! ambrix.close (id);
