@@ -3,28 +3,42 @@
 #pragma once
 
 #include <cstdint>
-#include <initializer_list>
 #include <string>
 #include <utility>
 
 #include "host/message_id.h"
 
+namespace TOLVEX::ambrix {
+
+/// Values are moved into their places; a list in braces would copy each text.
+struct ComponentError : MessageId {
+  template <typename... Values>
+  ComponentError(const char* component_, const char* name, Values&&... given)
+      : MessageId(component_, name) {
+    values.reserve(sizeof...(given));
+    (values.emplace_back(std::forward<Values>(given)), ...);
+  }
+};
+
+}  // namespace TOLVEX::ambrix
+
 namespace TOLVEX::ambrix::cdflib {
 
-struct Error : MessageId {
-  Error(const char* name, std::initializer_list<MessageArg> arguments = {})
-      : MessageId("TOLVEX:ambrix:cdflib", name, arguments) {}
+struct Error : ComponentError {
+  template <typename... Values>
+  explicit Error(const char* name, Values&&... given)
+      : ComponentError("TOLVEX:ambrix:cdflib", name, std::forward<Values>(given)...) {}
 };
 
 struct badDimSpec : Error {
   badDimSpec(std::int64_t dimensions, std::string variable)
-      : Error("badDimSpec", {dimensions, std::move(variable)}) {}
+      : Error("badDimSpec", dimensions, std::move(variable)) {}
 };
 
 // The same two values as badDimSpec in the opposite order: catalogues of hosts rely on it.
 struct badDimensionExtent : Error {
   badDimensionExtent(std::string variable, std::int64_t dimensions)
-      : Error("badDimensionExtent", {std::move(variable), dimensions}) {}
+      : Error("badDimensionExtent", std::move(variable), dimensions) {}
 };
 
 struct badEpoch16Modulus : Error {
@@ -32,12 +46,12 @@ struct badEpoch16Modulus : Error {
 };
 
 struct badEpochVector : Error {
-  explicit badEpochVector(std::int64_t components) : Error("badEpochVector", {components}) {}
+  explicit badEpochVector(std::int64_t components) : Error("badEpochVector", components) {}
 };
 
 struct badPutAttrEntryDatatype : Error {
   badPutAttrEntryDatatype(std::string className, std::string datatype)
-      : Error("badPutAttrEntryDatatype", {std::move(className), std::move(datatype)}) {}
+      : Error("badPutAttrEntryDatatype", std::move(className), std::move(datatype)) {}
 };
 
 struct badVarianceDatatype : Error {
@@ -50,7 +64,7 @@ struct cannotOmitDimSpec : Error {
 
 struct datatypeMismatch : Error {
   datatypeMismatch(std::string className, std::string datatype)
-      : Error("datatypeMismatch", {std::move(className), std::move(datatype)}) {}
+      : Error("datatypeMismatch", std::move(className), std::move(datatype)) {}
 };
 
 struct dimSizeTooLarge : Error {
@@ -76,7 +90,7 @@ struct invalidCharError : Error {
 /// Also issued as a warning.
 struct invalidCompressionParameter : Error {
   invalidCompressionParameter(std::int64_t parameter, std::string shortTypeName)
-      : Error("invalidCompressionParameter", {parameter, std::move(shortTypeName)}) {}
+      : Error("invalidCompressionParameter", parameter, std::move(shortTypeName)) {}
 };
 
 struct invalidFileId : Error {
@@ -84,28 +98,27 @@ struct invalidFileId : Error {
 };
 
 struct invalidOperation : Error {
-  explicit invalidOperation(std::string command)
-      : Error("invalidOperation", {std::move(command)}) {}
+  explicit invalidOperation(std::string command) : Error("invalidOperation", std::move(command)) {}
 };
 
 struct libraryFailure : Error {
   libraryFailure(std::string routine, std::string statusText)
-      : Error("libraryFailure", {std::move(routine), std::move(statusText)}) {}
+      : Error("libraryFailure", std::move(routine), std::move(statusText)) {}
 };
 
 struct mismatchedVarianceSize : Error {
   mismatchedVarianceSize(std::int64_t variances, std::int64_t dimensions)
-      : Error("mismatchedVarianceSize", {variances, dimensions}) {}
+      : Error("mismatchedVarianceSize", variances, dimensions) {}
 };
 
 struct unrecognizedConstantName : Error {
   explicit unrecognizedConstantName(std::string name)
-      : Error("unrecognizedConstantName", {std::move(name)}) {}
+      : Error("unrecognizedConstantName", std::move(name)) {}
 };
 
 struct unrecognizedValue : Error {
   unrecognizedValue(std::int64_t value, std::string kind)
-      : Error("unrecognizedValue", {value, std::move(kind)}) {}
+      : Error("unrecognizedValue", value, std::move(kind)) {}
 };
 
 struct unspecifiedGzipCompressionLevel : Error {
@@ -119,23 +132,23 @@ struct varCacheSizeOpInappropriate : Error {
 struct wrongNumberOfHyperPutVarDataElements : Error {
   wrongNumberOfHyperPutVarDataElements(std::string counts, std::int64_t records,
                                        std::string variable, std::int64_t expected)
-      : Error("wrongNumberOfHyperPutVarDataElements",
-              {std::move(counts), records, std::move(variable), expected}) {}
+      : Error("wrongNumberOfHyperPutVarDataElements", std::move(counts), records,
+              std::move(variable), expected) {}
 };
 
 struct wrongNumberOfPadValueElements : Error {
   wrongNumberOfPadValueElements(std::string variable, std::int64_t expected)
-      : Error("wrongNumberOfPadValueElements", {std::move(variable), expected}) {}
+      : Error("wrongNumberOfPadValueElements", std::move(variable), expected) {}
 };
 
 struct wrongNumberOfPutVarDataElements : Error {
   wrongNumberOfPutVarDataElements(std::string variable, std::int64_t expected)
-      : Error("wrongNumberOfPutVarDataElements", {std::move(variable), expected}) {}
+      : Error("wrongNumberOfPutVarDataElements", std::move(variable), expected) {}
 };
 
 struct wrongNumberOfPutVarRecordDataElements : Error {
   wrongNumberOfPutVarRecordDataElements(std::string variable, std::int64_t expected)
-      : Error("wrongNumberOfPutVarRecordDataElements", {std::move(variable), expected}) {}
+      : Error("wrongNumberOfPutVarRecordDataElements", std::move(variable), expected) {}
 };
 
 /// Issued only as a warning, at unload.
@@ -147,24 +160,25 @@ struct closingFileHandle : Error {
 
 namespace TOLVEX::ambrix::validate {
 
-struct Error : MessageId {
-  Error(const char* name, std::initializer_list<MessageArg> arguments = {})
-      : MessageId("TOLVEX:ambrix:validate", name, arguments) {}
+struct Error : ComponentError {
+  template <typename... Values>
+  explicit Error(const char* name, Values&&... given)
+      : ComponentError("TOLVEX:ambrix:validate", name, std::forward<Values>(given)...) {}
 };
 
 struct argumentNotDoublePrecision : Error {
   explicit argumentNotDoublePrecision(std::string label)
-      : Error("argumentNotDoublePrecision", {std::move(label)}) {}
+      : Error("argumentNotDoublePrecision", std::move(label)) {}
 };
 
 struct argumentNotDoubleScalar : Error {
   explicit argumentNotDoubleScalar(std::string label)
-      : Error("argumentNotDoubleScalar", {std::move(label)}) {}
+      : Error("argumentNotDoubleScalar", std::move(label)) {}
 };
 
 struct argumentNotUint64Scalar : Error {
   explicit argumentNotUint64Scalar(std::string label)
-      : Error("argumentNotUint64Scalar", {std::move(label)}) {}
+      : Error("argumentNotUint64Scalar", std::move(label)) {}
 };
 
 struct argumentOutOfBounds : Error {

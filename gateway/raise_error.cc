@@ -21,8 +21,8 @@ void RaisedError::rethrow() const {
   throw *this;
 }
 
-void raiseError(const MessageId& error) {
-  const RaisedError raised(error);
+void raiseError(MessageId error) {
+  const RaisedError raised(std::move(error));
   qvErrMsgId(raised.messageId());
   raised.rethrow();
 }

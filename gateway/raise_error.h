@@ -4,6 +4,7 @@
 #include <exception>
 #include <memory>
 #include <string>
+#include <utility>
 
 #include "host/message_id.h"
 
@@ -12,7 +13,7 @@ namespace TOLVEX::ambrix {
 /// A raised error as a standard exception that can be carried, copied and thrown again unchanged.
 class RaisedError final : public std::exception {
  public:
-  explicit RaisedError(const MessageId& id) : id_(id) {}
+  explicit RaisedError(MessageId id) : id_(std::move(id)) {}
 
   [[nodiscard]] const MessageId& messageId() const { return id_; }
   [[nodiscard]] std::string identifier() const { return id_.fullIdentifier(); }
@@ -28,6 +29,6 @@ class RaisedError final : public std::exception {
 
 /// Hands the error to the host, which reports it and does not return; should it come back, the
 /// error is thrown as a `RaisedError` instead.
-[[noreturn]] void raiseError(const MessageId& error);
+[[noreturn]] void raiseError(MessageId error);
 
 }  // namespace TOLVEX::ambrix

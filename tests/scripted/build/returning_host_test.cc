@@ -3,6 +3,8 @@
 
 #include <exception>
 #include <string>
+#include <utility>
+#include <variant>
 
 #include "gateway/errors.h"
 #include "gateway/raise_error.h"
@@ -10,12 +12,19 @@
 namespace {
 
 int reports = 0;
+const char* lastText = nullptr;  // where the last value of the last error has its characters
 bool catalogueFails = false;
+
+const char* textOf(const TOLVEX::ambrix::MessageArg& value) {
+  const auto* text = std::get_if<std::string>(&value);
+  return text == nullptr ? nullptr : text->data();
+}
 
 }  // namespace
 
-extern "C" void qvErrMsgId(const TOLVEX::ambrix::MessageId&) {
+extern "C" void qvErrMsgId(const TOLVEX::ambrix::MessageId& id) {
   ++reports;
+  lastText = id.values.empty() ? nullptr : textOf(id.values.back());
 }
 
 extern "C" void qvGetMessageText(const TOLVEX::ambrix::MessageId& id, std::string& text) {
@@ -38,6 +47,13 @@ TEST(ReturningHostTest, TheErrorIsReportedOnceAndThenThrown) {
   reports = 0;
   EXPECT_THROW(raiseError(validate::wrongNumberOfInputs()), RaisedError);
   EXPECT_EQ(reports, 1);
+}
+
+TEST(ReturningHostTest, TextsReachTheHostWithoutACopy) {
+  std::string text(100, 'x');
+  const char* const characters = text.data();
+  EXPECT_THROW(raiseError(cdflib::libraryFailure("routine", std::move(text))), RaisedError);
+  EXPECT_EQ(lastText, characters);
 }
 
 TEST(ReturningHostTest, TheExceptionTellsIdentifierTextAndValues) {
