@@ -29,7 +29,8 @@ def arguments():
                         help="only workloads whose name contains this; may be given several times")
     parser.add_argument("--peers", action="store_true",
                         help="compare with SpacePy, pycdfpp and cdflib, where this Python has them")
-    parser.add_argument("--rounds", type=int, help="rounds in each of three sittings (default 5)")
+    parser.add_argument("--rounds", type=int, help="rounds in each sitting (default 5)")
+    parser.add_argument("--sittings", type=int, help="times that programs start anew (default 3)")
     parser.add_argument("--json", type=pathlib.Path, help="where the results go as JSON")
     parser.add_argument("--document", action="store_true",
                         help="put the tables into docs/performance.md")
@@ -73,7 +74,7 @@ def machine():
 def run(options, folder):
     divisor = 100 if options.quick else 1
     rounds = options.rounds or (1 if options.quick else 5)
-    sittings = 1 if options.quick else 3
+    sittings = options.sittings or (1 if options.quick else 3)
     found = all_columns(options, folder, divisor)
     found[0].run("prepare")
     results, settings = {}, {}
@@ -107,6 +108,7 @@ def main():
         options.json.write_text(json.dumps(results, indent=1) + "\n")
     if options.document:
         parts = {name: report.markdown(rows) for name, rows in tables.items()}
+        parts["workloads"] += "\n\n" + report.machine_text(results["machine"])
         report.put_into(ROOT / "docs" / "performance.md", parts)
 
 

@@ -59,6 +59,11 @@ def setting_rows(settings, results):
     return rows
 
 
+def machine_text(machine):
+    return (f"Measured on {machine['date']}: {machine['processor']}, {machine['processors']} "
+            f"processors, {machine['system']}, load at the start {machine['load']:.1f}.")
+
+
 def terminal(rows):
     widths = [max(len(row[i]) for row in rows) for i in range(len(rows[0]))]
     lines = ["  ".join(text.ljust(width) for text, width in zip(row, widths)).rstrip()
