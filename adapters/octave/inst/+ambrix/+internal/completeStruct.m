@@ -22,6 +22,11 @@ function s = completeStruct (s)
            unknown{1}, strjoin (fieldnames (parts)', ", "));
   endfor
   s = withDefaults (s, parts);
+  columns = fieldnames (parts.attributeList)';
+  if (! all (isfield (s.attributeList, columns)))
+    error ("ambrix:invalidData", "ambrix.write: \"attributeList\" must have the fields %s",
+           strjoin (columns, ", "));
+  endif
   s.file = withDefaults (s.file, struct ("format", "SINGLE_FILE", "majority", "COLUMN_MAJOR", ...
                                          "checksum", "NO_CHECKSUM"));
   s.options = withDefaults (s.options, struct ("records", "first", "time", false, "fill", false));
@@ -54,6 +59,10 @@ function variables = allVariables (s)
     if (isfield (described, name{1}))
       v = described.(name{1});
     endif
+    if (! isstruct (v) || ! isscalar (v))
+      error ("ambrix:invalidData", "ambrix.write: what describes variable \"%s\" must be a struct",
+             name{1});
+    endif
     if (! isfield (v, "supported") || v.supported)
       variables.(name{1}) = withDefaults (v, struct ("attributes", {struct()}));
     endif
@@ -73,5 +82,10 @@ endfunction
 %!error id=ambrix:invalidData ambrix.internal.completeStruct (1)
 %!error <"position" is no part of what is written>
 %! ambrix.internal.completeStruct (struct ("position", struct ("x", 1)));
+%!error <describes variable "a" must be a struct>
+%! ambrix.internal.completeStruct (struct ("variables", struct ("a", 5)));
+%!error <"attributeList" must have the fields name, scope,>
+%! s = struct ("data", struct (), "attributeList", struct ("name", "x"));
+%! ambrix.internal.completeStruct (s);
 %!error <"attributes" must be a struct>
 %! ambrix.internal.completeStruct (struct ("data", struct ("a", 1), "attributes", 2));

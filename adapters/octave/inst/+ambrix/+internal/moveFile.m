@@ -57,3 +57,12 @@ endfunction
 %! err = ambrix.internal.raised (@() ambrix.write ("folder", struct ("a", 1), "overwrite"));
 %! assert (err.identifier, "ambrix:cannotRename");
 %! assert (readdir ("."), {"."; ".."; "example.cdf"; "folder.cdf"});
+
+%!test  # several files
+%! [id, restore] = ambrix.internal.example ();
+%! ambrix.close (id);
+%! s = struct ("data", struct ("a", 1, "b", 2), "file", struct ("format", "MULTI_FILE"));
+%! ambrix.write ("several", s);
+%! ambrix.write ("several", struct ("data", struct ("a", 1), "file", s.file), "overwrite");
+%! assert (readdir ("."), {"."; ".."; "example.cdf"; "several.cdf"; "several.z0"});
+%! assert (ambrix.read ("several", "a"), 1);

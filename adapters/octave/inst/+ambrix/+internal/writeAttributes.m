@@ -84,6 +84,9 @@ function put (id, number, entry, datatype, value, what)
   if (iscell (value) || (ischar (value) && rows (value) > 1))
     error ("ambrix:invalidData", "ambrix.write: %s must be one text or numbers", what);
   endif
+  if (iscomplex (value))
+    error ("ambrix:unsupportedClass", "ambrix.write: %s is complex, and no datatype is", what);
+  endif
   classes = ambrix.internal.datatypes ();
   if (isempty (datatype) || ! strcmp (classes.(datatype), class (value)))
     datatype = ambrix.internal.datatypeOf (value, what);
@@ -120,6 +123,12 @@ endfunction
 %! s.variables.x.attributes.UNITS = "nT";
 %! err = ambrix.internal.raised (@() ambrix.write ("bad", s));
 %! assert (err.identifier, "ambrix:invalidData");
+%!test
+%! [id, restore] = ambrix.internal.example ();
+%! ambrix.close (id);
+%! s = struct ("data", struct (), "attributes", struct ("a", 1i));
+%! err = ambrix.internal.raised (@() ambrix.write ("bad", s));
+%! assert (err.identifier, "ambrix:unsupportedClass");
 %!error <attribute "a" must be one text>
 %! [id, restore] = ambrix.internal.example ();
 %! ambrix.close (id);
