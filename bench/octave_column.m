@@ -11,7 +11,7 @@ function column = given (folder, divisor)
   column.texts = floor (100000 / divisor);
   column.images = floor (2000 / divisor);
   column.times = floor (1000000 / divisor);
-  column.calls = floor (200000 / divisor);
+  column.calls = floor (20000 / divisor);
 endfunction
 
 function value = constant (name)

@@ -20,7 +20,7 @@ struct Setup {
   [[nodiscard]] std::size_t texts() const { return 100'000 / divisor; }
   [[nodiscard]] std::size_t images() const { return 2000 / divisor; }
   [[nodiscard]] std::size_t times() const { return 1'000'000 / divisor; }
-  [[nodiscard]] std::size_t calls() const { return 200'000 / divisor; }
+  [[nodiscard]] std::size_t calls() const { return 20'000 / divisor; }
 
   [[nodiscard]] std::string file(std::string_view name) const {
     return folder + '/' + std::string(name);

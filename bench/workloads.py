@@ -27,10 +27,10 @@ WORKLOADS = (
     Workload("epoch_compute", "compute 1,000,000 epochs", 1.05, None),
     Workload("epoch16_breakdown", "break 1,000,000 epoch16s down", 1.05, None),
     Workload("epoch16_compute", "compute 1,000,000 epoch16s", 1.05, None),
-    Workload("get_constant", 'call "getConstantValue"', None, 200_000),
-    Workload("unknown_command", "call an unknown command", None, 200_000),
-    Workload("refused_argument", "have an argument refused", None, 200_000),
-    Workload("library_failure", "have the library fail", None, 200_000),
+    Workload("get_constant", 'call "getConstantValue"', None, 20_000),
+    Workload("unknown_command", "call an unknown command", None, 20_000),
+    Workload("refused_argument", "have an argument refused", None, 20_000),
+    Workload("library_failure", "have the library fail", None, 20_000),
 )
 
 # What users can set: the workload without and with it.
