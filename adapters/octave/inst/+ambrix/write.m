@@ -78,7 +78,10 @@ endfunction
 
 ## The path without ".cdf", of the file itself where there is a link to it.
 function target = targetOf (file)
-  target = regexprep (tilde_expand (file), '\.cdf$', "", "ignorecase");
+  target = tilde_expand (file);
+  if (strcmpi (target(max (end-3, 1):end), ".cdf"))
+    target(end-3:end) = "";
+  endif
   if (isempty (target) || target(end) == "/")
     error ("ambrix:invalidFile", "ambrix.write: \"%s\" holds no name of a file", file);
   endif

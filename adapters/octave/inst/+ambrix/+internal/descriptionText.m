@@ -6,7 +6,7 @@
 
 function text = descriptionText (s)
   lines = [{headline(s.file)}; globalLines(s.attributes); variableLines(s.variables)];
-  lines = regexprep (cellfun (@shortened, lines, "UniformOutput", false), '\s+$', "");
+  lines = cellfun (@shortened, lines, "UniformOutput", false);
   text = sprintf ("%s\n", lines{:});
 endfunction
 
@@ -70,7 +70,9 @@ endfunction
 
 function text = shownValue (value)
   if (ischar (value))
-    text = regexprep (value, '\s+', " ");
+    blank = isspace (value);  # no regular expression: those refuse texts that are not UTF-8
+    value(blank) = " ";
+    text = value(! (blank & [false, blank](1:numel (blank))));
   else
     text = mat2str (value, 7);
   endif
@@ -88,10 +90,13 @@ function lines = titled (title, table)
   endif
 endfunction
 
+## Without half of a character at the end.
 function line = shortened (line)
   if (numel (line) > 100)
-    line = [line(1:97) "..."];
+    last = find (bitand (double (line(1:98)), 192) != 128, 1, "last") - 1;
+    line = [line(1:last) "..."];
   endif
+  line = deblank (line);
 endfunction
 
 %!test
@@ -106,3 +111,12 @@ endfunction
 %!          "  Flux  CDF_REAL4   2-by-3  2        km/s", ...
 %!          "  Mode  CDF_CHAR*4          2", ""};
 %! assert (ambrix.internal.descriptionText (s), strjoin (lines, "\n"));
+%!test  # characters of two bytes, and bytes that are none
+%! [id, restore] = ambrix.internal.example ();
+%! ambrix.putAttrgEntry (id, 0, 0, "CDF_CHAR", ["a" repmat(char ([195, 169]), 1, 60)]);
+%! ambrix.putAttrgEntry (id, 0, 1, "CDF_CHAR", char ([233, 10, 32, 66, 32]));
+%! s = ambrix.info (id);
+%! ambrix.close (id);
+%! lines = ostrsplit (ambrix.internal.descriptionText (s), "\n");
+%! assert (lines{4}, ["  Title  a" repmat(char ([195, 169]), 1, 43) "..."]);
+%! assert (double (lines{5}), [repmat(32, 1, 9), 233, 32, 66]);

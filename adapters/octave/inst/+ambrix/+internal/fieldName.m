@@ -5,8 +5,11 @@
 ## @end deftypefn
 
 function field = fieldName (name)
-  field = regexprep (name, ' +$', "");
+  field = name(1:find ([true, name != " "], 1, "last") - 1);
 endfunction
 
 %!assert (ambrix.internal.fieldName ("SST   "), "SST")
 %!assert (ambrix.internal.fieldName (" a b"), " a b")
+%!assert (isempty (ambrix.internal.fieldName ("  ")))
+%!assert (isempty (ambrix.internal.fieldName ("")))
+%!assert (ambrix.internal.fieldName (["\xe9" " "]), "\xe9")  # not UTF-8

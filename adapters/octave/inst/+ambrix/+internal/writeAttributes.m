@@ -20,7 +20,7 @@ endfunction
 ## The list, without the global attributes that were removed, and with those that were added.
 function list = allAttributes (s)
   isGlobal = strcmp ({s.attributeList.scope}, "GLOBAL_SCOPE");
-  fields = regexprep ({s.attributeList.name}, ' +$', "");
+  fields = fieldsOf (s.attributeList);
   list = s.attributeList(! isGlobal | isfield (s.attributes, fields));
   list = withMissing (list, fieldnames (s.attributes), "GLOBAL_SCOPE");
   for [v, name] = s.variables
@@ -28,8 +28,12 @@ function list = allAttributes (s)
   endfor
 endfunction
 
+function fields = fieldsOf (list)
+  fields = cellfun (@ambrix.internal.fieldName, {list.name}, "UniformOutput", false);
+endfunction
+
 function list = withMissing (list, names, scope)
-  fields = regexprep ({list.name}, ' +$', "");
+  fields = fieldsOf (list);
   for name = intersect (names, fields(! strcmp ({list.scope}, scope)))(:)'
     error ("ambrix:invalidData", ["ambrix.write: attribute \"%s\" is given for the file and for " ...
            "variables, and can be of one scope only"], name{1});
