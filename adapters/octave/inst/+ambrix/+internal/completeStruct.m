@@ -17,8 +17,8 @@ function s = completeStruct (s)
                   "file", {struct()}, "options", {struct()});
   parts.attributeList = struct ("name", {}, "scope", {}, "entries", {}, "datatypes", {});
   for unknown = setdiff (fieldnames (s), fieldnames (parts))'
-    error ("ambrix:invalidData", ["ambrix.write: \"%s\" is no part of what is written, which are: " ...
-           "%s; and a struct of arrays holds no structs"],
+    error ("ambrix:invalidData", ["ambrix.write: \"%s\" is no part of what is written, which " ...
+           "are %s; and a struct of arrays holds no structs"],
            unknown{1}, strjoin (fieldnames (parts)', ", "));
   endfor
   s = withDefaults (s, parts);

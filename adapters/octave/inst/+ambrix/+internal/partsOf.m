@@ -1,7 +1,7 @@
 ## -*- texinfo -*-
 ## @deftypefn {} {@var{parts} =} ambrix.internal.partsOf (@var{name})
-## The files NAME.z0, NAME.z1, @dots{}, one for each variable, that a CDF of several files has beside
-## NAME.cdf.
+## The files NAME.z0, NAME.z1, @dots{}, one for each variable, that a CDF of several files has
+## beside NAME.cdf.
 ## @end deftypefn
 
 function parts = partsOf (name)

@@ -143,7 +143,8 @@ function spectrogram = isSpectrogram (s, v)
   other = named (s, v, "DEPEND_1");
   type = textOf (v.attributes, {"DISPLAY_TYPE"}, "");
   spectrogram = v.recordVariance && numel (v.sizes) == 1 && ! isempty (other) ...
-    && hasNumbers (other) && (strncmpi (type, "spect", 5) || (v.sizes > 4 && ! strncmpi (type, "time_series", 11)));
+    && hasNumbers (other) && (strncmpi (type, "spect", 5) ...
+                              || (v.sizes > 4 && ! strncmpi (type, "time_series", 11)));
 endfunction
 
 function names = componentNames (id, s, v)
@@ -191,7 +192,8 @@ endfunction
 %! assert (picture.y.values, [1; 2; 3]);
 %! ambrix.close (id);
 %!test  # what some files hold: one number, texts or fill values for times
-%! s.data = struct ("one", 5, "a", [1; 2], "b", [3; 4], "missing", [-1e31; 63e12], "c", {{"x"; "y"}});
+%! s.data = struct ("one", 5, "a", [1; 2], "b", [3; 4], "c", {{"x"; "y"}});
+%! s.data.missing = [-1e31; 63e12];
 %! s.variables.one.recordVariance = false;
 %! s.variables.missing.datatype = "CDF_EPOCH";
 %! s.variables.c.datatype = "CDF_UCHAR";

@@ -35,8 +35,8 @@ endfunction
 function list = withMissing (list, names, scope)
   fields = fieldsOf (list);
   for name = intersect (names, fields(! strcmp ({list.scope}, scope)))(:)'
-    error ("ambrix:invalidData", ["ambrix.write: attribute \"%s\" is given for the file and for " ...
-           "variables, and can be of one scope only"], name{1});
+    error ("ambrix:invalidData", ["ambrix.write: attribute \"%s\" is given for the file and " ...
+           "for variables, and can be of one scope only"], name{1});
   endfor
   for name = setdiff (names, fields, "stable")(:)'
     list(end+1) = struct ("name", name{1}, "scope", scope, "entries", [], "datatypes", {{}});
