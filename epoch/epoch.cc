@@ -4,6 +4,7 @@
 
 #include <algorithm>
 #include <cstddef>
+#include <span>
 #include <vector>
 
 #include "gateway/arguments.h"
@@ -38,16 +39,16 @@ const double* doublesOf(const qvArray* array) {
   return static_cast<const double*>(qvGetReadOnlyData(array));
 }
 
-/// The components of times, each of which is an integer to the module: that is settled before any
-/// of them is computed with, and without a copy of them all.
-const double* checkedTimes(const qvArray* times) {
-  const double* components = doublesOf(times);
-  requireInRange({components, qvGetNumberOfElements(times)});
-  return components;
+std::span<const double> componentsOf(const qvArray* times) {
+  return {doublesOf(times), qvGetNumberOfElements(times)};
 }
 
-void requireLegal(double epoch) {
-  if (epoch == ILLEGAL_EPOCH_VALUE) raiseError(cdflib::illegalEpochValue());
+/// A component out of range, wherever it is, is told before an illegal time: users see them all
+/// converted before any is computed with. `later` are those that are not converted yet.
+void requireLegal(double epoch, std::span<const double> later) {
+  if (epoch != ILLEGAL_EPOCH_VALUE) return;
+  requireInRange(later);
+  raiseError(cdflib::illegalEpochValue());
 }
 
 /// 10, then the further dimensions of a 2-by-... input, else the number of pairs.
@@ -68,13 +69,13 @@ void computeEpoch(int, qvArray* outputs[], std::int32_t, const qvArray* argument
                   const CommandEntry*) {
   const std::size_t count = requireGroups(arguments[0], kEpochComponents);
   qvArray* epochs = createDoubles({1, count});
-  const double* time = checkedTimes(arguments[0]);
+  std::span<const double> components = componentsOf(arguments[0]);
   double* epoch = doublesOf(epochs);
-  for (std::size_t k = 0; k < count; ++k, time += kEpochComponents, ++epoch) {
+  for (; !components.empty(); components = components.subspan(kEpochComponents), ++epoch) {
     long c[kEpochComponents];
-    std::transform(time, time + kEpochComponents, c, truncateToLong);
+    std::ranges::transform(components.first<kEpochComponents>(), c, truncateToLong);
     *epoch = computeEPOCH(c[0], c[1], c[2], c[3], c[4], c[5], c[6]);
-    requireLegal(*epoch);
+    requireLegal(*epoch, components);
   }
   outputs[0] = epochs;
 }
@@ -83,12 +84,13 @@ void computeEpoch16(int, qvArray* outputs[], std::int32_t, const qvArray* argume
                     const CommandEntry*) {
   const std::size_t count = requireGroups(arguments[0], kEpoch16Components);
   qvArray* epochs = createDoubles({2, count});
-  const double* time = checkedTimes(arguments[0]);
+  std::span<const double> components = componentsOf(arguments[0]);
   double* epoch = doublesOf(epochs);
-  for (std::size_t k = 0; k < count; ++k, time += kEpoch16Components, epoch += 2) {
+  for (; !components.empty(); components = components.subspan(kEpoch16Components), epoch += 2) {
     long c[kEpoch16Components];
-    std::transform(time, time + kEpoch16Components, c, truncateToLong);
-    requireLegal(computeEPOCH16(c[0], c[1], c[2], c[3], c[4], c[5], c[6], c[7], c[8], c[9], epoch));
+    std::ranges::transform(components.first<kEpoch16Components>(), c, truncateToLong);
+    requireLegal(computeEPOCH16(c[0], c[1], c[2], c[3], c[4], c[5], c[6], c[7], c[8], c[9], epoch),
+                 components);
   }
   outputs[0] = epochs;
 }

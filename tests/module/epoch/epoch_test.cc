@@ -61,7 +61,7 @@ TEST_F(EpochTest, AnIllegalTimeEndsTheCommand) {
   EXPECT_EQ(does("computeEpoch16", {{-1, 1, 1, 0, 0, 0, 0, 0, 0, 0}}), kIllegal);
 }
 
-TEST_F(EpochTest, AComponentOutOfRangeIsFoundBeforeAnyTimeIsComputed) {
+TEST_F(EpochTest, AComponentOutOfRangeIsToldBeforeAnIllegalTime) {
   EXPECT_EQ(does("computeEpoch", {{-1, 1, 1, 0, 0, 0, 0, 2000, 1, 1, 0, 0, 0, 1e30}}),
             kOutOfBounds);
   EXPECT_EQ(does("computeEpoch16", {{1e30, 1, 1, 0, 0, 0, 0, 0, 0, 0}}), kOutOfBounds);

@@ -74,6 +74,8 @@ void LargeNumbersTest::moveAndCompare(std::size_t argument, std::size_t at, doub
 }
 
 TEST_P(LargeNumbersTest, NumbersBeyond32BitsNeverReachTheLibraryCut) {
+  call(GetParam().command, GetParam().arguments);  // the first to a file can differ from later ones
+  fake.forgetCalls();
   call(GetParam().command, GetParam().arguments);
   usual = wordsOf(calls());
   for (const auto& [argument, at] : numbersOf(GetParam())) {
