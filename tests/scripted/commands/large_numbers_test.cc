@@ -74,7 +74,7 @@ void LargeNumbersTest::moveAndCompare(std::size_t argument, std::size_t at, doub
 }
 
 TEST_P(LargeNumbersTest, NumbersBeyond32BitsNeverReachTheLibraryCut) {
-  call(GetParam().command, GetParam().arguments);  // the first to a file can differ from later ones
+  call("setVarInitialRecs", {file(), 3, 1});  // writers differ before the first to a file
   fake.forgetCalls();
   call(GetParam().command, GetParam().arguments);
   usual = wordsOf(calls());
