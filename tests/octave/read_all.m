@@ -1,7 +1,7 @@
 ## usage: octave-cli read_all.m FOLDER FILE...
 ##
 ## Reads each file by ambrix.read, writes what it got to FOLDER/NAME.bin for other programs, and by
-## ambrix.write to FOLDER/NAME.cdf.
+## ambrix.write to FOLDER/NAME.cdf, and makes the text that ambrix.info prints.
 1;
 
 ## Each leaf of the struct: its path, its class, its sizes and its bytes. `path` ends in a
@@ -57,6 +57,7 @@ for file = argv ()(2:end)'
   s = ambrix.read (file{1});
   ambrix.write (fullfile (folder, name), s);
   assertSame (ambrix.read (fullfile (folder, name)), s, name);
+  assert (! isempty (ambrix.internal.descriptionText (s)), name);
   for [data, variable] = s.data
     if (iscell (data))  # many cells, slow to dump
       s.data.(variable) = ambrix.read (file{1}, variable, "text", "char");

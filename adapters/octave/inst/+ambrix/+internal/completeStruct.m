@@ -30,6 +30,9 @@ function s = completeStruct (s)
   s.file = withDefaults (s.file, struct ("format", "SINGLE_FILE", "majority", "COLUMN_MAJOR", ...
                                          "checksum", "NO_CHECKSUM"));
   s.options = withDefaults (s.options, struct ("records", "first", "time", false, "fill", false));
+  if (! any (strcmp (s.options.records, {"first", "last"})))
+    error ("ambrix:invalidData", "ambrix.write: records come \"first\" or \"last\"");
+  endif
   s.variables = allVariables (s);
 endfunction
 
@@ -82,6 +85,9 @@ endfunction
 %!error id=ambrix:invalidData ambrix.internal.completeStruct (1)
 %!error <"position" is no part of what is written>
 %! ambrix.internal.completeStruct (struct ("position", struct ("x", 1)));
+%!error <records come "first" or "last">
+%! s = struct ("data", struct (), "options", struct ("records", "third"));
+%! ambrix.internal.completeStruct (s);
 %!error <describes variable "a" must be a struct>
 %! ambrix.internal.completeStruct (struct ("variables", struct ("a", 5)));
 %!error <"attributeList" must have the fields name, scope,>

@@ -8,38 +8,38 @@
 function writeAttributes (id, s, numbers)
   for attribute = allAttributes (s)
     number = ambrix.createAttr (id, attribute.name, attribute.scope);
-    attribute.name = ambrix.internal.fieldName (attribute.name);
     if (strcmp (attribute.scope, "GLOBAL_SCOPE"))
-      writeGlobal (id, number, attribute, s.attributes.(attribute.name));
+      writeGlobal (id, number, attribute, s.attributes.(attribute.field));
     else
       writeOfVariables (id, number, attribute, s.variables, numbers);
     endif
   endfor
 endfunction
 
-## The list, without the global attributes that were removed, and with those that were added.
+## The list, without the global attributes that were removed, and with those that were added; each
+## with the field that its values are in.
 function list = allAttributes (s)
   isGlobal = strcmp ({s.attributeList.scope}, "GLOBAL_SCOPE");
-  fields = fieldsOf (s.attributeList);
-  list = s.attributeList(! isGlobal | isfield (s.attributes, fields));
+  names = {s.attributeList.name};
+  fields = cellfun (@ambrix.internal.fieldName, names, "UniformOutput", false);
+  list = struct ("name", names, "field", fields, "scope", {s.attributeList.scope}, ...
+                 "entries", {s.attributeList.entries}, "datatypes", {s.attributeList.datatypes});
+  list = list(! isGlobal | isfield (s.attributes, fields));
   list = withMissing (list, fieldnames (s.attributes), "GLOBAL_SCOPE");
   for [v, name] = s.variables
     list = withMissing (list, fieldnames (v.attributes), "VARIABLE_SCOPE");
   endfor
 endfunction
 
-function fields = fieldsOf (list)
-  fields = cellfun (@ambrix.internal.fieldName, {list.name}, "UniformOutput", false);
-endfunction
-
 function list = withMissing (list, names, scope)
-  fields = fieldsOf (list);
+  fields = {list.field};
   for name = intersect (names, fields(! strcmp ({list.scope}, scope)))(:)'
     error ("ambrix:invalidData", ["ambrix.write: attribute \"%s\" is given for the file and " ...
            "for variables, and can be of one scope only"], name{1});
   endfor
   for name = setdiff (names, fields, "stable")(:)'
-    list(end+1) = struct ("name", name{1}, "scope", scope, "entries", [], "datatypes", {{}});
+    list(end+1) = struct ("name", name{1}, "field", name{1}, "scope", scope, "entries", [], ...
+                          "datatypes", {{}});
   endfor
 endfunction
 
@@ -62,10 +62,10 @@ endfunction
 
 function writeOfVariables (id, number, attribute, variables, numbers)
   for [v, name] = variables
-    if (! isfield (v.attributes, attribute.name))
+    if (! isfield (v.attributes, attribute.field))
       continue;
     endif
-    value = v.attributes.(attribute.name);
+    value = v.attributes.(attribute.field);
     datatype = [attribute.datatypes(strcmp (attribute.entries, name)), {""}]{1};
     if (isempty (datatype) && isLimit (attribute.name))
       datatype = v.datatype;
@@ -119,6 +119,20 @@ endfunction
 %! assert (r.attributeList(1).datatypes, {"CDF_CHAR", "CDF_CHAR", "CDF_DOUBLE"});
 %! assert (r.variables.Flux.attributes.Units, 8);
 %! assert (r.attributeList(3).name, "New");
+%!test  # blanks at the end of new names
+%! [id, restore] = ambrix.internal.example ();
+%! ambrix.close (id);
+%! s.data = struct ("x", 1);
+%! s.attributes.("Title ") = "blank";
+%! s.variables.x.attributes.("UNITS ") = "nT";
+%! ambrix.write ("blanks", s);
+%! r = ambrix.info ("blanks");
+%! assert (r.attributes.Title, "blank");
+%! assert (r.variables.x.attributes.UNITS, "nT");
+%! assert ({r.attributeList.name}, {"Title ", "UNITS "});
+%! ambrix.write ("again", ambrix.read ("blanks"));
+%! again = ambrix.info ("again");
+%! assert (again.attributeList, r.attributeList);
 %!test  # a name belongs to the file or to variables
 %! [id, restore] = ambrix.internal.example ();
 %! ambrix.close (id);
