@@ -22,6 +22,11 @@ bool isCompressed(CdfId file, long variable, const char* routine) {
   return type != NO_COMPRESSION;
 }
 
+/// Nothing waits for a file that the library does not write: it has refused whatever was put.
+bool refusesAllWriting(long status) {
+  return status == READ_ONLY_MODE || status == NO_WRITE_ACCESS;
+}
+
 }  // namespace
 
 void writeWaitingRecords(CdfId file, long variable, const char* routine) {
@@ -29,7 +34,10 @@ void writeWaitingRecords(CdfId file, long variable, const char* routine) {
   if (!isSparse(file, variable, routine) || !isCompressed(file, variable, routine)) return;
   // To delete records that no variable can have changes nothing, but begins with writing.
   constexpr long kNone = kNoSuchNumber - 1;
-  callOnVariable(routine, file, variable, DELETE_, zVAR_RECORDS_, kNone, kNone);
+  const long status = CDFlib(SELECT_, CDF_, libraryHandle(file, routine),    //
+                             zVAR_, libraryNumber(variable, kNoSuchNumber),  //
+                             DELETE_, zVAR_RECORDS_, kNone, kNone, NULL_);
+  if (!refusesAllWriting(status)) checkLibraryStatus(status, routine);
 }
 
 }  // namespace TOLVEX::ambrix

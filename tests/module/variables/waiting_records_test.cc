@@ -5,7 +5,9 @@
 namespace ambrix_test {
 namespace {
 
-constexpr int kPad = 1, kPrevious = 2, kGzip = 5;
+using testing::HasSubstr;
+
+constexpr int kPad = 1, kPrevious = 2, kGzip = 5, kReadOnlyOn = -1;
 
 class WaitingRecordsTest : public ModuleTest, public testing::WithParamInterface<int> {
  protected:
@@ -38,6 +40,15 @@ TEST_P(WaitingRecordsTest, PartsOfThemCanBeWritten) {
   EXPECT_EQ(does("getVarRecordData", {file, v, 4}), "double 2x1 [" + first + " 9]");
   const Given again = reopen(file);
   EXPECT_EQ(does("getVarRecordData", {again, v, 4}), "double 2x1 [" + first + " 9]");
+  EXPECT_EQ(does("getVarRecordData", {again, v, 60000}), "double 2x1 [3 4]");
+}
+
+TEST_P(WaitingRecordsTest, NoneWaitAfterWritingWasRefused) {
+  const Given again = reopen(file);
+  results("setReadOnlyMode", {again, kReadOnlyOn});
+  EXPECT_THAT(does("putVarRecordData", {again, v, 4, row<double>({5, 6})}),
+              HasSubstr("READ_ONLY_MODE"));
+  EXPECT_EQ(does("getVarRecordData", {again, v, 4}), "double 2x1 " + missing);
   EXPECT_EQ(does("getVarRecordData", {again, v, 60000}), "double 2x1 [3 4]");
 }
 

@@ -76,6 +76,17 @@ TEST_F(WaitingRecordsTest, NorBeforeWholeRecordsAreWritten) {
   EXPECT_THAT(calls(), Not(Contains(kAsk)));
 }
 
+// What was put there was refused, so nothing waits.
+TEST_F(WaitingRecordsTest, FilesThatAreNotWrittenAreRead) {
+  answerCompressedSparse();
+  put();
+  for (const long refusal : {-2070, -2086}) {  // READ_ONLY_MODE, NO_WRITE_ACCESS
+    fake.endWith("DELETE_", refusal);
+    call("getVarRecordData", {file(), 3, 4});
+    EXPECT_THAT(calls(), Contains(HasSubstr("CDFgetVarRecordData")));
+  }
+}
+
 TEST_F(WaitingRecordsTest, AFailureIsThatOfTheReader) {
   answerCompressedSparse();
   put();
