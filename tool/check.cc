@@ -6,6 +6,8 @@
 #include <cstdlib>
 #include <cstring>
 #include <exception>
+#include <filesystem>
+#include <system_error>
 
 #include "tool/call.h"
 #include "tool/failure.h"
@@ -15,11 +17,19 @@
 namespace ambrix::tool {
 namespace {
 
-/// Why nobody could read the file, or 0. The library looks for it with the extension, too.
+namespace fs = std::filesystem;
+
+/// Why nobody could read a file of this name, or 0.
+int unreadableAs(const std::string& path) {
+  if (::access(path.c_str(), R_OK) != 0) return errno;
+  std::error_code error;
+  return fs::is_directory(path, error) ? EISDIR : 0;
+}
+
+/// The same of a file that the library looks for, with the extension, too.
 int unreadable(const std::string& path) {
-  if (::access(path.c_str(), R_OK) == 0) return 0;
-  const int reason = errno;
-  return ::access((path + ".cdf").c_str(), R_OK) == 0 ? 0 : reason;
+  const int reason = unreadableAs(path);
+  return reason == 0 || unreadableAs(path + ".cdf") == 0 ? 0 : reason;
 }
 
 /// The work of a child. Only what it tells counts; what it cannot tell is a failure of its own.

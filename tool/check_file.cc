@@ -21,6 +21,11 @@ namespace fs = std::filesystem;
 /// No compression of the library makes values smaller by more than this; GZIP comes near it.
 constexpr double kBestCompression = 1100;
 
+/// How many times what is compressed may be larger.
+double bestGain(const Compression& compression) {
+  return compression.type == "NO_COMPRESSION" ? 1 : kBestCompression;
+}
+
 std::string quoted(const char* kind, const std::string& name) {
   return std::string(kind) + " \"" + printable(name) + '"';
 }
@@ -111,12 +116,11 @@ void Examination::requireRoomFor(const VariableFacts& facts) const {
   const fs::path path = fs::exists(path_, error) ? path_ : path_ + ".cdf";
   const auto bytes = static_cast<double>(fs::file_size(path, error));
   if (error || facts_.format != "SINGLE_FILE") return;
-  const bool compressed =
-      facts.compression.type != "NO_COMPRESSION" || facts_.compression.type != "NO_COMPRESSION";
   double claimed = facts.written * static_cast<double>(facts.definition.elements);
   for (std::size_t i = 0; i < facts.definition.sizes.size(); ++i)
     claimed *= facts.definition.varies.at(i) ? static_cast<double>(facts.definition.sizes[i]) : 1;
-  if (claimed <= bytes * (compressed ? kBestCompression : 1)) return;
+  // Compressed values may be compressed once more, with the file.
+  if (claimed <= bytes * bestGain(facts.compression) * bestGain(facts_.compression)) return;
   throw ToolError("moreThanTheFile", "the file is too small for the records that it lists");
 }
 

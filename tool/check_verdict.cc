@@ -26,7 +26,7 @@ void tellProblem(const Problem& problem) {
 }
 
 void tellUnsupported(const std::string& what) {
-  tell(Json(toUtf8(what)).dump());
+  tell(Json(toUtf8(what)).dump(), kRoomToTell / 2);  // problems always find room
 }
 
 void takeFindings(std::string_view told, Verdict& verdict) {

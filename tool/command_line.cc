@@ -3,6 +3,7 @@
 #include <fmt/format.h>
 
 #include <algorithm>
+#include <charconv>
 #include <memory>
 
 #include "tool/help_texts.h"
@@ -37,13 +38,25 @@ CLI::App& addCommand(CLI::App& app, const HelpText& help) {
   return command;
 }
 
+/// What is wrong with the name, or nothing: a shell's empty variable is not to mean "no option".
+std::string requireName(const std::string& name) {
+  return name.empty() ? "the name is empty" : "";
+}
+
+std::string requireSeconds(const std::string& text) {
+  double seconds = -1;
+  const auto end = std::from_chars(text.data(), text.data() + text.size(), seconds).ptr;
+  const bool understood = end == text.data() + text.size() && seconds >= 0;
+  return understood ? "" : "'" + text + "' is no number of seconds";
+}
+
 void addTimeLimit(CLI::App& command, Arguments& arguments) {
   command
       .add_option("--time-limit", arguments.timeLimit,
                   fmt::format("Give up when nothing was read for so long (default: {}; 0: never)",
                               kTimeLimit))
       ->type_name("SECONDS")
-      ->check(CLI::NonNegativeNumber);
+      ->check(requireSeconds);
 }
 
 void addInfo(CLI::App& app, Arguments& arguments) {
@@ -68,7 +81,8 @@ void addDump(CLI::App& app, Arguments& arguments) {
       ->transform(CLI::IsMember({"table", "csv", "json"}));
   dump.add_option("--output", arguments.dump.output,
                   "Write to a new file, which appears when it is complete")
-      ->type_name("OUT");
+      ->type_name("OUT")
+      ->check(requireName);
   addTimeLimit(dump, arguments);
 }
 
@@ -84,7 +98,10 @@ void addConvert(CLI::App& app, Arguments& arguments) {
   CLI::App& convert = addCommand(app, kConvertHelp);
   ConvertOptions& options = arguments.convert;
   convert.add_option("IN", options.input, "The file to copy")->required()->type_name("");
-  convert.add_option("OUT", options.output, "The file to write")->required()->type_name("");
+  convert.add_option("OUT", options.output, "The file to write")
+      ->required()
+      ->type_name("")
+      ->check(requireName);
   convert
       .add_option("--compression", options.compression,
                   "Compress the file as a whole: none, rle, huff, ahuff or gzip, which may have a "

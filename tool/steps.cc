@@ -21,10 +21,9 @@ void beginStep(std::string_view what) {
   ++watched->count;
 }
 
-bool tell(std::string_view line) {
-  if (watched == nullptr || line.size() + 1 > watched->told.size() - watched->toldBytes) {
-    return false;
-  }
+bool tell(std::string_view line, std::size_t andFor) {
+  if (watched == nullptr) return false;
+  if (line.size() + 1 + andFor > watched->told.size() - watched->toldBytes) return false;
   *std::ranges::copy(line, watched->told.data() + watched->toldBytes).out = '\n';
   watched->toldBytes += line.size() + 1;
   return true;

@@ -14,9 +14,12 @@ namespace ambrix::tool {
 /// anew. Without a watcher, none of what is here does anything.
 void beginStep(std::string_view what);
 
+/// The bytes that a worker may leave for its watcher.
+inline constexpr std::size_t kRoomToTell = 1 << 18;
+
 /// Leaves a line for the watcher, who finds it however the worker ends. Returns whether there was
-/// room for it.
-bool tell(std::string_view line);
+/// room for it, and for as much more.
+bool tell(std::string_view line, std::size_t andFor = 0);
 
 /// While one of these exists no time counts, because the worker waits for somebody else.
 class Pause {
@@ -53,7 +56,7 @@ class Steps {
     std::atomic<bool> finished;
     std::array<char, 1024> last;
     std::size_t toldBytes;
-    std::array<char, 1 << 18> told;
+    std::array<char, kRoomToTell> told;
   };
 
  private:

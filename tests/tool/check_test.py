@@ -55,6 +55,19 @@ class SoundTest(CheckCase):
             self.assertEqual(self.check("out.cdf"), "out.cdf: sound\n")
             os.remove(self.path("out.cdf"))
 
+    def test_values_that_are_compressed_twice(self):
+        session = self.session()
+        (file,) = session.call("create", "zeros")
+        session.call("createVar", file, "v", session.constant("CDF_INT1"), 1, [4000000], True,
+                     [True])
+        session.call("setVarCompression", file, 0, session.constant("GZIP_COMPRESSION"), 9)
+        session.call("setVarPadValue", file, 0, array("int8", [0]))
+        session.call("putVarData", file, 0, 0, [0], array("int8", [0]))
+        session.call("close", file)
+        self.run_tool("convert", "zeros.cdf", "twice.cdf", "--compression", "gzip:9")
+        self.assertLess(os.path.getsize(self.path("twice.cdf")), 1000)
+        self.assertEqual(self.check("twice.cdf"), "twice.cdf: sound\n")
+
     def test_several_files_that_are_one(self):
         session = self.session()
         (file,) = session.call("create", "parts")
@@ -134,13 +147,37 @@ class DamageTest(CheckCase):
         self.assertRegex(self.check("bad.cdf", status=1),
                          r'\Abad.cdf: not sound\n    variable "cube": TOLVEX:[^\n]*\n\Z')
 
+    def test_a_problem_is_told_after_much_that_is_not_supported(self):
+        session = self.session()
+        (file,) = session.call("create", "many")
+        for number in range(1200):
+            session.call("createVar", file, f"{number:03} " + "x" * 240, 33, 1, [], True, [])
+        session.call("createVar", file, "last", 22, 1, [], True, [])
+        session.call("setVarCompression", file, 1200, session.constant("GZIP_COMPRESSION"), 6)
+        session.call("hyperPutVarData", file, 1200, 0, 1000, 1, [], [], [],
+                     array("double", list(range(1000)), [1000, 1]))
+        session.call("close", file)
+        content = bytearray(self.read("many.cdf"))
+        place = content.index(b"\x1f\x8b")
+        content[place + 10:place + 40] = bytes(30)
+        self.write("many.cdf", content)
+        (verdict,) = self.verdicts("many.cdf", status=1)
+        self.assertGreater(len(verdict["unsupported"]), 300)
+        self.assertEqual([problem["place"] for problem in verdict["problems"]], ['variable "last"'])
+
     def test_files_that_cannot_be_read(self):
         (verdict,) = self.verdicts("missing.cdf", status=1)
         self.assertEqual(verdict["problems"], [{"place": "", "identifier": "ambrix:unreadable",
                                                 "message": "No such file or directory"}])
-        self.assertIn(OPEN_ERROR, self.check(".", status=1))
+        self.assertEqual(self.check(".", status=1),
+                         ".: not sound\n    ambrix:unreadable: Is a directory\n")
+        os.mkdir(self.path("example"))
+        self.assertEqual(self.check("example"), "example: sound\n")  # the library adds .cdf
         self.assert_misused("check")
         self.assert_misused("check", "--nonsense", "example.cdf")
+        for wrong in ("-1", "soon", "", "nan", "1s"):
+            self.assertIn(f"'{wrong}' is no number of seconds",
+                          self.assert_misused("check", "example.cdf", "--time-limit", wrong))
 
     def start_checking(self, *options):
         """A check that begins with a file that takes hours, and its worker."""

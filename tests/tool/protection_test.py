@@ -213,6 +213,8 @@ class OutputTest(ProtectionCase):
         message = self.assert_fails("ambrix:outputExists", "dump", BUSY, "v", "--output", BUSY)
         self.assertIn(BUSY, message)
         self.assert_fails("ambrix:noSuchFolder", "dump", BUSY, "v", "--output", "no/such.txt")
+        self.assert_misused("dump", BUSY, "v", "--output", "")
+        self.assert_misused("convert", BUSY, "")
         self.assert_fails("ambrix:noSuchVariable", "dump", BUSY, "w", "--output", "out.txt")
         self.assert_nothing_left()
 
