@@ -24,7 +24,7 @@ def arguments():
     parser = argparse.ArgumentParser(prog="script/bench", description=__doc__)
     parser.add_argument("build", type=pathlib.Path, help=argparse.SUPPRESS)
     parser.add_argument("--quick", action="store_true",
-                        help="a hundredth of the work, three rounds: to see that everything runs")
+                        help="a hundredth of the work, one round: to see that everything runs")
     parser.add_argument("--only", metavar="NAME", action="append",
                         help="only workloads whose name contains this; may be given several times")
     parser.add_argument("--peers", action="store_true",
@@ -50,8 +50,8 @@ def chosen(names, only):
 def all_columns(options, folder, divisor):
     """The reference first. The library does nothing for commands without a library call."""
     names = [workload.name for workload in WORKLOADS]
-    moduleOnly = {"get_constant", "unknown_command", "refused_argument"}
-    found = [columns.native(options.build, "library", folder, divisor, set(names) - moduleOnly),
+    module_only = {"get_constant", "unknown_command", "refused_argument"}
+    found = [columns.native(options.build, "library", folder, divisor, set(names) - module_only),
              columns.native(options.build, "module", folder, divisor, None)]
     in_octave = columns.octave(options.build, folder, divisor, set(names) - {"widen", "narrow"})
     if in_octave:
