@@ -47,7 +47,7 @@ struct LibraryHyperslab {
 bool takesWholeRecords(const VariableDescription& variable, const LibraryHyperslab& slab);
 
 /// Of a variable whose records do not vary the library reads whole records with all those between
-/// them, more than were asked for. They are all the same one, so none need be skipped.
+/// them, more than were asked for. Only one is stored, so none need be skipped.
 void skipNoRecordsThatDoNotVary(const VariableDescription& variable, LibraryHyperslab& slab);
 
 /// Selects the variable and the hyperslab, then performs GET_ or PUT_ of `zVAR_HYPERDATA_`.

@@ -176,11 +176,14 @@ TEST_F(ReadHyperslabsTest, RecordsThatWereNeverWrittenReadAsPadValues) {
             "999.98999 -1.00000002e+30 -1.00000002e+30]");
 }
 
-TEST_F(ReadHyperslabsTest, RecordsThatDoNotVaryAreTheSameWhereverSomeAreSkipped) {
+TEST_F(ReadHyperslabsTest, AnIntervalBetweenRecordsThatDoNotVaryMakesNoDifference) {
   const Given file = create();
   const double v = createVar(file, {.datatype = 12, .sizes = {2}, .recordsVary = false});
   results("putVarRecordData", {file, v, 0, row<std::uint16_t>({7, 8})});
-  EXPECT_EQ(does("hyperGetVarData", {file, v, 17, 3, 2, 0, 2, 1}), "uint16 2x3 [7 8 7 8 7 8]");
+  // What follows the first record depends on the library.
+  const std::string records = does("hyperGetVarData", {file, v, 17, 3, 1, 0, 2, 1});
+  EXPECT_THAT(records, testing::StartsWith("uint16 2x3 [7 8 "));
+  EXPECT_EQ(does("hyperGetVarData", {file, v, 17, 3, 2, 0, 2, 1}), records);
   EXPECT_EQ(does("hyperGetVarData", {file, v, 17, 3, 2, 0, 1, 1}), "uint16 1x3 [7 7 7]");
   EXPECT_EQ(does("hyperGetVarData", {file, v, 17, 1, 2, 0, 2, 1}), "uint16 2x1 [7 8]");
 }
