@@ -4,6 +4,7 @@ import os
 import subprocess
 import tempfile
 import unittest
+from unittest import mock
 
 from support.ambrix_session import Session
 
@@ -23,9 +24,16 @@ class ToolCase(unittest.TestCase):
     """Runs the tool in a folder of its own."""
 
     def setUp(self):
-        folder = tempfile.TemporaryDirectory()
+        self.folder = self.new_folder()
+        # A tool that is killed leaves its folder for scratch files.
+        environment = mock.patch.dict(os.environ, TMPDIR=self.new_folder())
+        environment.start()
+        self.addCleanup(environment.stop)
+
+    def new_folder(self):
+        folder = tempfile.TemporaryDirectory(ignore_cleanup_errors=True)
         self.addCleanup(folder.cleanup)
-        self.folder = folder.name
+        return folder.name
 
     def path(self, name):
         return os.path.join(self.folder, name)
