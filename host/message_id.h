@@ -12,7 +12,18 @@
 namespace TOLVEX::ambrix {
 
 /// One message value: an integer, a narrow string or a UTF-16 string. A fresh one is the integer 0.
-using MessageArg = std::variant<std::int64_t, std::string, std::u16string>;
+struct MessageArg : std::variant<std::int64_t, std::string, std::u16string> {
+  using variant::variant;
+  MessageArg(MessageArg&&) noexcept = default;
+  MessageArg& operator=(MessageArg&&) noexcept = default;
+  ~MessageArg() = default;
+
+  // Texts are copied before they go into the variant: GCC's library destroys what is not there when
+  // memory runs out while a variant of strings copies one into itself.
+  MessageArg(const MessageArg& other)
+      : variant(std::visit([](auto value) { return variant(std::move(value)); }, other)) {}
+  MessageArg& operator=(const MessageArg& other) { return *this = MessageArg(other); }
+};
 
 /// An error or a warning as it travels from the module to its host, which owns the message texts.
 struct MessageId {
