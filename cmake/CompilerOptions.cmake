@@ -45,10 +45,10 @@ endif()
 if(AMBRIX_SANITIZE)
   add_compile_options(-fsanitize=address -fno-omit-frame-pointer)
   add_link_options(-fsanitize=address,undefined)
-  target_compile_options(ambrix_options INTERFACE
-    -fsanitize=undefined -fno-sanitize-recover=all)
+  # For the folders that come after the CDF library; tests leave it out again.
+  set(AMBRIX_CHECKS -fsanitize=undefined -fno-sanitize-recover=all)
   if(CMAKE_CXX_COMPILER_ID STREQUAL "Clang")
-    target_compile_options(ambrix_options INTERFACE -fsanitize=fuzzer-no-link)  # libFuzzer's eyes
+    list(APPEND AMBRIX_CHECKS -fsanitize=fuzzer-no-link)  # libFuzzer's eyes
   endif()
 endif()
 
