@@ -31,6 +31,15 @@ double readNumbers(const Setup& setup, const char* name) {
                           setup.records() * kRecordValues);
 }
 
+/// Inquires as the command does, writes and closes.
+void putAndClose(CDFid file, long variable, Slab& slab, void* data) {
+  Description description;
+  inquire(file, variable, description);
+  majorityOf(file);
+  moveSlab(file, variable, slab, PUT_, data);
+  closeFile(file);
+}
+
 double writeNumbers(const Setup& setup, long majority, bool compressed) {
   const std::size_t values = setup.records() * kRecordValues;
   std::vector<double> data(values);
@@ -46,11 +55,7 @@ double writeNumbers(const Setup& setup, long majority, bool compressed) {
     check(CDFlib(SELECT_, CDF_, file, zVAR_, variable,  //
                  PUT_, zVAR_COMPRESSION_, GZIP_COMPRESSION, &level, NULL_));
   }
-  Description description;
-  inquire(file, variable, description);
-  majorityOf(file);
-  moveSlab(file, variable, slab, PUT_, data.data());
-  closeFile(file);
+  putAndClose(file, variable, slab, data.data());
   return watch.seconds();
 }
 
@@ -104,11 +109,7 @@ double writeText(const Setup& setup) {
   const Stopwatch watch;
   CDFid file = createFile(name);
   const long variable = createVariable(file, {"text", CDF_CHAR, kTextLength});
-  Description description;
-  inquire(file, variable, description);
-  majorityOf(file);
-  moveSlab(file, variable, slab, PUT_, data.data());
-  closeFile(file);
+  putAndClose(file, variable, slab, data.data());
   return watch.seconds();
 }
 

@@ -6,9 +6,12 @@
 
 namespace ambrix_bench {
 
-double readSingles(const Setup& setup) {
+namespace {
+
+/// Reads one value of each record, inquiring before each as a command does.
+template <typename Read>
+double timeSingles(const Setup& setup, const Read& read) {
   CDFid file = openFile(setup.file("series.cdf"));
-  long indices[CDF_MAX_DIMS] = {};
   double sum = 0;
   const Stopwatch watch;
   for (long record = 0; record < static_cast<long>(setup.singles()); ++record) {
@@ -16,10 +19,7 @@ double readSingles(const Setup& setup) {
     inquire(file, 0L, description);
     majorityOf(file);
     double value = 0;
-    check(CDFlib(SELECT_, CDF_, file, zVAR_, 0L,  //
-                 zVAR_RECNUMBER_, record,         //
-                 zVAR_DIMINDICES_, indices,       //
-                 GET_, zVAR_DATA_, &value, NULL_));
+    read(file, record, &value);
     sum += value;
   }
   const double seconds = watch.seconds();
@@ -27,23 +27,24 @@ double readSingles(const Setup& setup) {
   return sum == 0 ? 0 : seconds;
 }
 
+}  // namespace
+
+double readSingles(const Setup& setup) {
+  long indices[CDF_MAX_DIMS] = {};
+  return timeSingles(setup, [&](CDFid file, long record, double* value) {
+    check(CDFlib(SELECT_, CDF_, file, zVAR_, 0L,  //
+                 zVAR_RECNUMBER_, record,         //
+                 zVAR_DIMINDICES_, indices,       //
+                 GET_, zVAR_DATA_, value, NULL_));
+  });
+}
+
 double readHyperSingles(const Setup& setup) {
-  CDFid file = openFile(setup.file("series.cdf"));
   Slab slab = wholeSlab(1, {});
-  double sum = 0;
-  const Stopwatch watch;
-  for (long record = 0; record < static_cast<long>(setup.singles()); ++record) {
-    Description description;
-    inquire(file, 0L, description);
-    majorityOf(file);
-    double value = 0;
+  return timeSingles(setup, [&](CDFid file, long record, double* value) {
     slab.firstRecord = record;
-    moveSlab(file, 0L, slab, GET_, &value);
-    sum += value;
-  }
-  const double seconds = watch.seconds();
-  closeFile(file);
-  return sum == 0 ? 0 : seconds;
+    moveSlab(file, 0L, slab, GET_, value);
+  });
 }
 
 /// A failing call and the text of its status.

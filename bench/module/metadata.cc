@@ -27,32 +27,31 @@ double openAndClose(const Setup& setup) {
   return watch.seconds();
 }
 
+/// A walk through a file with something set after it was opened.
+template <typename Set>
+double timeWalk(const Setup& setup, const Set& set) {
+  const Stopwatch watch;
+  const Array file = openFile(setup, "metadata.cdf");
+  set(file);
+  walk(file);
+  closeFile(file);
+  return watch.seconds();
+}
+
 }  // namespace
 
 double walkMetadata(const Setup& setup) {
-  const Stopwatch watch;
-  const Array file = openFile(setup, "metadata.cdf");
-  walk(file);
-  closeFile(file);
-  return watch.seconds();
+  return timeWalk(setup, [](const Array&) {});
 }
 
 double walkReadOnly(const Setup& setup) {
-  const Stopwatch watch;
-  const Array file = openFile(setup, "metadata.cdf");
-  call("setReadOnlyMode", {file, constant("READONLYon")});
-  walk(file);
-  closeFile(file);
-  return watch.seconds();
+  return timeWalk(setup, [](const Array& file) {
+    call("setReadOnlyMode", {file, constant("READONLYon")});
+  });
 }
 
 double walkSmallCache(const Setup& setup) {
-  const Stopwatch watch;
-  const Array file = openFile(setup, "metadata.cdf");
-  call("setCacheSize", {file, number(2)});
-  walk(file);
-  closeFile(file);
-  return watch.seconds();
+  return timeWalk(setup, [](const Array& file) { call("setCacheSize", {file, number(2)}); });
 }
 
 double openValidated(const Setup& setup) {
