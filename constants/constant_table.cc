@@ -72,16 +72,6 @@ const std::map<std::string, double> ConstantNameTable =
     ("BACKWARDFILEOFF", 0)                                 //
     ("BACKWARDFILEON", 1);
 
-namespace {
-
-// Bytes beyond ASCII keep their value in every locale.
-char toUpper(char c) {
-  const auto byte = static_cast<unsigned char>(c);
-  return byte > 0x7F ? c : static_cast<char>(std::toupper(byte));
-}
-
-}  // namespace
-
 void getConstantNames(int, qvArray* outputs[], std::int32_t, const qvArray*[],
                       const CommandEntry*) {
   qvArray* names = qvCreateCellMatrix(ConstantNameTable.size(), 1);
@@ -96,7 +86,7 @@ void getConstantValue(int, qvArray* outputs[], std::int32_t, const qvArray* argu
                       const CommandEntry*) {
   std::string name = getStringArg(arguments[0]);
   for (char& c : name)
-    c = toUpper(c);
+    c = static_cast<char>(std::toupper(static_cast<unsigned char>(c)));
   const auto found = ConstantNameTable.find(name);
   if (found == ConstantNameTable.end()) raiseError(cdflib::unrecognizedConstantName(name));
   outputs[0] = qvCreateDoubleScalar(found->second);

@@ -18,7 +18,7 @@ void getConstantNames(int, qvArray* outputs[], std::int32_t, const qvArray* argu
                       const CommandEntry*);
 
 /// "getConstantValue" (name in any case): a double scalar. Raises `unrecognizedConstantName` with
-/// the upper-case name.
+/// the name in the upper case of the current locale.
 void getConstantValue(int, qvArray* outputs[], std::int32_t, const qvArray* arguments[],
                       const CommandEntry*);
 

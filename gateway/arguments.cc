@@ -65,6 +65,7 @@ long getLongScalarArg(const qvArray* argument, const char* label) {
 }
 
 std::vector<long> getLongVectorArg(const qvArray* argument, const char* label) {
+  if (qvGetNumberOfElements(argument) == 0) return {};
   switch (qvGetClassID(argument)) {
     case qvDOUBLE_CLASS:
       return convertAll<double>(argument);

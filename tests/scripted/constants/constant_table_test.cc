@@ -2,6 +2,9 @@
 #include "constants/constant_table.h"
 
 #include <cctype>
+#include <clocale>
+#include <cstdlib>
+#include <filesystem>
 
 #include "tests/support/constants.h"
 #include "tests/support/scripted_test.h"
@@ -10,6 +13,30 @@ namespace ambrix_test {
 namespace {
 
 using ConstantTableTest = ScriptedTest;
+
+/// While it lives, characters are those of German in ISO 8859-1, if the locale could be made.
+class LatinLocale {
+ public:
+  LatinLocale() {
+    const std::string folder = testing::TempDir() + "ambrix_locale";
+    std::filesystem::create_directories(folder);
+    const std::string make =
+        "localedef -i de_DE -f ISO-8859-1 '" + folder + "/latin' >/dev/null 2>&1";
+    const bool made = std::system(make.c_str()) == 0;
+    setenv("LOCPATH", folder.c_str(), 1);
+    isSet_ = made && std::setlocale(LC_CTYPE, "latin") != nullptr;
+    unsetenv("LOCPATH");
+    std::filesystem::remove_all(folder);
+  }
+  ~LatinLocale() { std::setlocale(LC_CTYPE, "C"); }
+  LatinLocale(const LatinLocale&) = delete;
+  LatinLocale& operator=(const LatinLocale&) = delete;
+
+  [[nodiscard]] bool isSet() const { return isSet_; }
+
+ private:
+  bool isSet_ = false;
+};
 
 TEST_F(ConstantTableTest, NamesComeInByteOrderAsAColumnOfCells) {
   const Array names = result("getConstantNames");
@@ -52,6 +79,14 @@ TEST_F(ConstantTableTest, UnknownNamesAreReportedInUpperCase) {
   EXPECT_EQ(errorOf("getConstantValue", {""}), cdflib("unrecognizedConstantName", ""));
   EXPECT_EQ(errorOf("getConstantValue", {"\xE9\xB5"}),
             cdflib("unrecognizedConstantName", "\xE9\xB5"));
+}
+
+TEST_F(ConstantTableTest, TheUpperCaseIsThatOfTheLocale) {
+  const LatinLocale latin;
+  if (!latin.isSet()) GTEST_SKIP() << "localedef can't make de_DE (package locales)";
+  EXPECT_EQ(errorOf("getConstantValue", {"vary\xE9\xFF\x80"}),
+            cdflib("unrecognizedConstantName", "VARY\xC9\xFF\x80"));
+  EXPECT_EQ(result("getConstantValue", {"vary"}).data<double>()[0], -1);
 }
 
 TEST_F(ConstantTableTest, UnsupportedDatatypesHaveNoName) {

@@ -114,6 +114,12 @@ TEST_F(ArgumentsTest, CellsAreNoVector) {
   EXPECT_EQ(failureOf([&] { vector(cell); }), validate("argumentNotDoublePrecision", "LABEL"));
 }
 
+TEST_F(ArgumentsTest, AnEmptyArrayOfAnyClassIsAnEmptyVector) {
+  const Given empties[] = {{}, "", row<bool>({}), row<std::int32_t>({}), Array::cell({0, 3})};
+  for (const Given& empty : empties)
+    EXPECT_THAT(vector(empty), IsEmpty());
+}
+
 TEST_F(ArgumentsTest, TextsKeepTheLowBitsUpToTheFirstZero) {
   EXPECT_EQ(string("abc"), "abc");
   EXPECT_EQ(string(Array::text(u"\u20AC\u00E9")), "\xAC\xE9");
