@@ -14,7 +14,7 @@ TABLE = table_file.read()
 COMMANDS = TABLE["commands"]
 LIBRARY_OF_EXAMPLES = [3, 9, 1]
 INT8 = Array("int8", [1, 1], [5])
-CELL = Array("cell", [0, 0], [])
+CELL = Array("cell", [1, 1], [1.0])
 TOO_LARGE = 1e19
 
 # What an argument of a kind is taken for, to reach the arguments behind it.
