@@ -12,7 +12,7 @@ inline constexpr int kGlobalEntry = 1;
 inline constexpr int kVariableEntry = 3;
 
 inline long getAttributeArg(const qvArray* argument, const char* label) {
-  return libraryNumber(getLongScalarArg(argument, label), kNoSuchNumber);
+  return variableOrAttributeNumber(getLongScalarArg(argument, label));
 }
 
 inline long getEntryArg(const qvArray* argument) {

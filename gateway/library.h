@@ -30,9 +30,9 @@ void* libraryHandle(CdfId file, const char* routine);
 CdfId cdfIdOf(void* handle);
 
 // The library reads numbers as long and keeps only 32 bits of them: 2^32 would address variable 0.
-// A number that does not fit is replaced by one of its kind that the library itself refuses: a
-// large one for what exists or not (a variable, an attribute), a negative one for entries, records,
-// counts and amounts.
+// A number that does not fit is replaced by one of its kind that the library itself refuses: for
+// what exists or not (a variable, an attribute) by one of the same sign, which is too large or
+// illegal as the number itself is; for entries, records, counts and amounts by a negative one.
 inline constexpr long kNoSuchNumber = std::numeric_limits<std::int32_t>::max();
 inline constexpr long kBadNumber = -1;
 
@@ -42,6 +42,9 @@ constexpr bool fitsLibrary(long number) {
 }
 constexpr long libraryNumber(long number, long refused) {
   return fitsLibrary(number) ? number : refused;
+}
+constexpr long variableOrAttributeNumber(long number) {
+  return libraryNumber(number, number < 0 ? kBadNumber : kNoSuchNumber);
 }
 
 /// What `CDFlib` may find in its argument list: it reads longs and pointers and cannot check them.
@@ -61,7 +64,7 @@ void callOnFile(const char* routine, CdfId file, Items... items) {
 
 template <typename... Items>
 void callOnVariable(const char* routine, CdfId file, long variable, Items... items) {
-  callOnFile(routine, file, zVAR_, libraryNumber(variable, kNoSuchNumber), items...);
+  callOnFile(routine, file, zVAR_, variableOrAttributeNumber(variable), items...);
 }
 
 /// Selects zVariables in the routines that take either kind.

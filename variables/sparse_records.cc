@@ -34,8 +34,8 @@ void writeWaitingRecords(CdfId file, long variable, const char* routine) {
   if (!isSparse(file, variable, routine) || !isCompressed(file, variable, routine)) return;
   // To delete records that no variable can have changes nothing, but begins with writing.
   constexpr long kNone = kNoSuchNumber - 1;
-  const long status = CDFlib(SELECT_, CDF_, libraryHandle(file, routine),    //
-                             zVAR_, libraryNumber(variable, kNoSuchNumber),  //
+  const long status = CDFlib(SELECT_, CDF_, libraryHandle(file, routine),  //
+                             zVAR_, variableOrAttributeNumber(variable),   //
                              DELETE_, zVAR_RECORDS_, kNone, kNone, NULL_);
   if (!refusesAllWriting(status)) checkLibraryStatus(status, routine);
 }

@@ -1,4 +1,6 @@
 // Attributes and the counts of their entries.
+#include <cmath>
+
 #include "tests/module/support/module_test.h"
 
 namespace ambrix_test {
@@ -130,11 +132,14 @@ TEST_F(AttributesTest, AMissingAttributeFailsUnderTheRoutineOfEachCommand) {
                               {"getAttrMaxEntry", "CDFgetAttrMaxzEntry", {}},
                               {"getNumAttrgEntries", "CDFgetNumAttrgEntries", {}},
                               {"getNumAttrEntries", "CDFgetNumAttrzEntries", {}}};
+  const std::pair<double, const char*> numbers[] = {
+      {2, kNoSuchAttr},  {4294967296.0, kNoSuchAttr}, {1e18, kNoSuchAttr},
+      {-1, kBadAttrNum}, {-1e18, kBadAttrNum},        {NAN, kBadAttrNum}};
   for (const Command& command : commands) {
-    for (const double number : {2.0, 4294967296.0, 1e18}) {
+    for (const auto& [number, text] : numbers) {
       Arguments arguments{file, number};
       arguments.insert(arguments.end(), command.more.begin(), command.more.end());
-      EXPECT_EQ(does(command.name, arguments), refused(command.routine, kNoSuchAttr))
+      EXPECT_EQ(does(command.name, arguments), refused(command.routine, text))
           << command.name << ' ' << number;
     }
   }

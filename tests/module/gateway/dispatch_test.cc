@@ -113,7 +113,7 @@ TEST_F(DispatchTest, ANumberMustBeOneDouble) {
 TEST_F(DispatchTest, NanIsTheMostNegativeNumberAndNoOverflow) {
   const Given file = create();
   createVar(file, {});
-  EXPECT_EQ(does("getVarName", {file, NAN}), refused("CDFgetzVarName", kNoSuchVar));
+  EXPECT_EQ(does("getVarName", {file, NAN}), refused("CDFgetzVarName", kBadVarNum));
 }
 
 TEST_F(DispatchTest, ATextArgumentThatIsNoTextIsALogicError) {

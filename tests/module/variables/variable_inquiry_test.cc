@@ -142,7 +142,7 @@ TEST_F(VariableInquiryTest, AMissingVariableFailsUnderTheRoutineOfEachCommand) {
   const Given file = create();
   createVar(file, {});
   const std::pair<double, const char*> numbers[] = {
-      {1, kNoSuchVar}, {4294967296.0, kNoSuchVar}, {-1, kBadVarNum}, {-4294967296.0, kNoSuchVar}};
+      {1, kNoSuchVar}, {4294967296.0, kNoSuchVar}, {-1, kBadVarNum}, {-4294967296.0, kBadVarNum}};
   for (const Command& command : commands) {
     Arguments arguments{file, "x"};
     arguments.insert(arguments.end(), command.more.begin(), command.more.end());

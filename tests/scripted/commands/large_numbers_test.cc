@@ -8,12 +8,14 @@ namespace ambrix_test {
 namespace {
 
 constexpr long kNoSuchVar = -2019;
+constexpr long kBadVarNum = -2041;
 
 class LargeNumbersTest : public CommandTest, public testing::WithParamInterface<CommandCase> {
  protected:
   LargeNumbersTest() {
     ::ambrix::setByteLimit(1 << 20);
     fake.endWith("zVAR_ 2147483647", kNoSuchVar);
+    fake.endWith("zVAR_ -1", kBadVarNum);
   }
   ~LargeNumbersTest() override { ::ambrix::setByteLimit(SIZE_MAX); }
   void moveAndCompare(std::size_t argument, std::size_t at, double distance);
@@ -94,7 +96,9 @@ TEST_F(KindsOfNumbersTest, EachKindOfNumberIsReplacedByOneOfItsKind) {
   const std::pair<CommandCase, const char*> replaced[] = {
       {{"getVarName", {file(), kFar + 3}, {}},
        "SELECT_ CDF_ 7 | zVAR_ 2147483647 | GET_ zVAR_NAME_"},
+      {{"getVarName", {file(), -kFar}, {}}, "SELECT_ CDF_ 7 | zVAR_ -1 | GET_ zVAR_NAME_"},
       {{"getAttrName", {file(), kFar}, {}}, "SELECT_ CDF_ 7 | ATTR_ 2147483647 | GET_ ATTR_NAME_"},
+      {{"getAttrName", {file(), -kFar}, {}}, "SELECT_ CDF_ 7 | ATTR_ -1 | GET_ ATTR_NAME_"},
       {{"deleteAttrEntry", {file(), 2, kFar}, {}}, "CDFdeleteAttrEntry 7 3 2 -1"},
       {{"setFormat", {file(), kFar + 1}, {}}, "SELECT_ CDF_ 7 | PUT_ CDF_FORMAT_ -1"},
       {{"createAttr", {file(), "a", kFar + 1}, {}}, "SELECT_ CDF_ 7 | CREATE_ ATTR_ 'a' -1"},
