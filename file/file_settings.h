@@ -66,6 +66,7 @@ inline constexpr FileNumber kGetStageCacheSize       {CONFIRM_, STAGE_CACHESIZE_
 inline constexpr FileNumber kGetCompressionCacheSize {CONFIRM_, COMPRESS_CACHESIZE_, "CDFgetCompressionCacheSize"};
 
 // "setFormat" labels its argument like a cache size: users know it under that label.
+// What is too large for the library must not become -1 in "setReadOnlyMode", where that means on.
 inline constexpr FileSetting kSetFormat               {PUT_,    CDF_FORMAT_,         "CDFsetFormat",               "NUMBUFFERS", kBadNumber};
 inline constexpr FileSetting kSetChecksum             {PUT_,    CDF_CHECKSUM_,       "CDFsetChecksum",             "MODE",       kBadNumber};
 inline constexpr FileSetting kSetMajority             {PUT_,    CDF_MAJORITY_,       "CDFsetMajority",             "MAJORITY",   kBadNumber};
