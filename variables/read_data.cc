@@ -52,6 +52,7 @@ void getVarData(int, qvArray* outputs[], std::int32_t argumentCount, const qvArr
   DimensionVector libraryIndices = libraryVector(indices, kBadNumber);
   writeWaitingRecords(file, number, routine);
   outputs[0] = readValues(variable, dimensions, request, [&](void* buffer) {
+    requireCountableRecord(variable, record, routine);
     callOnVariable(routine, file, number,                               //
                    zVAR_RECNUMBER_, libraryNumber(record, kBadNumber),  //
                    zVAR_DIMINDICES_, libraryIndices.data(),             //
@@ -74,6 +75,7 @@ void getVarRecordData(int, qvArray* outputs[], std::int32_t, const qvArray* argu
   writeWaitingRecords(file, number, routine);
   outputs[0] = readValues(variable, dimensions, request, [&](void* buffer) {
     requireRecordNumber(record, routine);
+    requireCountableRecord(variable, record, routine);
     checkLibraryStatus(
         CDFgetVarRecordData(libraryHandle(file, routine), kZVariables, number, record, buffer),
         routine);
@@ -103,6 +105,7 @@ void hyperGetVarData(int, qvArray* outputs[], std::int32_t, const qvArray* argum
   skipNoRecordsThatDoNotVary(variable, librarySlab);
   writeWaitingRecords(file, number, routine);
   outputs[0] = readValues(variable, dimensions, request, [&](void* buffer) {
+    requireCountableRecord(variable, librarySlab.lastRecord(), routine);
     moveHyperslab(routine, file, number, librarySlab, GET_, buffer);
   });
 }

@@ -43,9 +43,9 @@ VariableDescription inquireVariable(CdfId file, long variable,
 /// not see: they would abort all access to the file, or leave a file that cannot be opened.
 void requireRecordNumber(long record, const char* routine);
 
-/// The library counts records in 32 bits: refuses, as its bad record number, to write the one
-/// record whose number has a place there and whose count has none. Where records do not vary it is
-/// not so.
+/// The library counts records in 32 bits: refuses, as its bad record number, to read or write the
+/// one record whose number has a place there and whose count has none. Where records do not vary it
+/// is not so.
 void requireCountableRecord(const VariableDescription& variable, long record, const char* routine);
 
 /// Refuses, as the library's bad number of elements, values of no elements.

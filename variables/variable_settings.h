@@ -93,8 +93,7 @@ void setVarCacheSize(int, qvArray*[], std::int32_t, const qvArray* arguments[],
                      const CommandEntry*);
 
 /// "setVarAllocBlockRecords" (identifier, variable, first record, last record). Raises
-/// `libraryFailure`
-/// ("CDFsetzVarAllocBlockRecords").
+/// `libraryFailure` ("CDFsetzVarAllocBlockRecords").
 void setVarAllocBlockRecords(int, qvArray*[], std::int32_t, const qvArray* arguments[],
                              const CommandEntry*);
 

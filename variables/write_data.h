@@ -11,9 +11,8 @@ namespace TOLVEX::ambrix {
 
 /// "putVarData" (identifier, variable, record, indices, data): one value; of a text its first
 /// character only. Raises `badDimensionExtent`, `wrongNumberOfPutVarDataElements`,
-/// `unrecognizedValue`
-/// ("DATATYPE"), `datatypeMismatch`, `libraryFailure` ("CDFinquirezVar", "CDFgetMajority",
-/// "CDFputzVarData").
+/// `unrecognizedValue` ("DATATYPE"), `datatypeMismatch`, `libraryFailure` ("CDFinquirezVar",
+/// "CDFgetMajority", "CDFputzVarData").
 void putVarData(int, qvArray*[], std::int32_t, const qvArray* arguments[], const CommandEntry*);
 
 /// "putVarRecordData" (identifier, variable, record, data): one record. Raises
@@ -24,9 +23,8 @@ void putVarRecordData(int, qvArray*[], std::int32_t, const qvArray* arguments[],
 
 /// "hyperPutVarData" (identifier, variable, record start, count and interval, start, count and
 /// interval of each dimension, data). Raises `wrongNumberOfHyperPutVarDataElements`,
-/// `unrecognizedValue`
-/// ("DATATYPE"), `datatypeMismatch`, `libraryFailure` ("CDFinquirezVar", "CDFgetMajority",
-/// "CDFhyperPutzVarData").
+/// `unrecognizedValue` ("DATATYPE"), `datatypeMismatch`, `libraryFailure` ("CDFinquirezVar",
+/// "CDFgetMajority", "CDFhyperPutzVarData").
 void hyperPutVarData(int, qvArray*[], std::int32_t, const qvArray* arguments[],
                      const CommandEntry*);
 
