@@ -39,7 +39,7 @@ void appendElement(std::string& json, T value) {
   } else if (!std::isfinite(value)) {
     json += std::isnan(value) ? "\"NaN\"" : value > 0 ? "\"Inf\"" : "\"-Inf\"";
   } else {
-    appendDigits(json, value);
+    appendDigits(json, static_cast<double>(value));  // what readers that know only doubles expect
     if (value == 0 && std::signbit(value)) json += ".0";  // many readers take -0 for 0
   }
 }

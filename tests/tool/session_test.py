@@ -205,6 +205,7 @@ class ValueTest(SessionCase):
                    for x in (0.1, -0.0, 1e-45, 3.4028234e38, 16777217, 1 / 3)]
         result = self.echo(array("single", singles), "CDF_FLOAT").data
         self.assertEqual(struct.pack("6f", *result), struct.pack("6f", *singles))
+        self.assertEqual(result, singles)  # as doubles, too
 
     def test_numbers_that_are_not_finite(self):
         values = [math.nan, math.inf, -math.inf]
