@@ -26,7 +26,7 @@ def arguments():
     parser.add_argument("--quick", action="store_true",
                         help="a hundredth of the work, one round: to see that everything runs")
     parser.add_argument("--only", metavar="NAME", action="append",
-                        help="only workloads whose name contains this; may be given several times")
+                        help="only what has this in its name; may be given several times")
     parser.add_argument("--peers", action="store_true",
                         help="compare with SpacePy, pycdfpp and cdflib, where this Python has them")
     parser.add_argument("--rounds", type=int, help="rounds in each sitting (default 5)")
@@ -44,7 +44,7 @@ def working_folder():
 
 
 def chosen(names, only):
-    return [name for name in names if not only or any(part in name for part in only)]
+    return not only or any(part in name for part in only for name in names)
 
 
 def all_columns(options, folder, divisor):
@@ -79,7 +79,7 @@ def run(options, folder):
     found[0].run("prepare")
     results, settings = {}, {}
     for workload in WORKLOADS:
-        if not chosen([workload.name], options.only):
+        if not chosen([workload.name, workload.title], options.only):
             continue
         print(f"  {workload.name}", end="", file=sys.stderr, flush=True)
         facts = measure.measure(workload.name, found, rounds, sittings)
@@ -87,7 +87,7 @@ def run(options, folder):
             column["calls"] = (workload.calls or 1) // divisor or 1
         results[workload.name] = facts
     for setting in SETTINGS:
-        if chosen([setting.before, setting.after], options.only):
+        if chosen([setting.before, setting.after, setting.title], options.only):
             print(f"  {setting.after}", end="", file=sys.stderr, flush=True)
             settings[setting.title] = measure.measure_setting(setting, found[1], rounds)
     print(file=sys.stderr)
@@ -101,6 +101,9 @@ def main():
         results = run(options, folder)
     tables = {"workloads": report.main_rows(WORKLOADS, results["workloads"], not options.quick),
               "settings": report.setting_rows(SETTINGS, results["settings"])}
+    if all(len(rows) == 1 for rows in tables.values()):
+        sys.exit("no workload has that in its name: " +
+                 ", ".join(workload.name for workload in WORKLOADS))
     for rows in tables.values():
         if len(rows) > 1:
             print(report.terminal(rows), end="\n\n")
