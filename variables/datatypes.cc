@@ -2,7 +2,7 @@
 
 #include <cdf.h>
 
-#include <algorithm>
+#include <array>
 #include <boost/assign/list_of.hpp>
 #include <cstddef>
 #include <cstring>
@@ -34,10 +34,17 @@ constexpr Datatype kDatatypes[] = {
 };
 static_assert(std::size(kDatatypes) == 15);
 
-constexpr const Datatype* findDatatype(long code) {
-  const auto* found = std::find_if(std::begin(kDatatypes), std::end(kDatatypes),
-                                   [code](const Datatype& row) { return row.code == code; });
-  return found == std::end(kDatatypes) ? nullptr : found;
+/// The row of each code, or null.
+constexpr auto kRowOfCode = [] {
+  std::array<const Datatype*, 64> rows{};
+  for (const Datatype& row : kDatatypes)
+    rows[static_cast<std::size_t>(row.code)] = &row;
+  return rows;
+}();
+
+const Datatype* findDatatype(long code) {
+  const auto index = static_cast<std::size_t>(code);  // a negative code becomes a large one
+  return index < kRowOfCode.size() ? kRowOfCode[index] : nullptr;
 }
 
 [[noreturn]] void raiseUnrecognized(long code) {

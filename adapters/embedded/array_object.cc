@@ -22,43 +22,42 @@ constexpr std::size_t kAlignment = alignof(std::max_align_t);
 struct Shape {
   std::span<const std::size_t> sizes;  // without trailing 1s; may be fewer than two
   std::size_t dimensionCount = 0;
-  std::size_t elementCount = 1;
+  std::size_t elementCount = 0;
   std::size_t bytes = 0;
 };
 
-std::size_t multiply(std::size_t a, std::size_t b) {
-  std::size_t product = 0;
-  if (__builtin_mul_overflow(a, b, &product)) raiseOutOfMemory();
-  return product;
-}
-
+/// The number of elements; 0 as soon as one size is, however large the others are.
 std::size_t countElements(std::span<const std::size_t> sizes) {
-  if (sizes.empty() || std::ranges::find(sizes, 0U) != sizes.end()) return 0;
-  std::size_t count = 1;
-  for (const std::size_t size : sizes)
-    count = multiply(count, size);
-  return count;
+  std::size_t count = sizes.empty() ? 0 : 1;
+  bool tooMany = false;
+  for (const std::size_t size : sizes) {
+    if (size > PTRDIFF_MAX) raiseBadDimension();
+    tooMany |= __builtin_mul_overflow(count, size, &count);
+  }
+  if (tooMany && std::ranges::find(sizes, 0U) == sizes.end()) raiseOutOfMemory();
+  return tooMany ? 0 : count;
 }
 
 Shape shapeOf(qvClassID classId, std::span<const std::size_t> sizes) {
-  if (std::ranges::any_of(sizes, [](std::size_t size) { return size > PTRDIFF_MAX; })) {
-    raiseBadDimension();
-  }
   Shape shape;
+  shape.elementCount = countElements(sizes);
+  if (__builtin_mul_overflow(shape.elementCount, elementBytes(classId), &shape.bytes)) {
+    raiseOutOfMemory();
+  }
+  requireWithinLimit(shape.bytes);
   while (sizes.size() > 2 && sizes.back() == 1)
     sizes = sizes.first(sizes.size() - 1);
   shape.sizes = sizes;
   shape.dimensionCount = std::max<std::size_t>(sizes.size(), 2);
-  shape.elementCount = countElements(sizes);
-  shape.bytes = multiply(shape.elementCount, elementBytes(classId));
-  requireWithinLimit(shape.bytes);
   return shape;
 }
 
 /// Sizes that are not given are 1, but no sizes at all make 0-by-0.
 void storeSizes(qvArray& array, const Shape& shape) {
-  std::fill_n(array.sizes(), shape.dimensionCount, shape.sizes.empty() ? 0U : 1U);
-  std::ranges::copy(shape.sizes, array.sizes());
+  const std::size_t missing = shape.sizes.empty() ? 0 : 1;
+  std::size_t* const sizes = array.sizes();
+  for (std::size_t i = 0; i < shape.dimensionCount; ++i)
+    sizes[i] = i < shape.sizes.size() ? shape.sizes[i] : missing;
 }
 
 std::size_t roundUp(std::size_t bytes) {
