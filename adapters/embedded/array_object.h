@@ -5,7 +5,7 @@
 #include <span>
 #include <string_view>
 
-#include "adapters/embedded/exported_interface.h"
+#include "adapters/common/array_functions.h"
 #include "adapters/embedded/tracked_list.h"
 
 /// One block of memory: this, the sizes and, when they are few, the elements. Many elements have
@@ -32,8 +32,6 @@ namespace ambrix {
 
 /// Bytes of an element; 0 for a class that arrays cannot have.
 std::size_t elementBytes(qvClassID classId) noexcept;
-
-enum class Content { kZero, kUnset };
 
 /// A new array that is on no list and belongs to the caller. Cells are always unset. Raises the
 /// host's errors; throws std::logic_error for a class that arrays cannot have.

@@ -3,7 +3,7 @@
 #include <mutex>
 
 #include "adapters/catalogue/message_catalogue.h"
-#include "adapters/embedded/exported_interface.h"
+#include "adapters/common/exported_interface.h"
 #include "adapters/embedded/host_errors.h"
 
 namespace ambrix {

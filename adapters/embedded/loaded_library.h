@@ -4,7 +4,7 @@
 #include <filesystem>
 #include <memory>
 
-#include "adapters/embedded/exported_interface.h"
+#include "adapters/common/exported_interface.h"
 
 namespace ambrix {
 

@@ -6,7 +6,7 @@
 #include <string_view>
 
 #include "adapters/catalogue/unicode.h"
-#include "adapters/embedded/exported_interface.h"
+#include "adapters/common/exported_interface.h"
 #include "adapters/embedded/scratch.h"
 
 void* qvMalloc(std::size_t bytes) {

@@ -11,6 +11,7 @@
 #include "adapters/octave/fresh_array.h"
 #include "adapters/octave/host_errors.h"
 
+using ambrix::Content;
 using namespace ambrix::octave_host;
 
 namespace {

@@ -11,7 +11,7 @@
 #include <variant>
 #include <vector>
 
-#include "host/qv.h"
+#include "adapters/common/array_functions.h"
 
 namespace ambrix::octave_host {
 
@@ -25,8 +25,6 @@ using Elements =
                  uint8NDArray, int16NDArray, uint16NDArray, int32NDArray, uint32NDArray,
                  int64NDArray, uint64NDArray, boolNDArray, Characters, Cells>;
 
-enum class Content { kZero, kUnset };
-
 }  // namespace ambrix::octave_host
 
 /// Either an argument, whose elements are taken out when they are first asked for, since getting at
@@ -36,8 +34,7 @@ struct qvArray {
   explicit qvArray(const octave_value& argument);
   /// A result. Raises the host's errors; throws std::logic_error for a class that results cannot
   /// have.
-  qvArray(qvClassID classId, std::span<const std::size_t> sizes,
-          ambrix::octave_host::Content content);
+  qvArray(qvClassID classId, std::span<const std::size_t> sizes, ambrix::Content content);
 
   [[nodiscard]] qvClassID classId() const { return classId_; }
   [[nodiscard]] const char* className() const;
@@ -58,11 +55,11 @@ struct qvArray {
   void takeOut() const;
   void widenArgument() const;
   void takeOutCells() const;
-  void create(const dim_vector& dims, ambrix::octave_host::Content content);
+  void create(const dim_vector& dims, ambrix::Content content);
   template <typename OctaveArray>
   void hold(const OctaveArray& array) const;
   template <typename OctaveArray>
-  void make(const dim_vector& dims, ambrix::octave_host::Content content);
+  void make(const dim_vector& dims, ambrix::Content content);
 
   qvClassID classId_;
   octave_value argument_;  // undefined in a result

@@ -1,5 +1,5 @@
-// The interface that the module calls, as this library exports it. Include this in place of
-// "host/qvh.h": symbols are hidden here unless declared otherwise.
+// The interface that the module calls, as a host's library exports it. Include this in place of
+// "host/qvh.h": a host's symbols are hidden unless declared otherwise.
 #pragma once
 
 #include <cstddef>
