@@ -12,6 +12,7 @@ import tempfile
 
 import columns
 import measure
+import plot
 import report
 from workloads import SETTINGS, WORKLOADS
 
@@ -32,9 +33,14 @@ def arguments():
     parser.add_argument("--rounds", type=int, help="rounds in each sitting (default 5)")
     parser.add_argument("--sittings", type=int, help="times that programs start anew (default 3)")
     parser.add_argument("--json", type=pathlib.Path, help="where the results go as JSON")
+    parser.add_argument("--plot", metavar="FILE.svg", type=pathlib.Path,
+                        help="draw the ratios, where gnuplot is installed")
     parser.add_argument("--document", action="store_true",
-                        help="put the tables into docs/performance.md")
-    return parser.parse_args()
+                        help="put the tables and the picture into docs/performance.md")
+    options = parser.parse_args()
+    if options.document and (options.only or options.quick):
+        parser.error("--document is for all workloads in full")
+    return options
 
 
 def working_folder():
@@ -109,7 +115,10 @@ def main():
             print(report.terminal(rows), end="\n\n")
     if options.json:
         options.json.write_text(json.dumps(results, indent=1) + "\n")
+    if options.plot:
+        plot.draw(WORKLOADS, results["workloads"], options.plot)
     if options.document:
+        plot.draw(WORKLOADS, results["workloads"], ROOT / "docs" / "performance.svg")
         parts = {name: report.markdown(rows) for name, rows in tables.items()}
         parts["workloads"] += "\n\n" + report.machine_text(results["machine"])
         report.put_into(ROOT / "docs" / "performance.md", parts)

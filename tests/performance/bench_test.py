@@ -3,6 +3,7 @@ file say so. Times are not looked at."""
 
 import json
 import pathlib
+import shutil
 import subprocess
 import sys
 import tempfile
@@ -20,12 +21,13 @@ class QuickRun(unittest.TestCase):
     @classmethod
     def setUpClass(cls):
         with tempfile.TemporaryDirectory() as folder:
-            results = pathlib.Path(folder) / "results.json"
+            results, plot = pathlib.Path(folder) / "results.json", pathlib.Path(folder) / "plot.svg"
             run = subprocess.run(
-                [sys.executable, ROOT / "bench" / "bench.py", BUILD, "--quick", "--json", results],
-                capture_output=True, text=True, check=True)
+                [sys.executable, ROOT / "bench" / "bench.py", BUILD, "--quick", "--json", results,
+                 "--plot", plot], capture_output=True, text=True, check=True)
             cls.table = run.stdout
             cls.results = json.loads(results.read_text())
+            cls.plot = plot.read_text() if plot.exists() else None
 
     def test_every_workload_is_measured_in_both_columns(self):
         for workload in workloads.WORKLOADS:
@@ -46,9 +48,31 @@ class QuickRun(unittest.TestCase):
         for setting in workloads.SETTINGS:
             self.assertIn(setting.title, self.table)
 
+    @unittest.skipUnless(shutil.which("gnuplot"), "gnuplot was not found")
+    def test_the_picture_has_a_line_for_each_that_has_a_ratio(self):
+        self.assertTrue(self.plot.rstrip().endswith("</svg>"))
+        for workload in workloads.WORKLOADS:
+            drawn = workload.title.replace('"', "") in self.plot
+            self.assertEqual(drawn, "ratio" in self.results["workloads"][workload.name]["module"],
+                             workload.title)
+
     def test_the_results_tell_the_machine(self):
         self.assertTrue(self.results["machine"]["processor"])
         self.assertTrue(self.results["quick"])
+
+
+class Choosing(unittest.TestCase):
+    def failure_of(self, *options):
+        run = subprocess.run([sys.executable, ROOT / "bench" / "bench.py", BUILD, "--quick", *options],
+                             capture_output=True, text=True, check=False)
+        self.assertNotEqual(run.returncode, 0)
+        return run.stderr
+
+    def test_a_name_that_no_workload_has_is_an_error_that_lists_them(self):
+        self.assertIn("read_gzip", self.failure_of("--only", "everything"))
+
+    def test_the_document_is_for_complete_results(self):
+        self.assertIn("all workloads", self.failure_of("--document", "--only", "read"))
 
 
 class Arithmetic(unittest.TestCase):
