@@ -17,7 +17,7 @@ struct Numbers {
 
 const Numbers kNumbers[] = {
     {'e', {0, 1, 2, 3}},               // entry
-    {'r', {0, 1, 2, 3, 4, 5, 9, 17}},  // record
+    {'r', {0, 1, 2, 3, 4, 5, 9, 17, 2147483647}},  // record; the last has no place in a count
     {'t', {1, 2}},                     // record interval
     {'g', {1, 2}},                     // scope or majority
     {'F', {1, 1, 1, 2}},               // format

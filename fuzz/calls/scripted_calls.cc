@@ -24,7 +24,10 @@ constexpr std::size_t kLongestName = 256;
 constexpr std::size_t kLongestPath = 512;
 constexpr std::size_t kLongestStatusText = 200;
 
-constexpr long kNoVariable = 2147483647;  // no file has as many
+/// No file has as many variables as 32 bits can number.
+bool numbersNoVariable(long number) {
+  return number < 0 || number == 2147483647;
+}
 
 /// The hyperslab that a list has selected.
 struct Selection {
@@ -95,7 +98,7 @@ class ArgumentList {
     const long number = va_arg(list_, long);
     if (item != "CDF_STATUS_") requireFitting(number);
     lastNumber_ = number;
-    if (item == "zVAR_" && number == kNoVariable) refused_ = true;
+    if (item == "zVAR_" && numbersNoVariable(number)) refused_ = true;
     if (item == "zVAR_RECCOUNT_") slab_.recordCount = number;
     if (item == "zVAR_RECINTERVAL_") slab_.recordInterval = number;
   }
