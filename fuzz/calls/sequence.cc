@@ -23,9 +23,9 @@ namespace {
 constexpr std::size_t kByteLimit = 1 << 24;
 
 /// What most sequences begin with, so that there is something to work on.
-constexpr const char* kBeginnings[] = {
-    "create",     "setFormat", "setMajority",      "createVar", "setVarSparseRecords",
-    "createAttr", "createVar", "setVarCompression"};
+constexpr const char* kBeginnings[] = {"create",    "setFormat",           "setMajority",
+                                       "createVar", "setVarSparseRecords", "createAttr",
+                                       "createVar", "setVarCompression"};
 /// What a world needs more of than of others.
 constexpr const char* kFrequent[] = {
     "create",
