@@ -16,16 +16,16 @@ struct Numbers {
 };
 
 const Numbers kNumbers[] = {
-    {'e', {0, 1, 2, 3}},               // entry
+    {'e', {0, 1, 2, 3}},                           // entry
     {'r', {0, 1, 2, 3, 4, 5, 9, 17, 2147483647}},  // record; the last has no place in a count
-    {'t', {1, 2}},                     // record interval
-    {'g', {1, 2}},                     // scope or majority
-    {'F', {1, 1, 1, 2}},               // format
-    {'b', {0, 1, 2, 5, 16, 100}},      // how many or how much
-    {'C', {0, 1, 0, 1, 2}},            // checksum
-    {'O', {0, -1}},                    // read-only, validation
-    {'B', {0, 0, 0, 1}},               // backward files
-    {'s', {0, 1, 2}},                  // sparse records
+    {'t', {1, 2}},                                 // record interval
+    {'g', {1, 2}},                                 // scope or majority
+    {'F', {1, 1, 1, 2}},                           // format
+    {'b', {0, 1, 2, 5, 16, 100}},                  // how many or how much
+    {'C', {0, 1, 0, 1, 2}},                        // checksum
+    {'O', {0, -1}},                                // read-only, validation
+    {'B', {0, 0, 0, 1}},                           // backward files
+    {'s', {0, 1, 2}},                              // sparse records
 };
 
 constexpr const char* kFileNames[] = {"f0", "f1", "f2", "f3.cdf", "long-name-of-a-file"};
