@@ -104,8 +104,9 @@ void addConvert(CLI::App& app, Arguments& arguments) {
       ->check(requireName);
   convert
       .add_option("--compression", options.compression,
-                  "Compress the file as a whole: none, rle, huff, ahuff or gzip, which may have a "
-                  "level from 1 to 9 (6 if left out); variables keep their own compression")
+                  "Compress the file as a whole: none, rle, huff, ahuff or gzip, which may\n"
+                  "have a level from 1 to 9 (6 if left out); variables keep their own\n"
+                  "compression")
       ->type_name("TYPE[:LEVEL]");
   convert.add_option("--majority", options.majority, "row or column")
       ->type_name("MAJORITY")
@@ -131,7 +132,7 @@ void addSession(CLI::App& app, Arguments& arguments) {
   CLI::App& session = addCommand(app, kSessionHelp);
   session
       .add_option("--max-array-bytes", arguments.maxArrayBytes,
-                  "The most bytes that one array or scratch buffer may take (default: 4 GiB)")
+                  "The most bytes one array or scratch buffer may take (default: 4 GiB)")
       ->type_name("N");
 }
 

@@ -32,14 +32,21 @@ double findVariable(CdfFile& file, const std::string& name) {
   if (number && static_cast<double>(*number) < countVariables(file)) {
     return static_cast<double>(*number);
   }
-  throw ToolError("noSuchVariable", "there is no variable \"" + printable(name) + "\"");
+  throw ToolError("noSuchVariable", "there is no variable \"" + printable(name) +
+                                        "\"; 'ambrix info' lists those there are");
 }
 
 std::size_t parseBound(std::string_view text, std::size_t whenLeftOut) {
   if (text.empty()) return whenLeftOut;
   const auto number = parseCount(text);
-  if (!number) throw UsageError("--records: expected A:B, two record numbers");
+  if (!number) throw UsageError("--records: expected record numbers, as A:B, A:, :B or A");
   return *number;
+}
+
+std::string missingRecord(std::size_t records) {
+  if (records == 0) return "the variable has no records";
+  if (records == 1) return "the variable has only record 0";
+  return fmt::format("the variable has records 0 to {}", records - 1);
 }
 
 /// "A:B" from A to B, both included; either may be left out. "A" is one record.
@@ -53,7 +60,7 @@ RecordRange parseRange(const std::string& text, std::size_t records) {
       single ? first : parseBound(last, std::numeric_limits<std::size_t>::max());
   if (lastRecord < first) throw UsageError("--records: the range ends before it begins");
   if (first >= records) {
-    throw ToolError("noSuchRecord", fmt::format("the variable has {} records", records));
+    throw ToolError("noSuchRecord", missingRecord(records));
   }
   return {first, lastRecord < records ? lastRecord + 1 : records};
 }
@@ -97,8 +104,11 @@ std::unique_ptr<DumpFormat> makeFormat(const DumpOptions& options, const Variabl
   return makeTableFormat(variable, range, terminal);
 }
 
-void requireSupported(CdfFile& file, const Variable& variable) {
-  if (!variable.supported) file.call("inquireVar", {variable.number});  // raises what is wrong
+void requireSupported(const Variable& variable) {
+  if (variable.supported) return;
+  throw ToolError("unsupportedDatatype",
+                  fmt::format("variable \"{}\" has the datatype {}, which is not supported",
+                              printable(variable.name), variable.datatype));
 }
 
 }  // namespace
@@ -107,7 +117,7 @@ void runDump(Module& module, const DumpOptions& options, StandardOutput& output)
   CdfFile file = CdfFile::open(module, options.file);
   file.setReadOnly();
   const Variable variable = inquireVariable(file, findVariable(file, options.variable));
-  requireSupported(file, variable);
+  requireSupported(variable);
   const RecordRange range = parseRange(options.records, countRecords(file, variable));
   const auto format = makeFormat(options, variable, range, output.isTerminal());
   SlabPlan plan(variable, range.first, range.end);

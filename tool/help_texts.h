@@ -29,11 +29,11 @@ inline constexpr HelpText kInfoHelp = {
     "A variable of a datatype that is not supported is listed as far as it is known.\n",
     "  ambrix info data.cdf\n"
     "  ambrix info --attributes data.cdf\n"
-    "  ambrix info --json data.cdf | jq .variables[].name\n"};
+    "  ambrix info --json data.cdf | jq '.variables[].name'\n"};
 
 inline constexpr HelpText kDumpHelp = {
     "dump", "FILE VARIABLE [OPTION...]",
-    "Prints the values of a variable, which is given by its name or its number",
+    "Prints the values of a variable, given by its name or its number",
     "Record numbers and indices begin at 0, and the first index varies fastest. Epochs are "
     "printed\n"
     "as times; those that are no times, fill values for example, as numbers. In JSON, the data "
@@ -55,13 +55,14 @@ inline constexpr HelpText kCheckHelp = {
     "is no damage. The exit status is 0 only if all files are sound.\n",
     "  ambrix check data.cdf\n"
     "  ambrix check --quiet archive/*.cdf\n"
-    "  ambrix check --json data.cdf | jq .[].problems\n"};
+    "  ambrix check --json data.cdf | jq '.[].problems'\n"};
 
 inline constexpr HelpText kCallHelp = {
     "call", "[--file FILE] COMMAND [ARGUMENT...]",
     "Calls one command of the module and prints each result as a line of JSON",
     "Arguments are JSON: numbers, true, false, null, lists of numbers or logicals, and arrays as\n"
-    "{\"class\":..., \"size\":[...], \"data\":[...]}. Whatever is not JSON is a text.\n",
+    "{\"class\":..., \"size\":[...], \"data\":[...]}. Whatever is not JSON is a text.\n"
+    "docs/commands.md describes the commands; \"getConstantNames\" lists the constants.\n",
     "  ambrix call getLibraryVersion\n"
     "  ambrix call getConstantValue GZIP_COMPRESSION\n"
     "  ambrix call --file data.cdf getVarName 0\n"
@@ -76,6 +77,8 @@ inline constexpr HelpText kSessionHelp = {
 
 inline constexpr HelpText kConvertHelp = {
     "convert", "IN OUT [OPTION...]", "Writes a copy of a file with other settings",
+    "What no option names stays as it is. But the encoding becomes that of this computer, and a\n"
+    "file in several parts becomes one.\n"
     "OUT gets the extension .cdf when it has none. An existing file is never overwritten, and\n"
     "nothing is left behind when the conversion fails. Variables and entries of a datatype that "
     "is\n"

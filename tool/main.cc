@@ -1,8 +1,12 @@
 // The command-line tool.
+#include <algorithm>
 #include <cmath>
 #include <cstdio>
 #include <cstdlib>
+#include <optional>
+#include <span>
 #include <sstream>
+#include <string_view>
 
 #include "ambrix/embedded.h"
 #include "ambrix_version.h"
@@ -10,6 +14,7 @@
 #include "tool/exit_status.h"
 #include "tool/failure.h"
 #include "tool/man_page.h"
+#include "tool/text.h"
 
 namespace ambrix::tool {
 namespace {
@@ -37,6 +42,17 @@ int run(const CLI::App& parser, const Arguments& arguments, StandardOutput& outp
   return runCommand(parser, arguments, output);
 }
 
+/// What to say when the first word that is no option is no command either.
+std::optional<std::string> misusedCommand(const CLI::App& parser, int count,
+                                          const char* const* words) {
+  if (!parser.get_subcommands().empty()) return std::nullopt;
+  const std::span<const char* const> all(words, static_cast<std::size_t>(count));
+  const auto word = std::ranges::find_if(
+      all.subspan(1), [](std::string_view text) { return !text.starts_with('-'); });
+  if (word == all.end()) return std::nullopt;
+  return "there is no command \"" + printable(*word) + "\"";
+}
+
 /// Parses the command line; help that was asked for is printed, and the tool is done.
 bool parse(CLI::App& parser, int count, const char* const* words, StandardOutput& output) {
   try {
@@ -48,7 +64,7 @@ bool parse(CLI::App& parser, int count, const char* const* words, StandardOutput
     output.write(text.str());
     return false;
   } catch (const CLI::ParseError& error) {
-    throw UsageError(error.what());
+    throw UsageError(misusedCommand(parser, count, words).value_or(error.what()));
   }
 }
 

@@ -38,7 +38,7 @@ std::string arguments(const CLI::App& app) {
     if (option->get_group().empty()) continue;
     const std::string value = option->get_type_name();
     const bool named = option->nonpositional();
-    page += fmt::format(".TP\n.B {}{}\n{}\n", escaped(option->get_name()),
+    page += fmt::format(".TP\n.B {}{}\n{}\n", escaped(option->get_name(false, true)),
                         named && !value.empty() ? " \\fI" + escaped(value) + "\\fR" : "",
                         escaped(option->get_description()));
   }

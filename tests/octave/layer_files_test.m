@@ -89,6 +89,8 @@ function testWhatIsNotSupportedIsNamedInAWarning (folder)
   assert (s.variables.tt2000.supported, false);
   err = ambrix.internal.raised (@() ambrix.read (file, "tt2000"));
   assert (err.identifier, "TOLVEX:ambrix:cdflib:unrecognizedValue");
+  assert (any (strfind (err.message, "\"tt2000\"")));
+  assert (any (strfind (err.message, "the datatype CDF_TIME_TT2000, which is not supported")));
 endfunction
 
 [folder, cleanup] = scratchFolder ();

@@ -63,7 +63,11 @@ class DumpTest(ToolCase):
                                   ("1:", [24, 48]), (":", [0, 24, 48]), ("1:99", [24, 48])):
             self.assertEqual([record[0][0][0] for record in self.data("cube", "--records", records)],
                              expected, records)
-        self.assert_fails("ambrix:noSuchRecord", "dump", "example.cdf", "cube", "--records", "3")
+        for variable, records, message in (("cube", "3", "the variable has records 0 to 2"),
+                                           ("texts", "1", "the variable has only record 0"),
+                                           ("empty", "0", "the variable has no records")):
+            self.assertEqual(self.assert_fails("ambrix:noSuchRecord", "dump", "example.cdf",
+                                               variable, "--records", records), message)
         for records in ("2:1", "x", "1:x", "1:2:3", "1.5"):
             self.assert_misused("dump", "example.cdf", "cube", "--records", records)
 
@@ -88,9 +92,18 @@ class DumpTest(ToolCase):
         self.assertEqual(rows[1 + 2 + 3 * (999 + 1000 * 250)], ["1", "2", "999", "250", "251"])
         self.assertEqual(rows[-1], ["1", "2", "999", "399", "400"])
 
+    def test_datatypes_that_are_not_supported(self):
+        session = self.session()
+        (file,) = session.call("open", "example.cdf")
+        session.call("createVar", file, "fine time", 33, 1, [], True, [])
+        session.call("close", file)
+        self.assertIn("cdf_time_tt2000", self.assert_fails("ambrix:unsupportedDatatype", "dump",
+                                                           "example.cdf", "fine time"))
+
     def test_failures(self):
-        self.assertIn("nonsense", self.assert_fails("ambrix:noSuchVariable", "dump", "example.cdf",
-                                                    "nonsense"))
+        message = self.assert_fails("ambrix:noSuchVariable", "dump", "example.cdf", "nonsense")
+        self.assertIn('"nonsense"', message)
+        self.assertIn("'ambrix info'", message)
         self.assert_fails("ambrix:noSuchVariable", "dump", "example.cdf", "99")
         self.assert_fails("TOLVEX:ambrix:cdflib:fileOpenError", "dump", "missing.cdf", "v")
         self.assert_misused("dump", "example.cdf")

@@ -33,6 +33,13 @@ class HelpTest(ToolCase):
         for arguments in ((), ("nonsense",), ("--nonsense",), ("session", "--max-array-bytes"),
                           ("session", "--max-array-bytes", "x"), ("session", "more")):
             self.assert_misused(*arguments)
+        for arguments in (("nonsense",), ("nonsense", "--json")):
+            self.assertIn('there is no command "nonsense"', self.assert_misused(*arguments))
+
+    def test_help_fits_a_terminal(self):
+        for command in ("", *COMMANDS):
+            for line in self.output(*command.split(), "--help").splitlines():
+                self.assertLessEqual(len(line), 100, line)
 
     def test_library_settings_of_the_environment_do_not_count(self):
         environment = dict(os.environ, CDF_VALIDATE="no")
@@ -57,7 +64,7 @@ class ManualTest(ToolCase):
             self.assertRegex(page, rf'\n\.SH "?{section}"?\n')
         for command in COMMANDS:
             self.assertIn(f"\n.SS ambrix {command} ", page)
-            for option in re.findall(r"--[a-z-]+", self.output(command, "--help")):
+            for option in re.findall(r"-h|--[a-z-]+", self.output(command, "--help")):
                 self.assertIn(option, page)
 
 

@@ -86,7 +86,7 @@ function data = readOne (id, name, options)
   number = numberOf (id, name);
   v = ambrix.internal.describeVariable (id, number, rowMajor);
   if (! v.supported)
-    __ambrix__ ("inquireVar", id, number);  # raises the error that tells
+    refuse (id, name, v);
   endif
   fill = [];
   if (options.fill)
@@ -102,6 +102,17 @@ function number = numberOf (id, name)
   catch err
     error (err.identifier, "ambrix.read: there is no variable \"%s\" in \"%s\"; %s",
            name, __ambrix__ ("getName", id), err.message);
+  end_try_catch
+endfunction
+
+## The error of the command names a number of a datatype only.
+function refuse (id, name, v)
+  try
+    __ambrix__ ("inquireVar", id, v.number);
+  catch err
+    error (err.identifier,
+           "ambrix.read: variable \"%s\" in \"%s\" has the datatype %s, which is not supported",
+           name, __ambrix__ ("getName", id), v.datatype);
   end_try_catch
 endfunction
 
