@@ -29,7 +29,20 @@ configure() {
   local preset=$1
   shift
   configuredHere "$preset" || rm -rf "$root/build/$preset"/CMake{Cache.txt,Files}
-  cmake -S "$root" --preset "$preset" "$@"
+  cmake -S "$root" --preset "$preset" "$@" &&
+    namedLibrary >"$root/build/$preset/named-library"
+}
+
+# The CDF library that the environment names, or nothing.
+namedLibrary() {
+  printf '%s' "${CDF_ROOT:-${CDF_BASE:-${CDF_INC:+${CDF_LIB:+$CDF_INC $CDF_LIB}}}}"
+}
+
+# Whether the preset was configured with the library that the environment names, if it names one.
+configuredWithLibrary() {
+  local name
+  name=$(namedLibrary)
+  [[ -z $name || $name == "$(cat "$root/build/$1/named-library" 2>/dev/null)" ]]
 }
 
 # Whether the preset was configured for this folder, and not before the tree was moved here.
@@ -37,11 +50,13 @@ configuredHere() {
   grep -Fxqs "CMAKE_HOME_DIRECTORY:INTERNAL=$root" "$root/build/$1/CMakeCache.txt"
 }
 
-# configured PRESET [NAME=VALUE...]: whether the preset is configured, with these settings.
+# configured PRESET [NAME=VALUE...]: whether the preset is configured, with these settings and the
+# CDF library that the environment names.
 configured() {
   local cache=$root/build/$1/CMakeCache.txt preset=$1 setting
   shift
   [[ -f $root/build/$preset/build.ninja ]] && configuredHere "$preset" || return 1
+  configuredWithLibrary "$preset" || return 1
   for setting in "$@"; do
     grep -q "^${setting%%=*}:[A-Z]*=${setting#*=}\$" "$cache" || return 1
   done
