@@ -19,6 +19,7 @@ FILES = """
     share/man/man1/ambrix.1 share/bash-completion/completions/ambrix
     share/doc/ambrix/LICENSE share/doc/ambrix/NOTICE share/doc/ambrix/CHANGELOG.md
     share/doc/ambrix/docs/embedding.md share/doc/ambrix/docs/commands.md
+    share/doc/ambrix/docs/octave.md share/doc/ambrix/docs/octave-plasma.png
     share/doc/ambrix/examples/CMakeLists.txt share/doc/ambrix/examples/list_variables.cc
     """.split()
 
