@@ -26,6 +26,8 @@ inline constexpr HelpText kInfoHelp = {
     "info", "FILE [--attributes] [--json] [--time-limit SECONDS]",
     "Shows what a file is made of: its settings and its variables",
     "Dimensions are listed as a host's arrays have them: the one that varies fastest comes first.\n"
+    "\"Varies\" tells whether values differ from record to record and, after the slash, along\n"
+    "each dimension. The percentage is what compression leaves of the size.\n"
     "A variable of a datatype that is not supported is listed as far as it is known.\n",
     "  ambrix info data.cdf\n"
     "  ambrix info --attributes data.cdf\n"
