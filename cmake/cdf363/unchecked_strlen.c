@@ -3,8 +3,9 @@
    repair; the C library's function would report it. */
 #include <stddef.h>
 
-__attribute__((no_sanitize_address)) size_t cdf363UncheckedStrlen(const char *text) {
-  const volatile char *end = text; /* volatile: else the compiler calls the C library after all */
-  while (*end != 0) ++end;
+__attribute__((no_sanitize_address)) size_t cdf363UncheckedStrlen(const char* text) {
+  const volatile char* end = text; /* volatile: else the compiler calls the C library after all */
+  while (*end != 0)
+    ++end;
   return (size_t)(end - text);
 }
