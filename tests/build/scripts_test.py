@@ -1,4 +1,6 @@
-"""The scripts configure a build anew when the environment names another CDF library, and only then."""
+"""The scripts configure a build anew when the environment names another CDF library, and only then.
+They install nothing for a purpose that they do not know.
+"""
 import os
 import pathlib
 import shutil
@@ -66,6 +68,20 @@ class LibraryTest(unittest.TestCase):
             self.assertFalse(self.configured(CDF_ROOT="/wrong"))
             self.assertFalse(self.configure(CDF_ROOT="/wrong"))
         self.assertTrue(self.configured())
+
+
+class BootstrapTest(unittest.TestCase):
+    def test_an_unknown_purpose_installs_nothing(self):
+        with tempfile.TemporaryDirectory() as folder:
+            for name in ("apt-get", "dpkg-query", "sudo"):
+                program = pathlib.Path(folder) / name
+                program.write_text(f"#!/bin/sh\ntouch '{folder}/called'\n")
+                program.chmod(0o755)
+            done = subprocess.run([ROOT / "script" / "bootstrap", "nonsense"], capture_output=True,
+                                  env=os.environ | {"PATH": f"{folder}:{os.environ['PATH']}"})
+            self.assertEqual(done.returncode, 1)
+            self.assertIn(b"unknown purpose 'nonsense'", done.stderr)
+            self.assertFalse((pathlib.Path(folder) / "called").exists())
 
 
 if __name__ == "__main__":
