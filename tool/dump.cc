@@ -3,6 +3,7 @@
 #include <fmt/format.h>
 
 #include <charconv>
+#include <filesystem>
 #include <limits>
 #include <optional>
 
@@ -97,10 +98,17 @@ void printSlab(const Slab& slab, const std::vector<ValueText>& values, DumpForma
   }
 }
 
+/// "csv" of "x.csv"; empty where there is none.
+std::string endingOf(const std::string& name) {
+  const std::string ending = std::filesystem::path(name).extension();
+  return ending.empty() ? ending : ending.substr(1);
+}
+
 std::unique_ptr<DumpFormat> makeFormat(const DumpOptions& options, const Variable& variable,
                                        const RecordRange& range, bool terminal) {
-  if (options.format == "csv") return makeCsvFormat(variable);
-  if (options.format == "json") return makeJsonFormat(variable, range);
+  const std::string name = options.format.empty() ? endingOf(options.output) : options.format;
+  if (name == "csv") return makeCsvFormat(variable);
+  if (name == "json") return makeJsonFormat(variable, range);
   return makeTableFormat(variable, range, terminal);
 }
 

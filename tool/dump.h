@@ -14,7 +14,7 @@ struct DumpOptions {
   std::string file;
   std::string variable;
   std::string records;
-  std::string format = "table";
+  std::string format;  // empty: what the output's name ends with, or a table
   std::string output;  // empty: standard output
 };
 

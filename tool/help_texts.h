@@ -43,7 +43,7 @@ inline constexpr HelpText kDumpHelp = {
     "nested with the first index innermost.\n",
     "  ambrix dump data.cdf Epoch\n"
     "  ambrix dump data.cdf 3 --records 10:19\n"
-    "  ambrix dump data.cdf B_GSE --format csv --output b_gse.csv\n"};
+    "  ambrix dump data.cdf B_GSE --output b_gse.csv\n"};
 
 inline constexpr HelpText kCheckHelp = {
     "check", "FILE... [--json] [--quiet] [--time-limit SECONDS]",

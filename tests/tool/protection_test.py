@@ -1,6 +1,7 @@
 """What happens to the tool, its output and its users when the process that reads a file fails."""
 
 import errno
+import json
 import itertools
 import os
 import resource
@@ -208,6 +209,19 @@ class OutputTest(ProtectionCase):
                 with open(self.path("out"), "rb") as file:
                     self.assertEqual(file.read(), printed)
                 os.remove(self.path("out"))
+
+    def test_the_format_is_what_the_name_of_the_file_ends_with(self):
+        write_example(self.session(), "example", "ROW_MAJOR")
+        for name, form in (("out.csv", "csv"), ("out.json", "json"), ("out.txt", "table"),
+                           ("out", "table"), ("json", "table")):
+            with self.subTest(name):
+                printed = self.output("dump", "example.cdf", "cube", "--format", form)
+                self.output("dump", "example.cdf", "cube", "--output", name)
+                with open(self.path(name), encoding="utf-8") as file:
+                    self.assertEqual(file.read(), printed)
+        self.output("dump", "example.cdf", "cube", "--format", "json", "--output", "other.csv")
+        with open(self.path("other.csv"), encoding="utf-8") as file:
+            json.load(file)
 
     def test_no_file_is_overwritten(self):
         message = self.assert_fails("ambrix:outputExists", "dump", BUSY, "v", "--output", BUSY)
