@@ -1,7 +1,6 @@
 #include "gateway/file_lifecycle.h"
 
 #include <cdf.h>
-#include <unistd.h>
 
 #include <cstdint>
 #include <string>
@@ -43,13 +42,12 @@ bool freesFile(long deleteStatus) {
          deleteStatus == SCRATCH_DELETE_ERROR;
 }
 
-void closeAll() {
+/// For an end of the module at which nobody can be told of failures.
+void closeSilently(CdfId file) {
   OpenFileRegistry& registry = openFileRegistry();
-  for (const CdfId file : registry.files()) {
-    if (registry.isFreed(file)) continue;
-    CDFlib(SELECT_, CDF_, libraryHandle(file, "CDFcloseCDF"), CLOSE_, CDF_, NULL_);
-    registry.markFreed(file);  // it stays registered, should the host call again
-  }
+  if (registry.isFreed(file)) return;
+  CDFlib(SELECT_, CDF_, libraryHandle(file, "CDFcloseCDF"), CLOSE_, CDF_, NULL_);
+  registry.markFreed(file);  // it stays registered, should the host call again
 }
 
 /// At its end all files are closed, however that comes.
@@ -57,21 +55,24 @@ struct ClosingAll {
   ClosingAll() = default;
   ClosingAll(const ClosingAll&) = delete;
   ClosingAll& operator=(const ClosingAll&) = delete;
-  ~ClosingAll() { closeAll(); }
+  ~ClosingAll() {
+    for (const CdfId file : openFileRegistry().files())
+      closeSilently(file);
+  }
 };
 
 /// For a process that ends without unloading the module: what was written and not closed would be
-/// lost. The children of the process leave the files to it.
+/// lost. Files that a parent has opened are left to it.
 struct ClosingAtExit {
-  ClosingAtExit() : process(getpid()) {}
+  ClosingAtExit() = default;
   ClosingAtExit(const ClosingAtExit&) = delete;
   ClosingAtExit& operator=(const ClosingAtExit&) = delete;
   ~ClosingAtExit() {
-    if (getpid() == process) closeAll();
-    openFileRegistry().clear();
+    OpenFileRegistry& registry = openFileRegistry();
+    for (const CdfId file : registry.files())
+      if (registry.isOfThisProcess(file)) closeSilently(file);
+    registry.clear();
   }
-
-  pid_t process;
 };
 const ClosingAtExit closingAtExit;
 

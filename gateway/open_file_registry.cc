@@ -1,5 +1,7 @@
 #include "gateway/open_file_registry.h"
 
+#include <unistd.h>
+
 #include <cstdint>
 #include <new>
 
@@ -18,19 +20,24 @@ void insertInto(std::vector<CdfId>& files, CdfId file) {
 
 void OpenFileRegistry::reserve() {
   if (open_.size() == open_.capacity()) open_.reserve(2 * open_.size() + 1);
+  openers_.reserve(open_.capacity());
   freed_.reserve(open_.capacity());  // so that a file can be marked at any time
   written_.reserve(open_.capacity());
 }
 
 void OpenFileRegistry::insert(CdfId file) {
+  erase(file);
   reserve();
-  insertInto(open_, file);
-  std::erase(freed_, file);
-  std::erase(written_, file);
+  const auto place = std::ranges::lower_bound(open_, file);
+  openers_.insert(openers_.begin() + (place - open_.begin()), getpid());
+  open_.insert(place, file);
 }
 
 void OpenFileRegistry::erase(CdfId file) {
-  std::erase(open_, file);
+  if (!contains(file)) return;
+  const auto place = std::ranges::lower_bound(open_, file);
+  openers_.erase(openers_.begin() + (place - open_.begin()));
+  open_.erase(place);
   std::erase(freed_, file);
   std::erase(written_, file);
 }
@@ -43,8 +50,14 @@ void OpenFileRegistry::markWritten(CdfId file) {
   if (contains(file)) insertInto(written_, file);
 }
 
+bool OpenFileRegistry::isOfThisProcess(CdfId file) const {
+  const auto place = std::ranges::lower_bound(open_, file);
+  return openers_[static_cast<std::size_t>(place - open_.begin())] == getpid();
+}
+
 void OpenFileRegistry::clear() {
   open_ = std::vector<CdfId>();  // {} would keep the memory
+  openers_ = std::vector<pid_t>();
   freed_ = std::vector<CdfId>();
   written_ = std::vector<CdfId>();
 }

@@ -1,6 +1,8 @@
 // The identifiers of the files that the module has opened or created and not yet closed or deleted.
 #pragma once
 
+#include <sys/types.h>
+
 #include <algorithm>
 #include <cstddef>
 #include <vector>
@@ -37,11 +39,15 @@ class OpenFileRegistry {
     return !written_.empty() && std::ranges::binary_search(written_, file);
   }
 
+  /// Whether it was this process that has registered the file, and not one that it is a child of.
+  [[nodiscard]] bool isOfThisProcess(CdfId file) const;
+
   /// In ascending order.
   [[nodiscard]] const std::vector<CdfId>& files() const { return open_; }
 
  private:
   std::vector<CdfId> open_;
+  std::vector<pid_t> openers_;  // of each in open_
   std::vector<CdfId> freed_;    // a part of open_ that must not reach the library
   std::vector<CdfId> written_;  // a part of open_
 };

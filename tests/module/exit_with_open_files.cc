@@ -1,8 +1,9 @@
 // usage: exit_with_open_files WAY
 //
 // Changes kept.cdf, makes made.cdf, and ends with both open: in the way of a module that goes out
-// of scope ("scope"), of one that is static ("static"), by std::exit ("exit"), or by std::exit
-// after a child has ended so first and the files were written once more ("child").
+// of scope ("scope"), of one that is static ("static"), by std::exit ("exit"), by std::exit after a
+// child has ended so first and the files were written once more ("child"), or by std::exit in a
+// child that has opened them itself ("own").
 #include <ambrix/embedded.h>
 #include <sys/wait.h>
 #include <unistd.h>
@@ -50,6 +51,10 @@ int main(int, char** arguments) {
     return 0;
   }
   Module module;
+  if (way == "own" && fork() != 0) {
+    wait(nullptr);
+    return 0;
+  }
   openAndWrite(module, way == "child");
   if (way != "scope") std::exit(0);
 }

@@ -16,7 +16,7 @@ class ExitTest(ReadersCase):
 
     def test_files_left_open_are_whole(self):
         for way, values in {"scope": [1, 2], "static": [1, 2], "exit": [1, 2],
-                            "child": [1, 2, 3]}.items():
+                            "child": [1, 2, 3], "own": [1, 2]}.items():
             self.make_kept()
             subprocess.run([os.environ["AMBRIX_EXIT_PROGRAM"], way], cwd=self.folder, check=True)
             for path in (Path(self.folder, "kept.cdf"), Path(self.folder, "made.cdf")):

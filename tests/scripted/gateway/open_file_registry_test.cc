@@ -1,6 +1,8 @@
 // Which identifiers are accepted.
 #include "gateway/open_file_registry.h"
 
+#include <cstdlib>
+
 #include "tests/support/failure_of.h"
 
 namespace ambrix_test {
@@ -59,6 +61,15 @@ TEST_F(OpenFileRegistryTest, OnlyRegisteredFilesAreMarkedAsFreed) {
   EXPECT_FALSE(registry.isFreed(kFive));
 }
 
+TEST_F(OpenFileRegistryTest, OnlyRegisteredFilesAreMarkedAsWritten) {
+  OpenFileRegistry registry;
+  registry.markWritten(kFive);
+  registry.insert(kFive);
+  EXPECT_FALSE(registry.isWritten(kFive));
+  registry.markWritten(kFive);
+  EXPECT_TRUE(registry.isWritten(kFive));
+}
+
 TEST_F(OpenFileRegistryTest, AClearedRegistryKnowsNoFile) {
   OpenFileRegistry registry;
   registry.insert(kFive);
@@ -66,6 +77,21 @@ TEST_F(OpenFileRegistryTest, AClearedRegistryKnowsNoFile) {
   registry.clear();
   EXPECT_EQ(registry.size(), 0U);
   EXPECT_FALSE(registry.isFreed(kFive));
+}
+
+TEST_F(OpenFileRegistryTest, FilesBelongToTheProcessThatHasOpenedThem) {
+  OpenFileRegistry registry;
+  for (const CdfId id : {kSix, kHuge})
+    registry.insert(id);
+  EXPECT_TRUE(registry.isOfThisProcess(kSix));
+  EXPECT_EXIT(
+      {
+        registry.insert(kFive);
+        registry.erase(kSix);
+        const bool own = registry.isOfThisProcess(kFive);
+        std::_Exit(own && !registry.isOfThisProcess(kHuge) ? 0 : 1);
+      },
+      testing::ExitedWithCode(0), "");
 }
 
 TEST_F(OpenFileRegistryTest, AnIdentifierIsOneUint64) {
