@@ -51,13 +51,14 @@ int examine(const std::string& path) try {
 }
 
 Verdict check(const std::string& path, double timeLimit) {
-  Verdict verdict{path, {}, {}};
+  Verdict verdict{path, {}, {}, 0};
   if (const int reason = unreadable(path); reason != 0) {
     verdict.problems.push_back({"", "ambrix:unreadable", std::strerror(reason)});
     return verdict;
   }
   const WorkerEnd end = supervise(timeLimit, [&] { return examine(path); });
   takeFindings(end.told, verdict);
+  verdict.unlisted = end.untold;
   if (end.kind != WorkerEnd::Kind::kDone) {
     verdict.problems.push_back({"", "ambrix:" + identifierOf(end), describeEnd(end, timeLimit)});
   }

@@ -1,6 +1,7 @@
 // `ambrix check`: whether files are sound.
 #pragma once
 
+#include <cstddef>
 #include <string>
 #include <string_view>
 #include <vector>
@@ -27,6 +28,7 @@ struct Verdict {
   std::string file;
   std::vector<Problem> problems;
   std::vector<std::string> unsupported;  // what could not be read for want of support
+  std::size_t unlisted = 0;              // how many more of both there are
 
   [[nodiscard]] bool sound() const { return problems.empty(); }
 };

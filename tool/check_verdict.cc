@@ -51,6 +51,7 @@ std::string verdictAsText(const Verdict& verdict) {
   }
   for (const std::string& what : verdict.unsupported)
     text += fmt::format("    not supported, so not read: {}\n", what);
+  if (verdict.unlisted > 0) text += fmt::format("    and {} more\n", verdict.unlisted);
   return text;
 }
 
@@ -63,7 +64,8 @@ std::string verdictsAsJson(const std::vector<Verdict>& verdicts) {
     list.push_back({{"file", toUtf8(verdict.file)},
                     {"sound", verdict.sound()},
                     {"problems", problems},
-                    {"unsupported", verdict.unsupported}});
+                    {"unsupported", verdict.unsupported},
+                    {"unlisted", verdict.unlisted}});
   }
   return list.dump(2) + '\n';
 }

@@ -21,12 +21,14 @@ void beginStep(std::string_view what) {
   ++watched->count;
 }
 
-bool tell(std::string_view line, std::size_t andFor) {
-  if (watched == nullptr) return false;
-  if (line.size() + 1 + andFor > watched->told.size() - watched->toldBytes) return false;
+void tell(std::string_view line, std::size_t andFor) {
+  if (watched == nullptr) return;
+  if (line.size() + 1 + andFor > watched->told.size() - watched->toldBytes) {
+    ++watched->untold;
+    return;
+  }
   *std::ranges::copy(line, watched->told.data() + watched->toldBytes).out = '\n';
   watched->toldBytes += line.size() + 1;
-  return true;
 }
 
 Pause::Pause() noexcept {
@@ -74,6 +76,10 @@ std::string Steps::last() const {
 
 std::string Steps::told() const {
   return {memory_->told.data(), memory_->toldBytes};
+}
+
+std::size_t Steps::untold() const noexcept {
+  return memory_->untold;
 }
 
 }  // namespace ambrix::tool

@@ -17,9 +17,9 @@ void beginStep(std::string_view what);
 /// The bytes that a worker may leave for its watcher.
 inline constexpr std::size_t kRoomToTell = 1 << 18;
 
-/// Leaves a line for the watcher, who finds it however the worker ends. Returns whether there was
-/// room for it, and for as much more.
-bool tell(std::string_view line, std::size_t andFor = 0);
+/// Leaves a line for the watcher, who finds it however the worker ends. When there is no room for
+/// it and for as much more, it is only counted.
+void tell(std::string_view line, std::size_t andFor = 0);
 
 /// While one of these exists no time counts, because the worker waits for somebody else.
 class Pause {
@@ -49,6 +49,8 @@ class Steps {
   [[nodiscard]] std::uint32_t count() const noexcept;
   [[nodiscard]] std::string last() const;
   [[nodiscard]] std::string told() const;
+  /// How many lines found no room.
+  [[nodiscard]] std::size_t untold() const noexcept;
 
   struct Memory {
     std::atomic<std::uint32_t> count;
@@ -57,6 +59,7 @@ class Steps {
     std::array<char, 1024> last;
     std::size_t toldBytes;
     std::array<char, kRoomToTell> told;
+    std::size_t untold;
   };
 
  private:

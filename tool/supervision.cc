@@ -131,6 +131,7 @@ WorkerEnd supervise(double timeLimit, const std::function<int()>& work) {
   WorkerEnd end = watch(worker, held, steps, timeLimit);
   end.step = steps.last();
   end.told = steps.told();
+  end.untold = steps.untold();
   if (end.kind == Kind::kInterrupted) std::raise(end.signal);
   return end;
 }

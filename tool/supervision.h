@@ -2,6 +2,7 @@
 // that must not be the end of the tool.
 #pragma once
 
+#include <cstddef>
 #include <functional>
 #include <string>
 
@@ -14,10 +15,11 @@ inline constexpr double kTimeLimit = 300;
 struct WorkerEnd {
   enum class Kind { kDone, kCrashed, kQuit, kKilled, kTooSlow, kInterrupted };
   Kind kind = Kind::kDone;
-  int status = 0;    // what the work returned, if it is done
-  int signal = 0;    // that ended it otherwise
-  std::string step;  // the last that it began
-  std::string told;  // the lines that it left
+  int status = 0;          // what the work returned, if it is done
+  int signal = 0;          // that ended it otherwise
+  std::string step;        // the last that it began
+  std::string told;        // the lines that it left
+  std::size_t untold = 0;  // how many more there were
 };
 
 /// Runs the work, which throws nothing, in a child that is watched: what a step of it may take is

@@ -43,7 +43,8 @@ class SoundTest(CheckCase):
         self.assertEqual(self.check(*files), "ROW_MAJOR.cdf: sound\nCOLUMN_MAJOR.cdf: sound\n")
         self.assertEqual(self.check("--quiet", *files), "")
         self.assertEqual(self.verdicts(*files), [
-            {"file": file, "sound": True, "problems": [], "unsupported": []} for file in files])
+            {"file": file, "sound": True, "problems": [], "unsupported": [], "unlisted": 0}
+            for file in files])
         self.assertEqual(self.verdicts("--quiet", *files), [])
         self.assertEqual(self.check("ROW_MAJOR"), "ROW_MAJOR: sound\n")
 
@@ -164,6 +165,27 @@ class DamageTest(CheckCase):
         (verdict,) = self.verdicts("many.cdf", status=1)
         self.assertGreater(len(verdict["unsupported"]), 300)
         self.assertEqual([problem["place"] for problem in verdict["problems"]], ['variable "last"'])
+        self.assertEqual(len(verdict["unsupported"]) + verdict["unlisted"], 1200)
+        self.assertTrue(self.check("many.cdf", status=1).endswith(
+            f"\n    and {verdict['unlisted']} more\n"))
+
+    def test_more_problems_than_can_be_listed_are_counted(self):
+        session = self.session()
+        (file,) = session.call("create", "many")
+        for number in range(600):
+            name = f"{number:03} " + '"' * 240
+            session.call("createVar", file, name, 1, 1, [200], True, [True])
+            session.call("setVarCompression", file, number, session.constant("GZIP_COMPRESSION"), 6)
+            session.call("putVarRecordData", file, number, 0, array("int8", [7] * 200, [200, 1]))
+        session.call("close", file)
+        content = self.read("many.cdf")
+        self.write("many.cdf", re.sub(rb"(\x1f\x8b.{8}).{6}", rb"\1" + bytes(6), content,
+                                      flags=re.DOTALL))
+        (verdict,) = self.verdicts("many.cdf", status=1)
+        self.assertGreater(len(verdict["problems"]), 100)
+        self.assertGreater(verdict["unlisted"], 0)
+        self.assertEqual(len(verdict["problems"]) + verdict["unlisted"], 600)
+        self.assertEqual(verdict["unsupported"], [])
 
     def test_files_that_cannot_be_read(self):
         (verdict,) = self.verdicts("missing.cdf", status=1)
