@@ -3,7 +3,7 @@
 if(tests)
   set(seconds 120)
   if(AMBRIX_SANITIZE)
-    set(seconds 600)  # known for programs that read many files; single cases are quick anyhow
+    set(seconds 600)
   endif()
   set(supp "${CMAKE_CURRENT_LIST_DIR}/sanitizers")
   set(environment
