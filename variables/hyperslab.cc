@@ -64,6 +64,16 @@ void skipNoRecordsThatDoNotVary(const VariableDescription& variable, LibraryHype
   }
 }
 
+void selectHyperslab(const char* routine, CdfId file, long variable, const LibraryHyperslab& slab) {
+  callOnVariable(routine, file, variable,                 //
+                 zVAR_RECNUMBER_, slab.recordStart,       //
+                 zVAR_RECCOUNT_, slab.recordCount,        //
+                 zVAR_RECINTERVAL_, slab.recordInterval,  //
+                 zVAR_DIMINDICES_, slab.start.data(),     //
+                 zVAR_DIMCOUNTS_, slab.count.data(),      //
+                 zVAR_DIMINTERVALS_, slab.interval.data());
+}
+
 void moveHyperslab(const char* routine, CdfId file, long variable, const LibraryHyperslab& slab,
                    long operation, const void* buffer) {
   callOnVariable(routine, file, variable,                   //

@@ -50,7 +50,10 @@ bool takesWholeRecords(const VariableDescription& variable, const LibraryHypersl
 /// them, more than were asked for. Only one is stored, so none need be skipped.
 void skipNoRecordsThatDoNotVary(const VariableDescription& variable, LibraryHyperslab& slab);
 
-/// Selects the variable and the hyperslab, then performs GET_ or PUT_ of `zVAR_HYPERDATA_`.
+/// Selects the variable and the hyperslab.
+void selectHyperslab(const char* routine, CdfId file, long variable, const LibraryHyperslab& slab);
+
+/// The same, then performs GET_ or PUT_ of `zVAR_HYPERDATA_`.
 void moveHyperslab(const char* routine, CdfId file, long variable, const LibraryHyperslab& slab,
                    long operation, const void* buffer);
 

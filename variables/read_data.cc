@@ -15,6 +15,7 @@
 #include "variables/hyperslab.h"
 #include "variables/read_values.h"
 #include "variables/sparse_records.h"
+#include "variables/unwritten_record.h"
 #include "variables/variable_description.h"
 
 namespace TOLVEX::ambrix {
@@ -53,6 +54,9 @@ void getVarData(int, qvArray* outputs[], std::int32_t argumentCount, const qvArr
   writeWaitingRecords(file, number, routine);
   outputs[0] = readValues(variable, dimensions, request, [&](void* buffer) {
     requireCountableRecord(variable, record, routine);
+    if (lacksItsRecord(file, number, variable, routine)) {
+      return fillValue(file, number, variable, libraryIndices, buffer, routine);
+    }
     callOnVariable(routine, file, number,                               //
                    zVAR_RECNUMBER_, libraryNumber(record, kBadNumber),  //
                    zVAR_DIMINDICES_, libraryIndices.data(),             //
@@ -76,9 +80,12 @@ void getVarRecordData(int, qvArray* outputs[], std::int32_t, const qvArray* argu
   outputs[0] = readValues(variable, dimensions, request, [&](void* buffer) {
     requireRecordNumber(record, routine);
     requireCountableRecord(variable, record, routine);
-    checkLibraryStatus(
-        CDFgetVarRecordData(libraryHandle(file, routine), kZVariables, number, record, buffer),
-        routine);
+    if (lacksItsRecord(file, number, variable, routine)) {
+      return fillRecord(file, number, variable, buffer, routine);
+    }
+    checkLibraryStatus(CDFgetVarRecordData(libraryHandle(file, routine), kZVariables,
+                                           variableOrAttributeNumber(number), record, buffer),
+                       routine);
   });
 }
 
@@ -106,6 +113,9 @@ void hyperGetVarData(int, qvArray* outputs[], std::int32_t, const qvArray* argum
   writeWaitingRecords(file, number, routine);
   outputs[0] = readValues(variable, dimensions, request, [&](void* buffer) {
     requireCountableRecord(variable, librarySlab.lastRecord(), routine);
+    if (lacksItsRecord(file, number, variable, routine)) {
+      return fillHyperslab(file, number, variable, librarySlab, buffer, routine);
+    }
     moveHyperslab(routine, file, number, librarySlab, GET_, buffer);
   });
 }

@@ -76,7 +76,8 @@ void requireUsableRecord(const VariableDescription& variable, const char* routin
 void requireDivisibleRecord(CdfId file, const VariableDescription& variable, const char* routine) {
   const long supportedSize = datatypeSize(variable.datatype);
   const long elementSize = supportedSize > 0 ? supportedSize : kOtherDatatypeSize;
-  auto bytes = static_cast<std::uint32_t>(variable.elements * elementSize);
+  auto bytes = static_cast<std::uint32_t>(variable.elements);
+  bytes *= static_cast<std::uint32_t>(elementSize);
   for (std::size_t i = 0; i < variable.sizes().size(); ++i) {
     if (variable.variances()[i] != NOVARY) bytes *= static_cast<std::uint32_t>(variable.sizes()[i]);
   }

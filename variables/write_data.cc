@@ -99,8 +99,8 @@ void putVarRecordData(int, qvArray*[], std::int32_t, const qvArray* arguments[],
   requireCountableRecord(variable, record, routine);
   const LibraryData values(data);
   openFileRegistry().markWritten(file);
-  checkLibraryStatus(CDFputVarRecordData(libraryHandle(file, routine), kZVariables, number, record,
-                                         values.bytes()),
+  checkLibraryStatus(CDFputVarRecordData(libraryHandle(file, routine), kZVariables,
+                                         variableOrAttributeNumber(number), record, values.bytes()),
                      routine);
 }
 

@@ -140,8 +140,8 @@ std::size_t valuesWanted(std::string_view command, const std::vector<Array>& arg
   }
   if (command != "hyperGetVarData") return values;
   for (const double count : arguments[6].data<double>())
-    values *= static_cast<std::size_t>(count);
-  return values * static_cast<std::size_t>(arguments[3].data<double>()[0]);
+    values *= static_cast<std::size_t>(std::max(count, 0.0));
+  return values * static_cast<std::size_t>(std::max(arguments[3].data<double>()[0], 0.0));
 }
 
 std::size_t arraysIn(ArrayView array) {

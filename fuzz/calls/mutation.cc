@@ -86,16 +86,22 @@ constexpr Spoiler kSpoilers[] = {spoilValue,  spoilValue,  spoilNumber, spoilNum
                                  spoilLength, spoilLength, spoilText,   spoilFile,   spoilCount,
                                  spoilName,   disguise,    takeMemory,  wantFewer};
 
+/// The number, or 0 if no long holds it: the scripted library takes anything.
+long asLong(double number) {
+  constexpr double kEnd = 9223372036854775808.0;
+  return number >= -kEnd && number < kEnd ? static_cast<long>(number) : 0;
+}
+
 std::vector<long> asLongs(ArrayView array) {
   std::vector<long> numbers;
   if (array.classId() != ClassId::kDouble) return numbers;
   for (const double number : array.data<double>())
-    numbers.push_back(static_cast<long>(number));
+    numbers.push_back(asLong(number));
   return numbers;
 }
 
 long asLong(ArrayView array) {
-  return static_cast<long>(array.data<double>()[0]);
+  return asLong(array.data<double>()[0]);
 }
 
 template <typename Element>
