@@ -1,6 +1,7 @@
 // The library moves as many bytes as the description of a variable says, sane or not: what it is
 // handed must hold them all, and what it leaves unfilled must read as zeros.
 #include <algorithm>
+#include <limits>
 #include <map>
 #include <set>
 
@@ -169,6 +170,13 @@ TEST_F(OtherDescriptionsTest, MoreDimensionsThanThereAreAreRefused) {
     EXPECT_EQ(errorOf("getVarRecordData", {file(), 3, 0}), libraryFailure("CDFinquirezVar", -2008))
         << dimensions;
   }
+}
+
+TEST_F(OtherDescriptionsTest, ElementsBeyondCountingWrapAroundAsInTheLibrary) {
+  fake.answer("CDF_FORMAT_", {1});
+  describe({.datatype = 22, .elements = std::numeric_limits<long>::min()});
+  EXPECT_EQ(errorOf("deleteVarRecords", {file(), 3, 0, 0}),
+            libraryFailure("CDFdeletezVarRecords", -2004));
 }
 
 // The library divides by the bytes of a record, in 32 bits, of datatypes without a host class too.

@@ -63,6 +63,14 @@ TEST_F(ReadRecordTest, ANegativeRecordNeverReachesTheRoutine) {
   }
 }
 
+TEST_F(ReadRecordTest, AVariableNumberIsNotCutByTheRoutine) {
+  describe({.datatype = 4});
+  result("getVarRecordData", {file(), -4611686018427387904.0, 0});
+  EXPECT_EQ(calls().back(), "CDFgetVarRecordData 7 1 -1 0");
+  call("putVarRecordData", {file(), 4294967296.0, 0, row<std::int32_t>({1})});
+  EXPECT_THAT(calls().back(), testing::StartsWith("CDFputVarRecordData 7 1 2147483647 0"));
+}
+
 TEST_F(ReadRecordTest, AnUnsupportedDatatypeComesBeforeTheMajority) {
   describe({.datatype = 33});
   EXPECT_EQ(errorOf("getVarRecordData", {file(), 3, 0}), unrecognized(33, "DATATYPE"));
