@@ -76,7 +76,8 @@ void addDump(CLI::App& app, Arguments& arguments) {
   dump.add_option("--records", arguments.dump.records,
                   "Only records A to B; one may be left out, and A alone is one record")
       ->type_name("A:B");
-  dump.add_option("--format", arguments.dump.format, "table, csv or json; by default what OUT ends with, or a table")
+  dump.add_option("--format", arguments.dump.format,
+                  "table, csv or json; by default what OUT ends with, or a table")
       ->type_name("FORMAT")
       ->transform(CLI::IsMember({"table", "csv", "json"}));
   dump.add_option("--output", arguments.dump.output,
