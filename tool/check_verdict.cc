@@ -11,9 +11,9 @@
 namespace ambrix::tool {
 namespace {
 
-using Json = nlohmann::ordered_json;
+using OrderedJson = nlohmann::ordered_json;
 
-Json problemAsJson(const Problem& problem) {
+OrderedJson problemAsJson(const Problem& problem) {
   return {{"place", toUtf8(problem.place)},
           {"identifier", problem.identifier},
           {"message", toUtf8(problem.message)}};
@@ -26,13 +26,13 @@ void tellProblem(const Problem& problem) {
 }
 
 void tellUnsupported(const std::string& what) {
-  tell(Json(toUtf8(what)).dump(), kRoomToTell / 2);  // problems always find room
+  tell(OrderedJson(toUtf8(what)).dump(), kRoomToTell / 2);  // problems always find room
 }
 
 void takeFindings(std::string_view told, Verdict& verdict) {
   std::istringstream lines{std::string(told)};
   for (std::string line; std::getline(lines, line);) {
-    const Json finding = Json::parse(line);
+    const OrderedJson finding = OrderedJson::parse(line);
     if (finding.is_string()) {
       verdict.unsupported.push_back(finding);
     } else {
@@ -56,9 +56,9 @@ std::string verdictAsText(const Verdict& verdict) {
 }
 
 std::string verdictsAsJson(const std::vector<Verdict>& verdicts) {
-  Json list = Json::array();
+  OrderedJson list = OrderedJson::array();
   for (const Verdict& verdict : verdicts) {
-    Json problems = Json::array();
+    OrderedJson problems = OrderedJson::array();
     for (const Problem& problem : verdict.problems)
       problems.push_back(problemAsJson(problem));
     list.push_back({{"file", toUtf8(verdict.file)},

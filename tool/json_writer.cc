@@ -7,6 +7,7 @@
 
 #include "adapters/catalogue/unicode.h"
 #include "tool/json_value.h"
+#include "tool/text.h"
 
 namespace ambrix::tool {
 namespace {
@@ -98,23 +99,9 @@ void appendData(std::string& json, ArrayView array) {
   }
 }
 
-/// The bytes of the character that the text begins with: none when it is not valid UTF-8.
-std::size_t characterLength(std::string_view text) {
-  for (std::size_t length = 1; length <= std::min<std::size_t>(4, text.size()); ++length)
-    if (catalogue::toUtf16(text.substr(0, length))) return length;
-  return 0;
-}
-
 /// UTF-16 of a text in which every byte outside valid UTF-8 is the character of its number.
 std::u16string decodeLeniently(std::string_view text) {
-  std::u16string units;
-  while (!text.empty()) {
-    const std::size_t length = characterLength(text);
-    if (length == 0) units += static_cast<unsigned char>(text.front());
-    units += catalogue::toUtf16(text.substr(0, length)).value();
-    text.remove_prefix(std::max<std::size_t>(length, 1));
-  }
-  return units;
+  return catalogue::toUtf16(toUtf8(text)).value();
 }
 
 }  // namespace

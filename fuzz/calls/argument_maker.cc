@@ -15,7 +15,7 @@ struct Numbers {
   std::vector<double> values;
 };
 
-const Numbers kNumbers[] = {
+const Numbers kNumbersByLetter[] = {
     {'e', {0, 1, 2, 3}},                           // entry
     {'r', {0, 1, 2, 3, 4, 5, 9, 17, 2147483647}},  // record; the last has no place in a count
     {'t', {1, 2}},                                 // record interval
@@ -30,7 +30,7 @@ const Numbers kNumbers[] = {
 
 constexpr const char* kFileNames[] = {"f0", "f1", "f2", "f3.cdf", "long-name-of-a-file"};
 constexpr const char* kOddFileNames[] = {"missing", "", ".", "empty", "text.cdf", "nofolder/f"};
-constexpr long kDatatypes[] = {22, 4, 51, 32, 1, 2, 11, 12, 14, 21, 31, 41, 44, 45, 52};
+constexpr long kDatatypeCodes[] = {22, 4, 51, 32, 1, 2, 11, 12, 14, 21, 31, 41, 44, 45, 52};
 constexpr const char* kConstants[] = {"VARY",       "CDF_INT4",         "cdf_epoch16",
                                       "READONLYon", "GZIP_COMPRESSION", "RLE_OF_ZEROs"};
 
@@ -62,9 +62,9 @@ std::vector<Array> ArgumentMaker::argumentsOf(const Command& command) {
 }
 
 Array ArgumentMaker::makeArgument(char letter) {
-  const auto* numbers =
-      std::ranges::find_if(kNumbers, [letter](const Numbers& row) { return row.letter == letter; });
-  if (numbers != std::end(kNumbers)) return Array::scalar(choices_.pick(numbers->values));
+  const auto* numbers = std::ranges::find_if(
+      kNumbersByLetter, [letter](const Numbers& row) { return row.letter == letter; });
+  if (numbers != std::end(kNumbersByLetter)) return Array::scalar(choices_.pick(numbers->values));
   return (this->*makerOf(letter))();
 }
 
@@ -153,7 +153,7 @@ Array ArgumentMaker::attribute() {
 }
 
 Array ArgumentMaker::datatype() {
-  datatype_ = choices_.pick(kDatatypes);
+  datatype_ = choices_.pick(kDatatypeCodes);
   return Array::scalar(static_cast<double>(datatype_));
 }
 

@@ -28,6 +28,7 @@ foreach(tool cdfvalidate cdfdump cdfcvt)
   set_target_properties(${tool} PROPERTIES
     C_STANDARD 99
     C_EXTENSIONS ON
+    UNITY_BUILD OFF
     EXPORT_COMPILE_COMMANDS OFF
     RUNTIME_OUTPUT_DIRECTORY "${cdf_tools_folder}")
   target_compile_options(${tool} PRIVATE -w)

@@ -56,6 +56,7 @@ class ScriptedTest : public testing::Test {
 inline const std::string kInquiry =
     "SELECT_ CDF_ 7 | zVAR_ 3 | GET_ zVAR_NAME_ | zVAR_DATATYPE_ | zVAR_NUMELEMS_ | "
     "zVAR_NUMDIMS_ | zVAR_DIMSIZES_ | zVAR_RECVARY_ | zVAR_DIMVARYS_";
+inline const std::string kOnVariable = "SELECT_ CDF_ 7 | zVAR_ 3 | ";
 inline const std::string kMajority = "SELECT_ CDF_ 7 | GET_ CDF_MAJORITY_";
 
 /// The files that the module holds open.

@@ -11,7 +11,6 @@ namespace {
 namespace fs = std::filesystem;
 using FileLifecycleTest = ModuleTest;
 
-const std::string kCreateError = "TOLVEX:ambrix:cdflib:fileCreateError()";
 const std::string kOpenError = "TOLVEX:ambrix:cdflib:fileOpenError()";
 const std::string kInvalidChar = "TOLVEX:ambrix:cdflib:invalidCharError()";
 const std::string kNotUint64 = validate("argumentNotUint64Scalar", "CDFID");

@@ -11,7 +11,6 @@ namespace ambrix_test {
 namespace {
 
 namespace fs = std::filesystem;
-const std::string kCreateError = "TOLVEX:ambrix:cdflib:fileCreateError()";
 constexpr const char* kNoWriteAccess =
     "NO_WRITE_ACCESS: Write access is not allowed on the CDF file(s).";
 

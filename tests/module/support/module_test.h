@@ -83,6 +83,7 @@ inline std::string refused(const char* routine, const char* statusText) {
 inline const std::string kOutOfBounds = "TOLVEX:ambrix:validate:argumentOutOfBounds()";
 inline const std::string kWrongNumberOfInputs = "TOLVEX:ambrix:validate:wrongNumberOfInputs()";
 inline const std::string kInvalidFileId = "TOLVEX:ambrix:cdflib:invalidFileId()";
+inline const std::string kCreateError = "TOLVEX:ambrix:cdflib:fileCreateError()";
 
 // Skips the test where the folder of samples is absent.
 #define AMBRIX_NEED_SAMPLE(variable, name)   \

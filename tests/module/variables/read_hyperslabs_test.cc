@@ -9,7 +9,7 @@ namespace {
 using ReadHyperslabsTest = ModuleTest;
 const std::string kTooLarge = "TOLVEX:ambrix:cdflib:dimSizeTooLarge()";
 
-std::string failed(const char* text) {
+std::string readingHyperslabFailed(const char* text) {
   return refused("CDFhyperGetzVarData", text);
 }
 
@@ -64,9 +64,9 @@ TEST_F(ReadHyperslabsTest, RecordsAndIndicesThatWrapAroundAreOutOfRange) {
   const auto read = [&](double record, double records, double start, double count, double step) {
     return does("hyperGetVarData", {file, 0, record, records, 1, {start}, {count}, {step}});
   };
-  EXPECT_EQ(read(0, 1, 0, 3, 2147483647), failed(kBadDimIndex));
-  EXPECT_EQ(read(0, 1, 1, 2, 2147483647), failed(kBadDimIndex));
-  EXPECT_EQ(read(2147483647, 2, 0, 1, 1), failed(kBadRecNum));
+  EXPECT_EQ(read(0, 1, 0, 3, 2147483647), readingHyperslabFailed(kBadDimIndex));
+  EXPECT_EQ(read(0, 1, 1, 2, 2147483647), readingHyperslabFailed(kBadDimIndex));
+  EXPECT_EQ(read(2147483647, 2, 0, 1, 1), readingHyperslabFailed(kBadRecNum));
 }
 
 TEST_F(ReadHyperslabsTest, EachVectorMustHaveOneNumberForEachDimension) {
@@ -87,14 +87,14 @@ TEST_F(ReadHyperslabsTest, StartsAndIntervalsAreTheLibrarysToJudge) {
     return does("hyperGetVarData", {example, 2, record, count, stride, start, counts, strides});
   };
   const Given zeros = {0, 0}, ones = {1, 1};
-  EXPECT_EQ(reads(-1, 1, 1, zeros, ones, ones), failed(kBadRecNum));
-  EXPECT_EQ(reads(0, 0, 1, zeros, ones, ones), failed(kBadRecCount));
-  EXPECT_EQ(reads(0, 1, 0, zeros, ones, ones), failed(kBadRecInterval));
-  EXPECT_EQ(reads(0, 1, 1, {20, 0}, ones, ones), failed(kBadDimIndex));
-  EXPECT_EQ(reads(0, 1, 1, {-1, 0}, ones, ones), failed(kBadDimIndex));
-  EXPECT_EQ(reads(0, 1, 1, zeros, {0, 1}, ones), failed(kBadDimCount));
-  EXPECT_EQ(reads(0, 1, 1, zeros, ones, {0, 1}), failed(kBadDimInterval));
-  EXPECT_EQ(reads(0, 1, 1, {19, 0}, {2, 1}, ones), failed(kBadDimIndex));
+  EXPECT_EQ(reads(-1, 1, 1, zeros, ones, ones), readingHyperslabFailed(kBadRecNum));
+  EXPECT_EQ(reads(0, 0, 1, zeros, ones, ones), readingHyperslabFailed(kBadRecCount));
+  EXPECT_EQ(reads(0, 1, 0, zeros, ones, ones), readingHyperslabFailed(kBadRecInterval));
+  EXPECT_EQ(reads(0, 1, 1, {20, 0}, ones, ones), readingHyperslabFailed(kBadDimIndex));
+  EXPECT_EQ(reads(0, 1, 1, {-1, 0}, ones, ones), readingHyperslabFailed(kBadDimIndex));
+  EXPECT_EQ(reads(0, 1, 1, zeros, {0, 1}, ones), readingHyperslabFailed(kBadDimCount));
+  EXPECT_EQ(reads(0, 1, 1, zeros, ones, {0, 1}), readingHyperslabFailed(kBadDimInterval));
+  EXPECT_EQ(reads(0, 1, 1, {19, 0}, {2, 1}, ones), readingHyperslabFailed(kBadDimIndex));
 }
 
 TEST_F(ReadHyperslabsTest, NumbersBeyond32BitsAreRefusedInTheWordsOfTheirKind) {
@@ -104,10 +104,10 @@ TEST_F(ReadHyperslabsTest, NumbersBeyond32BitsAreRefusedInTheWordsOfTheirKind) {
     return does("hyperGetVarData", {example, 2, record, 1, stride, start, {1, 1}, strides});
   };
   const Given zeros = {0, 0}, ones = {1, 1};
-  EXPECT_EQ(reads(cut, 1, zeros, ones), failed(kBadRecNum));
-  EXPECT_EQ(reads(0, cut + 1, zeros, ones), failed(kBadRecInterval));
-  EXPECT_EQ(reads(0, 1, {cut, 0}, ones), failed(kBadDimIndex));
-  EXPECT_EQ(reads(0, 1, zeros, {cut + 1, 1}), failed(kBadDimInterval));
+  EXPECT_EQ(reads(cut, 1, zeros, ones), readingHyperslabFailed(kBadRecNum));
+  EXPECT_EQ(reads(0, cut + 1, zeros, ones), readingHyperslabFailed(kBadRecInterval));
+  EXPECT_EQ(reads(0, 1, {cut, 0}, ones), readingHyperslabFailed(kBadDimIndex));
+  EXPECT_EQ(reads(0, 1, zeros, {cut + 1, 1}), readingHyperslabFailed(kBadDimInterval));
 }
 
 TEST_F(ReadHyperslabsTest, NegativeCountsAreTheHostsErrorAfterAllChecks) {

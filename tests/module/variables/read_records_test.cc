@@ -8,7 +8,7 @@ namespace {
 
 using ReadRecordsTest = ModuleTest;
 
-std::string failed(const char* text) {
+std::string readingRecordFailed(const char* text) {
   return refused("CDFgetzVarRecordData", text);
 }
 
@@ -132,7 +132,8 @@ TEST_F(ReadRecordsTest, AVariableWithoutRecordVarianceHasOneRecordForAll) {
 TEST_F(ReadRecordsTest, ANegativeRecordIsRefusedAndTheFileStaysUsable) {
   const Given example = open(distributionSample("example1.cdf"));
   for (const double record : {-1.0, -5.0, 4294967296.0, 2147483648.0, 1e18}) {
-    EXPECT_EQ(does("getVarRecordData", {example, 0, record}), failed(kBadRecNum)) << record;
+    EXPECT_EQ(does("getVarRecordData", {example, 0, record}), readingRecordFailed(kBadRecNum))
+        << record;
   }
   EXPECT_EQ(does("getVarRecordData", {example, 0, 0}), "int32 1x1 [23]");
 }
@@ -140,7 +141,7 @@ TEST_F(ReadRecordsTest, ANegativeRecordIsRefusedAndTheFileStaysUsable) {
 TEST_F(ReadRecordsTest, OversizedRecordsAreRefusedBeforeTheLibraryDividesByThem) {
   const Given file = create();
   const double variable = createVar(file, {.datatype = 4, .sizes = {65536, 65536}});
-  EXPECT_EQ(does("getVarRecordData", {file, variable, 0}), failed(kBadDimSize));
+  EXPECT_EQ(does("getVarRecordData", {file, variable, 0}), readingRecordFailed(kBadDimSize));
   EXPECT_EQ(does("getVarData", {file, variable, 0, {0, 0}}),
             refused("CDFgetzVarData", kBadDimSize));
   EXPECT_EQ(does("hyperGetVarData", {file, variable, 0, 1, 1, {0, 0}, {1, 1}, {1, 1}}),

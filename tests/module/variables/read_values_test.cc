@@ -7,7 +7,7 @@ namespace {
 using ReadValuesTest = ModuleTest;
 const std::string kCannotOmit = "TOLVEX:ambrix:cdflib:cannotOmitDimSpec()";
 
-std::string failed(const char* text) {
+std::string readingValueFailed(const char* text) {
   return refused("CDFgetzVarData", text);
 }
 
@@ -26,13 +26,13 @@ TEST_F(ReadValuesTest, IndicesOfARowMajorFileAreReversed) {
   EXPECT_EQ(does("getVarData", {example, 2, 0, {19, 9}}), "int32 1x1 [199]");
   EXPECT_EQ(does("getVarData", {example, 2, 0, {3, 2}}), "int32 1x1 [43]");
   EXPECT_EQ(does("getVarData", {example, 2, 2, {3, 2}}), "int32 1x1 [443]");
-  EXPECT_EQ(does("getVarData", {example, 2, 0, {9, 10}}), failed(kBadDimIndex));
+  EXPECT_EQ(does("getVarData", {example, 2, 0, {9, 10}}), readingValueFailed(kBadDimIndex));
 }
 
 TEST_F(ReadValuesTest, IndicesOfAColumnMajorFileAreAsGiven) {
   const Given columns = open(distributionSample("cacsst2.cdf"));
   EXPECT_EQ(does("getVarData", {columns, 2, 0, {179, 90}}), "single 1x1 [-1.79999995]");
-  EXPECT_EQ(does("getVarData", {columns, 2, 0, {90, 179}}), failed(kBadDimIndex));
+  EXPECT_EQ(does("getVarData", {columns, 2, 0, {90, 179}}), readingValueFailed(kBadDimIndex));
 }
 
 TEST_F(ReadValuesTest, IndicesOfOtherClassesAreConverted) {
@@ -61,10 +61,11 @@ TEST_F(ReadValuesTest, ThereMustBeOneIndexForEachDimension) {
 
 TEST_F(ReadValuesTest, NumbersOutOfRangeAreTheLibrarysFailure) {
   const Given example = open(distributionSample("example1.cdf"));
-  EXPECT_EQ(does("getVarData", {example, 0, -1}), failed(kBadRecNum));
-  EXPECT_EQ(does("getVarData", {example, 0, 4294967296.0}), failed(kBadRecNum));
-  EXPECT_EQ(does("getVarData", {example, 2, 0, {-1, 0}}), failed(kBadDimIndex));
-  EXPECT_EQ(does("getVarData", {example, 2, 0, {4294967296.0, 0}}), failed(kBadDimIndex));
+  EXPECT_EQ(does("getVarData", {example, 0, -1}), readingValueFailed(kBadRecNum));
+  EXPECT_EQ(does("getVarData", {example, 0, 4294967296.0}), readingValueFailed(kBadRecNum));
+  EXPECT_EQ(does("getVarData", {example, 2, 0, {-1, 0}}), readingValueFailed(kBadDimIndex));
+  EXPECT_EQ(does("getVarData", {example, 2, 0, {4294967296.0, 0}}),
+            readingValueFailed(kBadDimIndex));
   EXPECT_EQ(does("getVarData", {example, 3, 0}), refused("CDFinquirezVar", kNoSuchVar));
   EXPECT_EQ(does("getVarData", {example, 4294967296.0, 0}), refused("CDFinquirezVar", kNoSuchVar));
   EXPECT_EQ(does("getVarData", {example, 0, 0}), "int32 1x1 [23]");

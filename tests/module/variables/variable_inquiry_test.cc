@@ -126,14 +126,13 @@ TEST_F(VariableInquiryTest, CloseVarReportsABadVariableAsCdfid) {
   EXPECT_EQ(does("closeVar", {file, Array::scalar(std::uint64_t{0})}), notScalar("CDFID"));
 }
 
-struct Command {
-  const char* name;
-  const char* routine;
-  const char* label;
-  Arguments more;
-};
-
 TEST_F(VariableInquiryTest, AMissingVariableFailsUnderTheRoutineOfEachCommand) {
+  struct Command {
+    const char* name;
+    const char* routine;
+    const char* label;
+    Arguments more;
+  };
   const Command commands[] = {{"inquireVar", "CDFinquirezVar", "VARNUM", {}},
                               {"closeVar", "CDFclosezVar", "CDFID", {}},
                               {"deleteVar", "CDFdeletezVar", "VARNUM", {}},

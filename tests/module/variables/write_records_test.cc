@@ -11,10 +11,10 @@ class WriteRecordsTest : public ModuleTest {
   Given file = create();
 };
 
-std::string failed(const char* text) {
+std::string writingRecordFailed(const char* text) {
   return refused("CDFputzVarRecordData", text);
 }
-std::string wrongNumber(long expected) {
+std::string wrongNumberInRecord(long expected) {
   return cdflib("wrongNumberOfPutVarRecordDataElements", "v", expected);
 }
 
@@ -56,7 +56,7 @@ TEST_F(WriteRecordsTest, TextsAreWrittenWholeWithTheLowByteOfEachCharacter) {
   const double variable = createVar(file, {.datatype = 51, .sizes = {2}, .elements = 8});
   const Given texts = Array::text(u"abcdefg\u20ACcaf\u00E9 XYZ");
   EXPECT_EQ(does("putVarRecordData", {file, variable, 0, texts}), "done");
-  EXPECT_EQ(does("putVarRecordData", {file, variable, 0, "too short"}), wrongNumber(16));
+  EXPECT_EQ(does("putVarRecordData", {file, variable, 0, "too short"}), wrongNumberInRecord(16));
   EXPECT_EQ(does("getVarRecordData", {file, variable, 0}),
             "char 8x2 'abcdefg\\xFFACcaf\\xFFE9 XYZ'");
   results("close", {file});
@@ -66,8 +66,8 @@ TEST_F(WriteRecordsTest, TextsAreWrittenWholeWithTheLowByteOfEachCharacter) {
 
 TEST_F(WriteRecordsTest, TheNumberOfElementsIsCheckedFirst) {
   const double variable = createVar(file, {.datatype = 22, .sizes = {3, 4}});
-  EXPECT_EQ(does("putVarRecordData", {file, variable, 0, "short"}), wrongNumber(12));
-  EXPECT_EQ(does("putVarRecordData", {file, variable, -1, {}}), wrongNumber(12));
+  EXPECT_EQ(does("putVarRecordData", {file, variable, 0, "short"}), wrongNumberInRecord(12));
+  EXPECT_EQ(does("putVarRecordData", {file, variable, -1, {}}), wrongNumberInRecord(12));
   const double epoch = createVar(file, {.datatype = 32, .sizes = {3}, .name = "e"});
   EXPECT_EQ(does("putVarRecordData", {file, epoch, 0, {1, 2, 3}}),
             cdflib("wrongNumberOfPutVarRecordDataElements", "e", 6L));
@@ -88,7 +88,8 @@ TEST_F(WriteRecordsTest, ANegativeRecordIsRefusedAndTheFileStaysUsable) {
   const double variable = createVar(file, {.datatype = 22});
   results("putVarRecordData", {file, variable, 0, 7});
   for (const double record : {-1.0, -9.0, 4294967296.0, 2147483648.0}) {
-    EXPECT_EQ(does("putVarRecordData", {file, variable, record, 5}), failed(kBadRecNum));
+    EXPECT_EQ(does("putVarRecordData", {file, variable, record, 5}),
+              writingRecordFailed(kBadRecNum));
   }
   EXPECT_EQ(does("getVarRecordData", {file, variable, 0}), "double 1x1 [7]");
   EXPECT_EQ(does("getVarRecordData", {reopen(file), variable, 0}), "double 1x1 [7]");
@@ -112,7 +113,7 @@ TEST_F(WriteRecordsTest, WithoutRecordVarianceThereIsOneRecordForAll) {
 TEST_F(WriteRecordsTest, OversizedRecordsAreRefused) {
   results("createVar", {file, "v", 45, 1, {65536, 32768}, -1, {-1, 0}});
   const double huge = 0;
-  EXPECT_EQ(does("putVarRecordData", {file, huge, 0, {1}}), wrongNumber(2147483648));
+  EXPECT_EQ(does("putVarRecordData", {file, huge, 0, {1}}), wrongNumberInRecord(2147483648));
 }
 
 TEST_F(WriteRecordsTest, DeletingRecordsMovesTheLaterOnesDown) {

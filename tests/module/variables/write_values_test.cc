@@ -11,10 +11,10 @@ class WriteValuesTest : public ModuleTest {
   Given file = create();
 };
 
-std::string failed(const char* text) {
+std::string writingValueFailed(const char* text) {
   return refused("CDFputzVarData", text);
 }
-std::string wrongNumber(long expected) {
+std::string wrongNumberInValue(long expected) {
   return cdflib("wrongNumberOfPutVarDataElements", "v", expected);
 }
 
@@ -22,8 +22,8 @@ TEST_F(WriteValuesTest, AScalarVariableTakesEmptyIndices) {
   const double variable = createVar(file, {.datatype = 22});
   EXPECT_EQ(does("putVarData", {file, variable, 2, {}, 4.5}), "done");
   EXPECT_EQ(does("getVarData", {file, variable, 2}), "double 1x1 [4.5]");
-  EXPECT_EQ(does("putVarData", {file, variable, 2, {}, {1, 2}}), wrongNumber(1));
-  EXPECT_EQ(does("putVarData", {file, variable, 2, {}, {}}), wrongNumber(1));
+  EXPECT_EQ(does("putVarData", {file, variable, 2, {}, {1, 2}}), wrongNumberInValue(1));
+  EXPECT_EQ(does("putVarData", {file, variable, 2, {}, {}}), wrongNumberInValue(1));
 }
 
 TEST_F(WriteValuesTest, IndicesOfARowMajorFileAreReversed) {
@@ -36,7 +36,7 @@ TEST_F(WriteValuesTest, IndicesOfARowMajorFileAreReversed) {
   }
   EXPECT_EQ(does("getVarRecordData", {file, variable, 0}), "int16 2x3 [1 2 3 4 5 6]");
   EXPECT_EQ(does("putVarData", {file, variable, 0, {2, 1}, row<std::int16_t>({9})}),
-            failed(kBadDimIndex));
+            writingValueFailed(kBadDimIndex));
   results("close", {file});
   EXPECT_THAT(fileBytes("new.cdf"), testing::HasSubstr(bytesOf<std::int16_t>({1, 2, 3, 4, 5, 6})));
 }
@@ -56,8 +56,8 @@ TEST_F(WriteValuesTest, AnEpoch16NeedsTwoDoubles) {
   const double variable = createVar(file, {.datatype = 32});
   EXPECT_EQ(does("putVarData", {file, variable, 0, {}, {63113904000.0, 7}}), "done");
   EXPECT_EQ(does("getVarData", {file, variable, 0}), "double 2x1 [63113904000 7]");
-  EXPECT_EQ(does("putVarData", {file, variable, 0, {}, 5}), wrongNumber(2));
-  EXPECT_EQ(does("putVarData", {file, variable, 0, {}, {1, 2, 3}}), wrongNumber(2));
+  EXPECT_EQ(does("putVarData", {file, variable, 0, {}, 5}), wrongNumberInValue(2));
+  EXPECT_EQ(does("putVarData", {file, variable, 0, {}, {1, 2, 3}}), wrongNumberInValue(2));
 }
 
 // The characters behind the first are zeros, of which the versions of the library make different
@@ -81,8 +81,8 @@ TEST_F(WriteValuesTest, TheFirstCharacterKeepsItsLowByte) {
 
 TEST_F(WriteValuesTest, ATextNeedsItsNumberOfCharacters) {
   const double variable = createVar(file, {.datatype = 51, .elements = 4});
-  EXPECT_EQ(does("putVarData", {file, variable, 0, {}, "A"}), wrongNumber(4));
-  EXPECT_EQ(does("putVarData", {file, variable, 0, {}, "ABCDE"}), wrongNumber(4));
+  EXPECT_EQ(does("putVarData", {file, variable, 0, {}, "A"}), wrongNumberInValue(4));
+  EXPECT_EQ(does("putVarData", {file, variable, 0, {}, "ABCDE"}), wrongNumberInValue(4));
 }
 
 TEST_F(WriteValuesTest, ThereMustBeOneIndexForEachDimension) {
@@ -95,7 +95,7 @@ TEST_F(WriteValuesTest, ThereMustBeOneIndexForEachDimension) {
 
 TEST_F(WriteValuesTest, TheNumberOfElementsComesBeforeTheDatatypeAndThatBeforeTheClass) {
   const double variable = createVar(file, {.datatype = 22});
-  EXPECT_EQ(does("putVarData", {file, variable, 0, {}, row<float>({1, 2})}), wrongNumber(1));
+  EXPECT_EQ(does("putVarData", {file, variable, 0, {}, row<float>({1, 2})}), wrongNumberInValue(1));
   EXPECT_EQ(does("putVarData", {file, variable, 0, {}, row<float>({1})}),
             cdflib("datatypeMismatch", "single", "CDF_REAL8"));
   results("createVar", {file, "i8", 8, 1, {}, -1, {}});
@@ -122,10 +122,12 @@ TEST_F(WriteValuesTest, ClassesThatCarryNoDatatypeNeverMatch) {
 TEST_F(WriteValuesTest, NumbersOutOfRangeAreTheLibrarysFailureAndWriteNothing) {
   const double variable = createVar(file, {.datatype = 22, .sizes = {2}});
   results("putVarRecordData", {file, variable, 0, {1, 2}});
-  EXPECT_EQ(does("putVarData", {file, variable, -1, 0, 9}), failed(kBadRecNum));
-  EXPECT_EQ(does("putVarData", {file, variable, 4294967296.0, 0, 9}), failed(kBadRecNum));
-  EXPECT_EQ(does("putVarData", {file, variable, 0, 2, 9}), failed(kBadDimIndex));
-  EXPECT_EQ(does("putVarData", {file, variable, 0, 4294967296.0, 9}), failed(kBadDimIndex));
+  EXPECT_EQ(does("putVarData", {file, variable, -1, 0, 9}), writingValueFailed(kBadRecNum));
+  EXPECT_EQ(does("putVarData", {file, variable, 4294967296.0, 0, 9}),
+            writingValueFailed(kBadRecNum));
+  EXPECT_EQ(does("putVarData", {file, variable, 0, 2, 9}), writingValueFailed(kBadDimIndex));
+  EXPECT_EQ(does("putVarData", {file, variable, 0, 4294967296.0, 9}),
+            writingValueFailed(kBadDimIndex));
   EXPECT_EQ(does("putVarData", {file, 7, 0, 0, 9}), refused("CDFinquirezVar", kNoSuchVar));
   EXPECT_EQ(does("getVarRecordData", {file, variable, 0}), "double 2x1 [1 2]");
 }
@@ -145,7 +147,7 @@ TEST_F(WriteValuesTest, AReadOnlyFileIsNotWritten) {
   const double variable = createVar(file, {.datatype = 22});
   file = reopen(file);
   results("setReadOnlyMode", {file, -1});
-  EXPECT_EQ(does("putVarData", {file, variable, 0, {}, 9}), failed(kReadOnlyMode));
+  EXPECT_EQ(does("putVarData", {file, variable, 0, {}, 9}), writingValueFailed(kReadOnlyMode));
 }
 
 }  // namespace

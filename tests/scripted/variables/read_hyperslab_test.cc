@@ -7,8 +7,6 @@ namespace {
 using testing::ElementsAre;
 using testing::HasSubstr;
 
-const std::string kOnVariable = "SELECT_ CDF_ 7 | zVAR_ 3 | ";
-
 class ReadHyperslabTest : public ScriptedTest {
  protected:
   std::string errorWith(const Given& start, const Given& count, const Given& interval) {

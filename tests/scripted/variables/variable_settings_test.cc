@@ -7,8 +7,6 @@ namespace {
 using testing::ElementsAre;
 using testing::IsEmpty;
 
-const std::string kOnVariable = "SELECT_ CDF_ 7 | zVAR_ 3 | ";
-
 class VariableSettingsTest : public ScriptedTest {
  protected:
   VariableSettingsTest() { describe(Variable{}); }

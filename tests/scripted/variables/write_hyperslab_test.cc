@@ -6,8 +6,6 @@ namespace {
 
 using testing::ElementsAre;
 
-const std::string kOnVariable = "SELECT_ CDF_ 7 | zVAR_ 3 | ";
-
 class WriteHyperslabTest : public ScriptedTest {
  protected:
   std::string errorWith(const Given& count, double records, const Given& data) {

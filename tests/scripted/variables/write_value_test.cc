@@ -8,7 +8,7 @@ using testing::ElementsAre;
 using testing::IsEmpty;
 using WriteValueTest = ScriptedTest;
 
-const std::string kWrite = "SELECT_ CDF_ 7 | zVAR_ 3 | zVAR_RECNUMBER_ ";
+const std::string kOnRecord = "SELECT_ CDF_ 7 | zVAR_ 3 | zVAR_RECNUMBER_ ";
 
 TEST_F(WriteValueTest, AScalarVariableStillNeedsItsEmptyIndices) {
   describe({.datatype = 2});
@@ -16,7 +16,7 @@ TEST_F(WriteValueTest, AScalarVariableStillNeedsItsEmptyIndices) {
   EXPECT_THAT(call("putVarData", {file(), 3, 9, {}, row<std::int16_t>({0x0102})}), IsEmpty());
   EXPECT_THAT(fake.bytesRead(), ElementsAre(2, 1));
   EXPECT_THAT(calls(), ElementsAre(kInquiry, kMajority,
-                                   kWrite + "9 | zVAR_DIMINDICES_ [] | PUT_ zVAR_DATA_"));
+                                   kOnRecord + "9 | zVAR_DIMINDICES_ [] | PUT_ zVAR_DATA_"));
   EXPECT_EQ(errorOf("putVarData", {file(), 3, 9, row<std::int16_t>({1})}),
             validate("wrongNumberOfInputs"));
 }
@@ -24,10 +24,10 @@ TEST_F(WriteValueTest, AScalarVariableStillNeedsItsEmptyIndices) {
 TEST_F(WriteValueTest, IndicesAreReversedForARowMajorFile) {
   describe({.sizes = {5, 6}, .majority = 1});
   call("putVarData", {file(), 3, -1, {1, 2}, 8});
-  EXPECT_EQ(calls()[2], kWrite + "-1 | zVAR_DIMINDICES_ [2 1] | PUT_ zVAR_DATA_");
+  EXPECT_EQ(calls()[2], kOnRecord + "-1 | zVAR_DIMINDICES_ [2 1] | PUT_ zVAR_DATA_");
   fake.answer("CDF_MAJORITY_", {2});
   call("putVarData", {file(), 3, 0, {1, 2}, 8});
-  EXPECT_EQ(calls()[2], kWrite + "0 | zVAR_DIMINDICES_ [1 2] | PUT_ zVAR_DATA_");
+  EXPECT_EQ(calls()[2], kOnRecord + "0 | zVAR_DIMINDICES_ [1 2] | PUT_ zVAR_DATA_");
 }
 
 TEST_F(WriteValueTest, OnlyTheFirstCharacterOfATextIsWrittenTheRestAreZerosAndOneMore) {
