@@ -55,7 +55,7 @@ void getVarData(int, qvArray* outputs[], std::int32_t argumentCount, const qvArr
   outputs[0] = readValues(variable, dimensions, request, [&](void* buffer) {
     requireCountableRecord(variable, record, routine);
     if (lacksItsRecord(file, number, variable, routine)) {
-      return fillValue(file, number, variable, libraryIndices, buffer, routine);
+      return fillValue(file, number, variable, record, libraryIndices, buffer, routine);
     }
     callOnVariable(routine, file, number,                               //
                    zVAR_RECNUMBER_, libraryNumber(record, kBadNumber),  //

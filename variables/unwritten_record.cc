@@ -50,9 +50,10 @@ void fillRecord(CdfId file, long number, const VariableDescription& variable, vo
   fillWithPadValue(file, number, variable, values, buffer, routine);
 }
 
-void fillValue(CdfId file, long number, const VariableDescription& variable,
+void fillValue(CdfId file, long number, const VariableDescription& variable, long record,
                const DimensionVector& indices, void* buffer, const char* routine) {
-  callOnVariable(routine, file, number, zVAR_DIMINDICES_, indices.data());
+  callOnVariable(routine, file, number, zVAR_RECNUMBER_, libraryNumber(record, kBadNumber),
+                 zVAR_DIMINDICES_, indices.data());
   fillWithPadValue(file, number, variable, 1, buffer, routine);
 }
 

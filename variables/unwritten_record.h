@@ -16,8 +16,8 @@ bool lacksItsRecord(CdfId file, long number, const VariableDescription& variable
 
 void fillRecord(CdfId file, long number, const VariableDescription& variable, void* buffer,
                 const char* routine);
-/// The library checks the indices and the hyperslab as if it read them.
-void fillValue(CdfId file, long number, const VariableDescription& variable,
+/// The library checks the record, the indices and the hyperslab as if it read them.
+void fillValue(CdfId file, long number, const VariableDescription& variable, long record,
                const DimensionVector& indices, void* buffer, const char* routine);
 void fillHyperslab(CdfId file, long number, const VariableDescription& variable,
                    const LibraryHyperslab& slab, void* buffer, const char* routine);

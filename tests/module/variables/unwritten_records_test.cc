@@ -72,6 +72,11 @@ TEST_F(UnwrittenRecordsTest, AreReadWithTheSameChecks) {
   EXPECT_EQ(does("hyperGetVarData", {file_, v, 0, 1, 0, 0, 1, 1}),
             refused(routine, kBadRecInterval));
   EXPECT_EQ(does("getVarData", {file_, v, 0, 4}), refused("CDFgetzVarData", kBadDimIndex));
+  for (const double bad : {-1.0, 4294967296.0}) {
+    EXPECT_EQ(does("getVarData", {file_, v, bad, 0}), refused("CDFgetzVarData", kBadRecNum));
+    EXPECT_EQ(does("getVarRecordData", {file_, v, bad}),
+              refused("CDFgetzVarRecordData", kBadRecNum));
+  }
   results("hyperPutVarData", {file_, v, 0, 1, 1, 0, 4, 1, row<std::uint16_t>({1, 2, 3, 4})});
   EXPECT_EQ(does("getVarRecordData", {file_, v, 0}), "uint16 4x1 [1 2 3 4]");
 }
