@@ -9,11 +9,11 @@ Setting = collections.namedtuple("Setting", "title before after")
 # the number of calls in a round where a time for each is of more interest than the whole.
 WORKLOADS = (
     Workload("read", "read 51 MB of doubles, row-major", 0.5, None),
-    Workload("read_column_major", "the same, column-major", 0.5, None),
-    Workload("read_gzip", "the same, gzip", 1.02, None),
+    Workload("read_column_major", "read the same, column-major", 0.5, None),
+    Workload("read_gzip", "read the same, gzip", 1.02, None),
     Workload("write", "write 51 MB of doubles, row-major", 1.02, None),
-    Workload("write_column_major", "the same, column-major", 1.02, None),
-    Workload("write_gzip", "the same, gzip", 1.02, None),
+    Workload("write_column_major", "write the same, column-major", 1.02, None),
+    Workload("write_gzip", "write the same, gzip", 1.02, None),
     Workload("walk_metadata", "walk 500 variables with 20 attributes each", None, None),
     Workload("write_metadata", "write 500 variables with 20 attributes each", None, None),
     Workload("read_values", 'read 100,000 values by "getVarData"', 1.3, 100_000),

@@ -30,7 +30,8 @@ TEST_F(UnwrittenRecordTest, ThePadValueFillsARecord) {
 TEST_F(UnwrittenRecordTest, TheLibraryChecksIndicesAndHyperslabs) {
   describeUnwritten({.datatype = 4, .sizes = {3}, .recordVariance = 0});
   EXPECT_EQ(shown(result("getVarData", {file(), 3, 0, 2})), "int32 1x1 [9]");
-  EXPECT_THAT(calls(), testing::Contains(HasSubstr("zVAR_ 3 | zVAR_RECNUMBER_ 0 | zVAR_DIMINDICES_ [2]")));
+  EXPECT_THAT(calls(),
+              testing::Contains(HasSubstr("zVAR_ 3 | zVAR_RECNUMBER_ 0 | zVAR_DIMINDICES_ [2]")));
   EXPECT_EQ(shown(result("hyperGetVarData", {file(), 3, 0, 2, 1, 1, 2, 1})), "int32 2x2 [9 9 9 9]");
   EXPECT_THAT(calls(), testing::Contains(HasSubstr("| zVAR_DIMINTERVALS_ [1]")));
   EXPECT_EQ(errorOf("hyperGetVarData", {file(), 3, 0, 2, 1, 1, 2, 2}),
