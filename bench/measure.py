@@ -4,6 +4,7 @@ import statistics
 import time
 
 SECONDS = 6  # a sitting begins no further round after this long
+LONG = 30  # what takes this long is done once
 
 
 class Times:
@@ -18,7 +19,10 @@ class Times:
         facts = {"rounds": len(self.seconds), "median": statistics.median(self.seconds),
                  "quartiles": quartiles(self.seconds)}
         if self.reference:
-            ratios = [mine / its for mine, its in zip(self.seconds, self.reference)]
+            beside = self.reference
+            if len(beside) != len(self.seconds):
+                beside = [statistics.median(beside)] * len(self.seconds)
+            ratios = [mine / its for mine, its in zip(self.seconds, beside)]
             facts["ratio"] = statistics.median(ratios)
             facts["ratio_quartiles"] = quartiles(ratios)
         return facts
@@ -33,16 +37,20 @@ def quartiles(values):
 
 def taking_turns(runs, rounds):
     """Runs each of the named runs once a round, in an order that alternates; returns their seconds
-    by name. The first round of all is for warming up and does not count."""
+    by name. The first round of all is for warming up and does not count, except of what takes long,
+    which is not repeated."""
     seconds = {name: [] for name in runs}
+    runs = dict(runs)
     start = time.monotonic()
     for number in range(rounds + 1):
         if number > 1 and time.monotonic() > start + SECONDS:
             break
         for name in list(runs) if number % 2 else reversed(list(runs)):
             taken = runs[name]()
-            if number > 0:
+            if number > 0 or taken > LONG:
                 seconds[name].append(taken)
+            if taken > LONG:
+                del runs[name]
     return seconds
 
 
@@ -52,7 +60,8 @@ def measure(workload, columns, rounds, sittings):
     asked = [column for column in columns if column.does(workload)]
     together = {column.name: [] for column in asked}
     for _ in range(sittings):
-        runs = {column.name: lambda column=column: column.run(workload) for column in asked}
+        runs = {column.name: lambda column=column: column.run(workload) for column in asked
+                if not any(seconds > LONG for seconds in together[column.name])}
         for name, seconds in taking_turns(runs, rounds).items():
             together[name] += seconds
         for column in asked:

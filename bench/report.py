@@ -14,6 +14,8 @@ def time_text(seconds):
 
 
 def ratio_text(facts):
+    if facts["rounds"] == 1:
+        return short(facts["ratio"])
     low, high = facts["ratio_quartiles"]
     return f"{short(facts['ratio'])} ({short(low)}-{short(high)})"
 

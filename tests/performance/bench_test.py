@@ -83,6 +83,11 @@ class Arithmetic(unittest.TestCase):
         self.assertEqual("".join(order), "baabbaab")
         self.assertEqual(seconds, {"a": [3, 6, 7], "b": [4, 5, 8]})
 
+    def test_what_takes_long_is_done_once_and_counts(self):
+        seconds = measure.taking_turns({"a": lambda: 1, "b": lambda: measure.LONG + 1}, 2)
+        self.assertEqual(seconds, {"a": [1, 1], "b": [measure.LONG + 1]})
+        self.assertEqual(measure.Times([60], [1, 2, 3]).facts()["ratio"], 30)
+
     def test_a_ratio_is_the_median_of_those_of_the_rounds(self):
         facts = measure.Times([2.0, 9.0, 4.0], [1.0, 3.0, 1.0]).facts()
         self.assertEqual((facts["median"], facts["ratio"]), (4.0, 3.0))

@@ -90,7 +90,7 @@ class DumpTest(ReadersCase):
         done = run("dump", path, number, "--format", "json", *rows)
         if variable is None:
             self.assertEqual(done.returncode, 1)
-            self.assertIn(b"unrecognizedValue", done.stderr)
+            self.assertIn(b"unsupportedDatatype", done.stderr)
             return
         self.assertEqual((done.returncode, done.stderr), (0, b""))
         shown = json.loads(done.stdout)
