@@ -6,7 +6,7 @@ import subprocess
 from report import PEOPLE_SAY
 
 STYLES = {"module": "pt 7 lc '#0072b2'", "octave": "pt 5 lc '#e69f00'",
-          "SpacePy": "pt 9 lc '#999999'", "pycdfpp": "pt 11 lc '#999999'",
+          "spacepy": "pt 9 lc '#999999'", "pycdfpp": "pt 11 lc '#999999'",
           "cdflib": "pt 13 lc '#999999'"}
 
 
@@ -30,7 +30,7 @@ def commands(shown, columns, path):
         lines.append("\n".join([f"$column{number} << END", *points, "END"]))
     series = [f"$column{number} with points ps 1.1 {STYLES.get(name, '')} "
               f"title {quoted(PEOPLE_SAY.get(name, name))}" for number, name in enumerate(columns)]
-    return "\n".join([*lines, "plot " + ", ".join(series)])
+    return "\n".join([*lines, "plot " + ", ".join(reversed(series))])  # ours on top
 
 
 def draw(workloads, results, path):

@@ -3,7 +3,8 @@
 import re
 
 BEGIN, END = "<!-- begin: {} (script/bench --document) -->", "<!-- end: {} -->"
-PEOPLE_SAY = {"library": "bare calls", "module": "ambrix", "octave": "in Octave"}
+PEOPLE_SAY = {"library": "bare calls", "module": "ambrix", "octave": "in Octave",
+              "spacepy": "SpacePy"}
 
 
 def time_text(seconds):
