@@ -12,6 +12,7 @@
 #include "file/file_inquiry.h"
 #include "file/file_settings.h"
 #include "file/library_modes.h"
+#include "file/read_only_mode.h"
 #include "gateway/errors.h"
 #include "gateway/file_lifecycle.h"
 #include "gateway/raise_error.h"
@@ -104,7 +105,7 @@ constexpr CommandEntry CommandTable[] = {
     {75, "setFileBackward",          1, 1, setFileBackward},
     {76, "setFormat",                2, 2, setFileNumber<kSetFormat>},
     {77, "setMajority",              2, 2, setFileNumber<kSetMajority>},
-    {78, "setReadOnlyMode",          2, 2, setFileNumber<kSetReadOnlyMode>},
+    {78, "setReadOnlyMode",          2, 2, setReadOnlyMode},
     {89, "setStageCacheSize",        2, 2, setFileNumber<kSetStageCacheSize>},
     {79, "setValidate",              1, 1, setValidate},
     {80, "setVarAllocBlockRecords",  4, 4, setVarAllocBlockRecords},

@@ -111,7 +111,7 @@ std::vector<CommandCase> commandCases() {
       {"setFileBackward", {1}, {}},
       {"setFormat", {file(), 2}, {"CDFsetFormat"}},
       {"setMajority", {file(), 2}, {"CDFsetMajority"}},
-      {"setReadOnlyMode", {file(), -1}, {"CDFsetReadOnlyMode"}},
+      {"setReadOnlyMode", {file(), 0}, {"CDFsetReadOnlyMode"}},
       {"setStageCacheSize", {file(), 9}, {"CDFsetStageCacheSize"}},
       {"setValidate", {-1}, {}},
       {"setVarAllocBlockRecords", {file(), 3, 0, 9}, guarded("CDFsetzVarAllocBlockRecords")},

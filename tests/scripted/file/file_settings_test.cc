@@ -96,9 +96,24 @@ TEST_F(FileSettingsTest, SettersHandTheNumberOverAndReturnNothing) {
     for (const double value : {2.0, 0.0, -1.0, 7.9}) {
       EXPECT_THAT(call(setter.command, {file(), value}), testing::IsEmpty());
       const std::string number = std::to_string(static_cast<long>(value));
-      EXPECT_THAT(calls(), ElementsAre("SELECT_ CDF_ 7" + (setter.call + number)));
+      const std::string expected = "SELECT_ CDF_ 7" + (setter.call + number);
+      const bool selectsAnAttribute = expected.ends_with("CDF_READONLY_MODE_ -1");
+      const auto made = calls();
+      EXPECT_THAT(made, testing::SizeIs(selectsAnAttribute ? 2 : 1));
+      EXPECT_EQ(made.at(0), expected);
     }
   }
+}
+
+TEST_F(FileSettingsTest, InReadOnlyModeAnAttributeIsSelectedIfThereIsOne) {
+  const char* const select = "SELECT_ CDF_ 7 | ATTR_ 0";
+  for (const long status : {0L, -2039L}) {
+    fake.endWith(select, status);
+    EXPECT_THAT(call("setReadOnlyMode", {file(), -1}), testing::IsEmpty());
+    EXPECT_THAT(calls(), ElementsAre("SELECT_ CDF_ 7 | CDF_READONLY_MODE_ -1", select));
+  }
+  fake.endWith("CDF_READONLY_MODE_ -1", -2073);
+  EXPECT_EQ(errorOf("setReadOnlyMode", {file(), -1}), libraryFailure("CDFsetReadOnlyMode", -2073));
 }
 
 TEST_F(FileSettingsTest, SettersReportABadNumberUnderTheirLabel) {
