@@ -49,7 +49,8 @@ constexpr Exclusion kExclusions[] = {
     // CDF 3.6.3 gives a file up when it is compressed with little data in it, and then computes the
     // checksum with memory that it has freed.
     {"setChecksum", 1, 1, 3, 0, true},
-    // Of compressed variables it must delete all records: after other deletions it damages the file.
+    // Of compressed variables it must delete all records: after other deletions it damages the
+    // file.
     {"deleteVarRecords", 2, 1, kEnd, 0, true},
     {"deleteVarRecords", 3, 0, kLast, kLast, true},
 };
