@@ -14,6 +14,19 @@ bool wraps(long start, long count, long interval) {
   return start >= 0 && count >= 1 && interval >= 1 && !fitsLibrary(start + (count - 1) * interval);
 }
 
+template <typename... Items>
+void callOnHyperslab(const char* routine, CdfId file, long variable, const LibraryHyperslab& slab,
+                     Items... items) {
+  callOnVariable(routine, file, variable,                   //
+                 zVAR_RECNUMBER_, slab.recordStart,         //
+                 zVAR_RECCOUNT_, slab.recordCount,          //
+                 zVAR_RECINTERVAL_, slab.recordInterval,    //
+                 zVAR_DIMINDICES_, slab.start.data(),       //
+                 zVAR_DIMCOUNTS_, slab.count.data(),        //
+                 zVAR_DIMINTERVALS_, slab.interval.data(),  //
+                 items...);
+}
+
 }  // namespace
 
 void Hyperslab::reverseDimensions() {
@@ -65,25 +78,12 @@ void skipNoRecordsThatDoNotVary(const VariableDescription& variable, LibraryHype
 }
 
 void selectHyperslab(const char* routine, CdfId file, long variable, const LibraryHyperslab& slab) {
-  callOnVariable(routine, file, variable,                 //
-                 zVAR_RECNUMBER_, slab.recordStart,       //
-                 zVAR_RECCOUNT_, slab.recordCount,        //
-                 zVAR_RECINTERVAL_, slab.recordInterval,  //
-                 zVAR_DIMINDICES_, slab.start.data(),     //
-                 zVAR_DIMCOUNTS_, slab.count.data(),      //
-                 zVAR_DIMINTERVALS_, slab.interval.data());
+  callOnHyperslab(routine, file, variable, slab);
 }
 
 void moveHyperslab(const char* routine, CdfId file, long variable, const LibraryHyperslab& slab,
                    long operation, const void* buffer) {
-  callOnVariable(routine, file, variable,                   //
-                 zVAR_RECNUMBER_, slab.recordStart,         //
-                 zVAR_RECCOUNT_, slab.recordCount,          //
-                 zVAR_RECINTERVAL_, slab.recordInterval,    //
-                 zVAR_DIMINDICES_, slab.start.data(),       //
-                 zVAR_DIMCOUNTS_, slab.count.data(),        //
-                 zVAR_DIMINTERVALS_, slab.interval.data(),  //
-                 operation, zVAR_HYPERDATA_, buffer);
+  callOnHyperslab(routine, file, variable, slab, operation, zVAR_HYPERDATA_, buffer);
 }
 
 }  // namespace TOLVEX::ambrix
