@@ -40,14 +40,13 @@ struct FileSetting {
   long item;
   const char* routine;
   const char* label;
-  long refused;  // given to the library in place of a number beyond 32 bits
 };
 
 /// A command (identifier, number) without a result.
 template <const FileSetting& row>
 void setFileNumber(int, qvArray*[], std::int32_t, const qvArray* arguments[], const CommandEntry*) {
   const CdfId file = getCdfIdArg(arguments[0]);
-  const long value = libraryNumber(getLongScalarArg(arguments[1], row.label), row.refused);
+  const long value = libraryNumber(getLongScalarArg(arguments[1], row.label), kBadNumber);
   if constexpr (row.operation == SELECT_) {
     callOnFile(row.routine, file, row.item, value);
   } else {
@@ -66,15 +65,13 @@ inline constexpr FileNumber kGetStageCacheSize       {CONFIRM_, STAGE_CACHESIZE_
 inline constexpr FileNumber kGetCompressionCacheSize {CONFIRM_, COMPRESS_CACHESIZE_, "CDFgetCompressionCacheSize"};
 
 // "setFormat" labels its argument like a cache size: users know it under that label.
-// What is too large for the library must not become -1 in "setReadOnlyMode", where that means on.
-inline constexpr FileSetting kSetFormat               {PUT_,    CDF_FORMAT_,         "CDFsetFormat",               "NUMBUFFERS", kBadNumber};
-inline constexpr FileSetting kSetChecksum             {PUT_,    CDF_CHECKSUM_,       "CDFsetChecksum",             "MODE",       kBadNumber};
-inline constexpr FileSetting kSetMajority             {PUT_,    CDF_MAJORITY_,       "CDFsetMajority",             "MAJORITY",   kBadNumber};
-inline constexpr FileSetting kSetReadOnlyMode         {SELECT_, CDF_READONLY_MODE_,  "CDFsetReadOnlyMode",         "MODE",       kNoSuchNumber};
-inline constexpr FileSetting kSetCacheSize            {SELECT_, CDF_CACHESIZE_,      "CDFsetCacheSize",            "NUMBUFFERS", kBadNumber};
-inline constexpr FileSetting kSetVarsCacheSize        {SELECT_, zVARs_CACHESIZE_,    "CDFsetzVarsCacheSize",       "NUMBUFFERS", kBadNumber};
-inline constexpr FileSetting kSetStageCacheSize       {SELECT_, STAGE_CACHESIZE_,    "CDFsetStageCacheSize",       "NUMBUFFERS", kBadNumber};
-inline constexpr FileSetting kSetCompressionCacheSize {SELECT_, COMPRESS_CACHESIZE_, "CDFsetCompressionCacheSize", "NUMBUFFERS", kBadNumber};
+inline constexpr FileSetting kSetFormat               {PUT_,    CDF_FORMAT_,         "CDFsetFormat",               "NUMBUFFERS"};
+inline constexpr FileSetting kSetChecksum             {PUT_,    CDF_CHECKSUM_,       "CDFsetChecksum",             "MODE"};
+inline constexpr FileSetting kSetMajority             {PUT_,    CDF_MAJORITY_,       "CDFsetMajority",             "MAJORITY"};
+inline constexpr FileSetting kSetCacheSize            {SELECT_, CDF_CACHESIZE_,      "CDFsetCacheSize",            "NUMBUFFERS"};
+inline constexpr FileSetting kSetVarsCacheSize        {SELECT_, zVARs_CACHESIZE_,    "CDFsetzVarsCacheSize",       "NUMBUFFERS"};
+inline constexpr FileSetting kSetStageCacheSize       {SELECT_, STAGE_CACHESIZE_,    "CDFsetStageCacheSize",       "NUMBUFFERS"};
+inline constexpr FileSetting kSetCompressionCacheSize {SELECT_, COMPRESS_CACHESIZE_, "CDFsetCompressionCacheSize", "NUMBUFFERS"};
 // clang-format on
 
 }  // namespace TOLVEX::ambrix
