@@ -14,7 +14,7 @@ import columns
 import measure
 import plot
 import report
-from workloads import SETTINGS, WORKLOADS
+from workloads import SETTINGS, WORKLOADS, Workload
 
 ROOT = pathlib.Path(__file__).resolve().parent.parent
 MEMORY = pathlib.Path("/dev/shm")
@@ -40,6 +40,9 @@ def arguments():
     options = parser.parse_args()
     if options.document and (options.only or options.quick):
         parser.error("--document is for all workloads in full")
+    if not any(chosen(names, options.only) for names in map(names_of, (*WORKLOADS, *SETTINGS))):
+        parser.error("no workload has that in its name: " +
+                     ", ".join(workload.name for workload in WORKLOADS))
     return options
 
 
@@ -47,6 +50,13 @@ def working_folder():
     """Files in memory: what is measured is not the disk."""
     roomy = MEMORY.is_dir() and shutil.disk_usage(MEMORY).free > BYTES_NEEDED
     return tempfile.TemporaryDirectory(prefix="ambrix-bench-", dir=MEMORY if roomy else None)
+
+
+def names_of(measured):
+    """All by which a workload or a setting can be chosen."""
+    if isinstance(measured, Workload):
+        return [measured.name, measured.title]
+    return [measured.before, measured.after, measured.title]
 
 
 def chosen(names, only):
@@ -85,7 +95,7 @@ def run(options, folder):
     found[0].run("prepare")
     results, settings = {}, {}
     for workload in WORKLOADS:
-        if not chosen([workload.name, workload.title], options.only):
+        if not chosen(names_of(workload), options.only):
             continue
         print(f"  {workload.name}", end="", file=sys.stderr, flush=True)
         facts = measure.measure(workload.name, found, rounds, sittings)
@@ -93,7 +103,7 @@ def run(options, folder):
             column["calls"] = (workload.calls or 1) // divisor or 1
         results[workload.name] = facts
     for setting in SETTINGS:
-        if chosen([setting.before, setting.after, setting.title], options.only):
+        if chosen(names_of(setting), options.only):
             print(f"  {setting.after}", end="", file=sys.stderr, flush=True)
             settings[setting.title] = measure.measure_setting(setting, found[1], rounds)
     print(file=sys.stderr)
@@ -107,9 +117,6 @@ def main():
         results = run(options, folder)
     tables = {"workloads": report.main_rows(WORKLOADS, results["workloads"], not options.quick),
               "settings": report.setting_rows(SETTINGS, results["settings"])}
-    if all(len(rows) == 1 for rows in tables.values()):
-        sys.exit("no workload has that in its name: " +
-                 ", ".join(workload.name for workload in WORKLOADS))
     for rows in tables.values():
         if len(rows) > 1:
             print(report.terminal(rows), end="\n\n")

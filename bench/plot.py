@@ -34,11 +34,10 @@ def commands(shown, columns, path):
 
 
 def draw(workloads, results, path):
-    """Draws nothing where gnuplot is not installed; tells whether it has drawn."""
+    """Draws nothing where gnuplot is not installed."""
     shown = [(workload.title, results[workload.name]) for workload in workloads
              if "ratio" in results.get(workload.name, {}).get("module", {})]
     columns = list(dict.fromkeys(name for _, facts in shown for name in facts if name != "library"))
     if not shown or not shutil.which("gnuplot"):
-        return False
+        return
     subprocess.run(["gnuplot"], input=commands(shown, columns, path), text=True, check=True)
-    return True
