@@ -3,8 +3,13 @@
 1;
 
 function files = functionFiles ()
-  package = fullfile (getenv ("AMBRIX_OCTAVE"), "+ambrix");
-  files = [glob(fullfile (package, "*.m")); glob(fullfile (package, "+internal", "*.m"))];
+  files = glob (fullfile (getenv ("AMBRIX_OCTAVE"), "*.m"));
+endfunction
+
+## All functions that users call: for whole files, and one for each command.
+function names = expectedFunctions (commands)
+  names = cellfun (@(command) ["ambrix_" command.name], commands, "UniformOutput", false);
+  names = sort ([names; {"ambrix"; "ambrix_info"; "ambrix_read"; "ambrix_write"; "ambrix_plot"}]);
 endfunction
 
 function commands = table ()
@@ -28,27 +33,25 @@ endfunction
 function identifier = raisedWith (name, count)
   identifier = "";
   try
-    feval (["ambrix." name], repmat ({{}}, 1, count){:});
+    feval (["ambrix_" name], repmat ({{}}, 1, count){:});
   catch err
     identifier = err.identifier;
   end_try_catch
 endfunction
 
 function testThereIsAFunctionForEachCommand (commands)
-  names = cellfun (@(command) command.name, commands, "UniformOutput", false);
-  [~, functions] = cellfun (@fileparts, functionFiles (), "UniformOutput", false);
-  here = functions(! strcmp (cellfun (@fileparts, functionFiles (), "UniformOutput", false),
-                             fullfile (getenv ("AMBRIX_OCTAVE"), "+ambrix", "+internal")));
-  assert (numel (names), 91);
-  assert (sort (here), sort ([names; {"info"; "read"; "write"; "plot"}]));
+  [~, names] = cellfun (@fileparts, functionFiles (), "UniformOutput", false);
+  isInternal = strncmp (names, "__ambrix_", 9);
+  assert (numel (commands), 91);
+  assert (sort (names(! isInternal)), expectedFunctions (commands));
+  assert (all (strncmp (flip (names(isInternal){1})(1:2), "__", 2)));
 endfunction
 
 ## INDEX tells users what there is.
 function testTheIndexListsEachFunction (commands)
-  names = cellfun (@(command) command.name, commands, "UniformOutput", false);
   index = fileread (fullfile (getenv ("AMBRIX_OCTAVE"), "INDEX"));
-  listed = regexp (index, '^ +ambrix\.(\w+)$', "tokens", "lineanchors");
-  assert (sort ([listed{:}]'), sort ([names; {"info"; "read"; "write"; "plot"}]));
+  listed = regexp (index, '^ (ambrix\w*)$', "tokens", "lineanchors");
+  assert (sort ([listed{:}]'), expectedFunctions (commands));
 endfunction
 
 function testFunctionsTakeAndReturnAsManyAsTheTableSays (commands)
@@ -56,7 +59,7 @@ function testFunctionsTakeAndReturnAsManyAsTheTableSays (commands)
   for k = 1:numel (commands)
     [least, most] = counts (commands{k});
     name = commands{k}.name;
-    assert (nargout (["ambrix." name]), numel (commands{k}.results), name);
+    assert (nargout (["ambrix_" name]), numel (commands{k}.results), name);
     for count = setdiff ([least - 1, most + 1, most + 9], -1)
       assert (raisedWith (name, count), wrong, name);
     endfor
@@ -68,14 +71,24 @@ endfunction
 
 function testEveryFunctionHasHelp ()
   for file = functionFiles ()'
-    [folder, name] = fileparts (file{1});
-    [~, above] = fileparts (folder);
-    whole = ["ambrix." strrep(above, "+internal", "internal.") name];
-    whole = strrep (whole, "+ambrix", "");
-    [text, form] = get_help_text (whole);
-    assert (form, "texinfo", whole);
-    assert (any (strfind (text, ["ambrix." ])), whole);
+    [~, name] = fileparts (file{1});
+    [text, form] = get_help_text (name);
+    assert (form, "texinfo", name);
+    assert (any (strfind (text, [" " name " ("])), name);
   endfor
+endfunction
+
+## What users do at the prompt.
+function testFunctionsAreFoundAndTheirResultsIndexed ()
+  assert (strtrim (completion_matches ("ambrix_hyperG")), "ambrix_hyperGetVarData");
+  found = evalc ("lookfor CDF");
+  for name = {"ambrix", "ambrix_read", "ambrix_create"}
+    assert (any (regexp (found, ["^" name{1} " +\\w"], "once", "lineanchors")), name{1});
+  endfor
+  assert (any (strfind (evalc ("help ambrix"), "ambrix_plot (FILE, NAME)")));
+  [id, restore] = __ambrix_example__ ();
+  assert (ambrix_read (id, "Flux")(2,1), single (7));
+  ambrix_close (id);
 endfunction
 
 function testTestsInFunctionsPass ()
@@ -91,4 +104,5 @@ testThereIsAFunctionForEachCommand (commands);
 testTheIndexListsEachFunction (commands);
 testFunctionsTakeAndReturnAsManyAsTheTableSays (commands);
 testEveryFunctionHasHelp ();
+testFunctionsAreFoundAndTheirResultsIndexed ();
 testTestsInFunctionsPass ();

@@ -1,4 +1,4 @@
-"""Everything in real files as ambrix.read gives it, and as ambrix.write writes it back, is what the
+"""Everything in real files as ambrix_read gives it, and as ambrix_write writes it back, is what the
 independent readers find."""
 
 import tempfile

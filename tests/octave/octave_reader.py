@@ -130,7 +130,7 @@ def _attribute(listed, content):
 
 
 def content(path):
-    """What ambrix.read found; variables of an unsupported datatype are None."""
+    """What ambrix_read found; variables of an unsupported datatype are None."""
     read = load(path)
     found = Content(as_text(read["file"]["majority"]) == "ROW_MAJOR")
     if flat(read["library"]) < (3, 9):

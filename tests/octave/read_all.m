@@ -1,7 +1,7 @@
 ## usage: octave-cli read_all.m FOLDER FILE...
 ##
-## Reads each file by ambrix.read, writes what it got to FOLDER/NAME.bin for other programs, and by
-## ambrix.write to FOLDER/NAME.cdf, and makes the text that ambrix.info prints.
+## Reads each file by ambrix_read, writes what it got to FOLDER/NAME.bin for other programs, and by
+## ambrix_write to FOLDER/NAME.cdf, and makes the text that ambrix_info prints.
 1;
 
 ## Each leaf of the struct: its path, its class, its sizes and its bytes. `path` ends in a
@@ -54,16 +54,16 @@ warning ("off", "TOLVEX:ambrix:cdflib:invalidCompressionParameter");
 folder = argv (){1};
 for file = argv ()(2:end)'
   [~, name] = fileparts (file{1});
-  s = ambrix.read (file{1});
-  ambrix.write (fullfile (folder, name), s);
-  assertSame (ambrix.read (fullfile (folder, name)), s, name);
-  assert (! isempty (ambrix.internal.descriptionText (s)), name);
+  s = ambrix_read (file{1});
+  ambrix_write (fullfile (folder, name), s);
+  assertSame (ambrix_read (fullfile (folder, name)), s, name);
+  assert (! isempty (__ambrix_descriptionText__ (s)), name);
   for [data, variable] = s.data
     if (iscell (data))  # many cells, slow to dump
-      s.data.(variable) = ambrix.read (file{1}, variable, "text", "char");
+      s.data.(variable) = ambrix_read (file{1}, variable, "text", "char");
     endif
   endfor
-  [s.library(1), s.library(2)] = ambrix.getLibraryVersion ();
+  [s.library(1), s.library(2)] = ambrix_getLibraryVersion ();
   stream = fopen (fullfile (folder, [name ".bin"]), "w");
   dump (stream, s, "");
   fclose (stream);

@@ -19,37 +19,37 @@ class FunctionTests:
         most = len(command["arguments"])
         for count in sorted({least - 1, most + 1, most + 5} - {-1}):
             given = ", ".join(["{}"] * count)
-            tests.append(f"%!error id={WRONG_COUNT} ambrix.{command['name']} ({given})\n")
+            tests.append(f"%!error id={WRONG_COUNT} ambrix_{command['name']} ({given})\n")
         for position, argument in enumerate(command["arguments"]):
             if "constant" in argument:
                 given = ["0"] * most
                 given[position] = "'NO_SUCH_CONSTANT'"
                 tests.append(f"%!error id={CDFLIB}:unrecognizedConstantName"
-                             f" ambrix.{command['name']} ({', '.join(given)})\n")
+                             f" ambrix_{command['name']} ({', '.join(given)})\n")
         return "\n".join(tests)
 
     def example_test(self, command, by_name):
-        lines = ["test", "[id, restore] = ambrix.internal.example ();"]
+        lines = ["test", "[id, restore] = __ambrix_example__ ();"]
         files = ["id"]
         for line in command["example"]:
             if line.startswith(PROMPT):
                 call = self.calls.in_octave(line[len(PROMPT):], by_name)
-                opened = re.match(r"(\w+) = ambrix\.(?:create|open) \(", call)
+                opened = re.match(r"(\w+) = ambrix_(?:create|open) \(", call)
                 files += [opened[1]] if opened else []
-                closed = re.match(r"ambrix\.(?:close|delete) \((\w+)\)", call)
+                closed = re.match(r"ambrix_(?:close|delete) \((\w+)\)", call)
                 files = [file for file in files if not closed or file != closed[1]]
                 lines.append(call.rstrip(";") + ";")
             elif line.startswith("error: "):
                 lines += self.expected_error(lines.pop(), line[len("error: "):])
             else:
                 lines.append(self.expected(line, command.get("depends_on_library")))
-        lines += [f"ambrix.close ({file});" for file in files]
+        lines += [f"ambrix_close ({file});" for file in files]
         return "%!" + prefixed(lines, "%! ")[3:]
 
     @staticmethod
     def expected_error(call, shown):
         identifier, _, values = shown.partition(" ")
-        lines = [f"err = ambrix.internal.raised (@() {call.rstrip(';')});",
+        lines = [f"err = __ambrix_raised__ (@() {call.rstrip(';')});",
                  f"assert (err.identifier, '{identifier}');"]
         values = re.findall(r"'((?:[^']|'(?=[a-z]))*)'|(-?\d+)", values)
         if identifier.endswith("libraryFailure"):

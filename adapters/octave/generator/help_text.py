@@ -41,7 +41,7 @@ class HelpText:
             if position % 2:
                 parts[position] = f"@code{{{escaped(part)}}}"
             else:
-                parts[position] = self.quoted.sub(r"@code{ambrix.\1}", escaped(part))
+                parts[position] = self.quoted.sub(r"@code{ambrix_\1}", escaped(part))
         return "".join(parts)
 
     def lines(self, command):
@@ -58,7 +58,7 @@ class HelpText:
         lines += self.described("Warnings:", "@code",
                                 map(self.error, command.get("warnings", [])))
         lines += self.shown_example(command)
-        others = [f"ambrix.{c['name']}" for c in self.commands
+        others = [f"ambrix_{c['name']}" for c in self.commands
                   if c["subject"] == command["subject"] and c is not command]
         return lines + [f"@seealso{{{', '.join(others)}}}", "@end deftypefn"]
 
@@ -69,7 +69,7 @@ class HelpText:
         arguments = [f"@var{{{a['name']}}}" for a in command["arguments"]]
         counts = {sum(not a.get("optional") for a in command["arguments"]), len(arguments)}
         return [f"@deftypefn{'x' if position else ''} {{}} {{{left + ' =' if left else ''}}} "
-                f"ambrix.{command['name']} ({', '.join(arguments[:count])})"
+                f"ambrix_{command['name']} ({', '.join(arguments[:count])})"
                 for position, count in enumerate(sorted(counts))]
 
     @staticmethod
@@ -117,7 +117,7 @@ class HelpText:
         return f"{self.components[row['identifier']]}:{row['identifier']}", when + "."
 
     def shown_example(self, command):
-        lines = ["", "@example", "@group", "id = ambrix.open ('example.cdf');"]
+        lines = ["", "@example", "@group", "id = ambrix_open ('example.cdf');"]
         for line in command["example"]:
             if line.startswith(PROMPT):
                 lines.append(escaped(self.calls.in_octave(line[len(PROMPT):])))

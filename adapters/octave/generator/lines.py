@@ -20,4 +20,4 @@ class Calls:
         """A line of an example with the package's functions; constants by name, or number."""
         if by_name:
             line = CONSTANT.sub(r"'\1'", line)
-        return self.call.sub(r"ambrix.\1 (", line)
+        return self.call.sub(r"ambrix_\1 (", line)

@@ -1,0 +1,246 @@
+## -*- texinfo -*-
+## @deftypefn  {} {} ambrix_write (@var{file}, @var{s})
+## @deftypefnx {} {} ambrix_write (@var{file}, @var{s}, "overwrite")
+## Write a struct of arrays to a new CDF file.
+##
+## @var{file} is the path of the file; @code{.cdf} is added where it is missing. A file that exists
+## is the error @code{ambrix:fileExists}, or is replaced when the option @qcode{"overwrite"} is given.
+## The new file appears whole or not at all.
+##
+## @var{s} is a struct that @code{ambrix_read} has returned, or a struct of arrays, one for each
+## variable. The first dimension of an array is that of the records, and a text is a row of
+## characters or a cell of a cell array. What else there is to say has the place in @var{s} where
+## @code{ambrix_read} puts it; everything but the data can be left out:
+##
+## @table @code
+## @item s.data.(@var{name})
+## the data of a variable
+## @item s.variables.(@var{name}).datatype
+## its datatype, such as @qcode{"CDF_EPOCH"}; the first in the table below that belongs to the class
+## of the data where it is not given
+## @item s.variables.(@var{name}).attributes.(@var{attribute})
+## an attribute of the variable
+## @item s.variables.(@var{name}).recordVariance
+## false for data that don't differ from record to record, and have no dimension for records
+## @item s.variables.(@var{name}).compression
+## such as @qcode{"GZIP_COMPRESSION"}, with a level in @code{compressionParameter}
+## @item s.attributes.(@var{name})
+## a global attribute: one value, or a cell array of several
+## @item s.file.majority
+## and @code{format}, @code{checksum}, @code{compression} and @code{compressionParameter} of the
+## file; without them it is column-major, a single file, not compressed
+## @end table
+##
+## Also @code{sizes}, @code{variances}, @code{sparseRecords}, @code{padValue} and
+## @code{blockingFactor} of a variable are those that @code{ambrix_info} describes.
+##
+## The datatypes by class: double CDF_DOUBLE, single CDF_FLOAT, int8 CDF_INT1, int16 CDF_INT2, int32
+## CDF_INT4, uint8 and logical CDF_UINT1, uint16 CDF_UINT2, uint32 CDF_UINT4, text CDF_CHAR.
+##
+## What @code{ambrix_read} has read is written back the same, but for the encoding, which becomes
+## that of the computer, for rVariables, which become zVariables, and for what it had to leave out.
+##
+## @example
+## @group
+## s.data.Epoch = ambrix_computeEpoch ([2024 2024; 1 1; 1 1; 0 0; 0 1; 0 0; 0 0]).';
+## s.data.B = single ([4.5 0.5 -2; 4 0 -1.5]);
+## s.variables.Epoch.datatype = "CDF_EPOCH";
+## s.variables.B.attributes.UNITS = "nT";
+## s.variables.B.attributes.DEPEND_0 = "Epoch";
+## s.attributes.Title = "Magnetic field";
+## ambrix_write ("field", s);
+## @end group
+## @end example
+## @seealso{ambrix_read, ambrix_info, ambrix_create}
+## @end deftypefn
+
+function ambrix_write (file, s, varargin)
+  if (nargin < 2)
+    print_usage ();
+  endif
+  options = __ambrix_parseOptions__ ("ambrix_write", struct ("overwrite", false), varargin);
+  if (! ischar (file) || rows (file) != 1)
+    error ("ambrix:invalidFile", "ambrix_write: give the path of the file as a text");
+  endif
+  s = __ambrix_completeStruct__ (s);
+  target = targetOf (file);
+  if (! options.overwrite && ! isempty (stat ([target ".cdf"])))
+    error ("ambrix:fileExists",
+           "ambrix_write: there is a file \"%s.cdf\"; option \"overwrite\" replaces it", target);
+  endif
+  temporary = fullfile (fileparts (target), [".ambrix" regexprep(tempname (), '.*-', "-")]);
+  id = __ambrix__ ("create", temporary);
+  discard = onCleanup (@() discardFile (id, temporary));
+  fillFile (id, s);
+  __ambrix__ ("close", id);
+  __ambrix_moveFile__ (temporary, target, options.overwrite);
+endfunction
+
+## The path without ".cdf", of the file itself where there is a link to it.
+function target = targetOf (file)
+  target = tilde_expand (file);
+  if (strcmpi (target(max (end-3, 1):end), ".cdf"))
+    target(end-3:end) = "";
+  endif
+  if (isempty (target) || target(end) == "/")
+    error ("ambrix:invalidFile", "ambrix_write: \"%s\" holds no name of a file", file);
+  endif
+  there = lstat ([target ".cdf"]);
+  if (! isempty (there) && S_ISLNK (there.mode))
+    linked = regexp (canonicalize_file_name ([target ".cdf"]), '^(.+)\.cdf$', "tokens", "once");
+    target = [linked, {target}]{1};
+  endif
+endfunction
+
+function fillFile (id, s)
+  applySettings (id, s.file);
+  rowMajor = strcmp (__ambrix__ ("getMajority", id), "ROW_MAJOR");
+  numbers = struct ();
+  for [v, name] = s.variables
+    [v, data] = __ambrix_completeVariable__ (name, v, s, rowMajor);
+    numbers.(name) = __ambrix_writeVariable__ (id, v, data, rowMajor);
+    s.variables.(name) = v;
+  endfor
+  __ambrix_writeAttributes__ (id, s, numbers);
+endfunction
+
+## In the order that the library wants: format and compression before there are variables.
+function applySettings (id, file)
+  ambrix_setFormat (id, file.format);
+  ambrix_setMajority (id, file.majority);
+  if (! strcmpi (file.checksum, "NO_CHECKSUM"))
+    ambrix_setChecksum (id, file.checksum);
+  endif
+  compression = __ambrix_compressionArguments__ (file);
+  if (! isempty (compression))
+    ambrix_setCompression (id, compression{:});
+  endif
+endfunction
+
+function discardFile (id, temporary)
+  try
+    __ambrix__ ("delete", id);
+  catch
+    # it was closed, and most likely renamed
+  end_try_catch
+  for part = [__ambrix_partsOf__(temporary), {[temporary ".cdf"]}]
+    if (! isempty (stat (part{1})))
+      unlink (part{1});
+    endif
+  endfor
+endfunction
+
+%!function s = back (s, varargin)
+%!  [id, restore] = __ambrix_example__ ();
+%!  ambrix_close (id);
+%!  ambrix_write ("written", s);
+%!  s = ambrix_read ("written", varargin{:});
+%!endfunction
+
+%!test  # a plain struct of arrays
+%! plain = struct ("a", [1; 2; 3], "b", single (magic (4)), "c", {{"one"; "three"}}, ...
+%!                 "d", "text", "e", uint8 (reshape (1:24, 2, 3, 4)), "f", true, "x y", int16 (7));
+%! s = back (plain);
+%! plain.d = {"text"};
+%! plain.f = uint8 (1);
+%! assert (s.data, plain);
+%! assert (s.file.majority, "COLUMN_MAJOR");
+%! assert (s.variables.e.sizes, [3, 4]);
+
+%!test  # a constant given by its number
+%! s = struct ("data", struct ("a", reshape (1:24, 2, 3, 4)), "file", struct ("majority", 1));
+%! r = back (s);
+%! assert (r.file.majority, "ROW_MAJOR");
+%! assert (r.data.a, s.data.a);
+%! assert (r.variables.a.sizes, [3, 4]);
+
+%!test  # what is described
+%! s = struct ();
+%! s.data.Epoch = ambrix_computeEpoch ([2024, 2024; 1, 1; 1, 1; 0, 0; 0, 1; 0, 0; 0, 0]).';
+%! s.data.B = single ([4.5, 0.5, -2; 4, 0, -1.5]);
+%! s.data.names = {"Bx"; "By"; "Bz"};
+%! s.variables.names.recordVariance = false;
+%! s.variables.Epoch.datatype = "cdf_epoch";
+%! s.variables.B.attributes.UNITS = "nT";
+%! s.variables.B.attributes.FILLVAL = single (-1e31);
+%! s.variables.B.compression = "GZIP_COMPRESSION";
+%! s.attributes.Title = "Magnetic field";
+%! s.attributes.TEXT = {"line 1"; int16([1, 2]); ""};
+%! s.file.majority = "ROW_MAJOR";
+%! s.file.checksum = "MD5_CHECKSUM";
+%! r = back (s);
+%! assert (r.data, s.data);
+%! assert (r.file.majority, "ROW_MAJOR");
+%! assert (r.file.checksum, "MD5_CHECKSUM");
+%! assert (r.attributes, s.attributes);
+%! assert (r.variables.Epoch.datatype, "CDF_EPOCH");
+%! assert (r.variables.B.attributes, s.variables.B.attributes);
+%! assert (r.variables.B.compressionParameter, 6);
+%! assert (r.attributeList(4).datatypes, {"CDF_FLOAT"});
+%! assert (r.variables.names.recordVariance, false);
+
+%!test  # options of reading are undone
+%! days = [datenum(2024, 5, 6, 7, 8, 9.25); NaN];
+%! s = struct ();
+%! s.data = struct ("t", days, "u", days, "v", [1; NaN]);
+%! s.variables.t.datatype = "CDF_EPOCH";
+%! s.variables.u.datatype = "CDF_EPOCH16";
+%! s.variables.v.attributes.FILLVAL = -99;
+%! s.options = struct ("time", true, "fill", true);
+%! r = back (s);
+%! assert (r.data.t, [ambrix_computeEpoch([2024; 5; 6; 7; 8; 9; 250]); -1e31]);
+%! assert (r.data.v, [1; -99]);
+%! r = back (s, {}, "time", "fill");
+%! assert (r.data.t, days, 1e-9);
+%! assert (r.data.u, days, 1e-9);
+%! assert (r.data.v, [1; NaN]);
+
+%!test  # files that exist are replaced only when asked
+%! [id, restore] = __ambrix_example__ ();
+%! ambrix_close (id);
+%! err = __ambrix_raised__ (@() ambrix_write ("example.cdf", struct ("a", 1)));
+%! assert (err.identifier, "ambrix:fileExists");
+%! ambrix_write ("example", struct ("a", 1), "overwrite");
+%! s = ambrix_read ("example");
+%! assert (s.data, struct ("a", 1));
+
+%!test  # a failure leaves nothing behind
+%! [id, restore] = __ambrix_example__ ();
+%! ambrix_close (id);
+%! s.data = struct ("a", 1);
+%! s.variables.a.datatype = "CDF_INT4";
+%! err = __ambrix_raised__ (@() ambrix_write ("bad", s));
+%! assert (err.identifier, "TOLVEX:ambrix:cdflib:datatypeMismatch");
+%! assert (readdir ("."), {"."; ".."; "example.cdf"});
+
+%!testif ; isunix ()  # a link stays one
+%! [id, restore] = __ambrix_example__ ();
+%! ambrix_close (id);
+%! symlink ("example.cdf", "link.cdf");
+%! ambrix_write ("link", struct ("a", 1), "overwrite");
+%! assert (ambrix_read ("example", "a"), 1);
+%! assert (S_ISLNK (lstat ("link.cdf").mode));
+
+%!test  # the home folder
+%! [id, restore] = __ambrix_example__ ();
+%! ambrix_close (id);
+%! home = getenv ("HOME");
+%! unwind_protect
+%!   setenv ("HOME", pwd ());
+%!   ambrix_write ("~/mine", struct ("a", 1));
+%!   assert (ambrix_read ("~/mine.cdf", "a"), 1);
+%! unwind_protect_cleanup
+%!   setenv ("HOME", home);
+%! end_unwind_protect
+%! assert (readdir ("."), {"."; ".."; "example.cdf"; "mine.cdf"});
+
+%!test  # no data are no records of a scalar variable
+%! s = back (struct ("a", [], "t", "", "c", {{}}));
+%! assert (s.data, struct ("a", zeros (0, 1), "t", {cell(0, 1)}, "c", {cell(0, 1)}));
+%!error id=ambrix:invalidFile ambrix_write ("", struct ())
+%!error id=ambrix:invalidFile ambrix_write ("/tmp/.cdf", struct ())
+%!error id=ambrix:invalidFile ambrix_write (1, struct ())
+%!error id=ambrix:invalidData ambrix_write ("x", 1)
+%!error id=ambrix:invalidOption ambrix_write ("x", struct (), "force")
+%!error id=TOLVEX:ambrix:cdflib:fileCreateError ambrix_write ("/no such folder/x", struct ("a", 1))
+%!error id=Octave:invalid-fun-call ambrix_write ("x")
