@@ -47,27 +47,36 @@ int info(const Context& context) {
 }
 
 int dump(const Context& context) {
-  DumpOptions options = context.arguments.dump;
-  const std::string file = options.file;
-  options.file = fs::absolute(file).string();  // the folder changes to that of the output
+  const DumpOptions& options = context.arguments.dump;
   std::optional<OutputFile> output;
   if (!options.output.empty()) output.emplace(options.output);
-  const int status = readInWorker(context, file, [&](Module& module) {
-    if (output) context.output.redirect(output->temporaryName());
+  const int status = readInWorker(context, options.file, [&](Module& module) {
+    if (output) context.output.redirect(output->folder() / output->unfinishedName());
     runDump(module, options, context.output);
   });
   if (output && status == EXIT_SUCCESS) output->publish();
   return status;
 }
 
+/// Enters the folder of the output, because the library creates no file whose path has characters
+/// outside ASCII. Returns a way to the input from there that is no longer than its name, because
+/// the library takes no long ones.
+std::string enterFolder(const OutputFile& output, const fs::path& input) {
+  const char* const way = "input";
+  fs::create_directory_symlink(fs::absolute(input).parent_path(), output.folder() / way);
+  fs::current_path(output.folder());
+  return fs::path(way) / input.filename();
+}
+
 int convert(const Context& context) {
   ConvertOptions options = context.arguments.convert;
   checkOptions(options);
   const std::string file = options.input;
-  options.input = fs::absolute(file).string();  // parts of it may be opened later
   OutputFile output(chooseOutput(options.output), ".cdf");
-  const int status = readInWorker(
-      context, file, [&](Module& module) { runConvert(module, options, output.temporaryName()); });
+  const int status = readInWorker(context, file, [&](Module& module) {
+    options.input = enterFolder(output, file);
+    runConvert(module, options, output.unfinishedName());
+  });
   if (status == EXIT_SUCCESS) output.publish();
   return status;
 }

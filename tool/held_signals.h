@@ -5,11 +5,12 @@
 
 namespace ambrix::tool {
 
-/// Whether the signal is one with which people and systems end programs.
-bool isEndingSignal(int signal) noexcept;
+/// Whether a process that ends by the signal has crashed. Any other one but SIGKILL is somebody's
+/// wish.
+bool isCrash(int signal) noexcept;
 
-/// Holds back the signals that would end this process, but those that are ignored, and those that
-/// tell of children. What has come meanwhile takes effect when this object goes.
+/// Holds back every signal that would end this process, and those that tell of children. What has
+/// come meanwhile takes effect when this object goes.
 class HeldSignals {
  public:
   HeldSignals() noexcept;

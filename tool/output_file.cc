@@ -4,7 +4,9 @@
 #include <unistd.h>
 
 #include <cerrno>
+#include <cstdlib>
 #include <system_error>
+#include <utility>
 
 #include "tool/failure.h"
 
@@ -13,37 +15,50 @@ namespace {
 
 namespace fs = std::filesystem;
 
-[[noreturn]] void failBecauseExists(const fs::path& path) {
-  throw ToolError("outputExists", path.string() + " exists, and is not overwritten");
+/// Throws unless nothing has the name yet.
+void requireFree(const fs::path& path) {
+  std::error_code error;
+  const fs::file_status found = fs::symlink_status(path, error);
+  if (fs::exists(found)) {
+    throw ToolError("outputExists", path.string() + " exists, and is not overwritten");
+  }
+  if (found.type() == fs::file_type::none) {
+    throw ToolError("cannotWrite", path.string() + ": " + error.message());
+  }
 }
 
-void enterFolder(const fs::path& folder) {
-  std::error_code error;
-  if (!folder.empty()) fs::current_path(folder, error);
-  if (error) throw ToolError("noSuchFolder", folder.string() + ": " + error.message());
+fs::path makeFolder(const fs::path& parent) {
+  std::string name = (parent / ".ambrix-XXXXXX").string();
+  if (::mkdtemp(name.data()) != nullptr) return name;
+  const int reason = errno;
+  const bool missing = reason == ENOENT || reason == ENOTDIR;
+  throw ToolError(
+      missing ? "noSuchFolder" : "cannotWrite",
+      (parent.empty() ? "." : parent.string()) + ": " + std::generic_category().message(reason));
 }
 
 }  // namespace
 
-OutputFile::OutputFile(const fs::path& path, const std::string& extension)
-    : name_(path.filename()),
-      temporaryName_(".ambrix-" + std::to_string(::getpid()) + "-unfinished" + extension) {
-  std::error_code ignored;
-  if (fs::exists(fs::symlink_status(path, ignored))) failBecauseExists(path);
-  enterFolder(path.parent_path());
+OutputFile::OutputFile(fs::path path, const std::string& extension)
+    : path_(std::move(path)), unfinishedName_("unfinished" + extension) {
+  requireFree(path_);
+  folder_ = makeFolder(path_.parent_path());
 }
 
 OutputFile::~OutputFile() {
-  ::unlink(temporaryName_.c_str());
+  std::error_code ignored;
+  for (const fs::directory_entry& entry : fs::directory_iterator(folder_, ignored))
+    fs::remove(entry, ignored);
+  fs::remove(folder_, ignored);
 }
 
 void OutputFile::publish() {
-  if (::link(temporaryName_.c_str(), name_.c_str()) == 0) return;  // the destructor does the rest
-  if (errno == EEXIST) failBecauseExists(name_);
+  const fs::path unfinished = folder_ / unfinishedName_;
+  if (::link(unfinished.c_str(), path_.c_str()) == 0) return;  // the destructor does the rest
+  requireFree(path_);
   std::error_code error;  // a file system without links
-  if (fs::exists(fs::symlink_status(name_, error))) failBecauseExists(name_);
-  fs::rename(temporaryName_, name_, error);
-  if (error) throw ToolError("cannotRename", name_.string() + ": " + error.message());
+  fs::rename(unfinished, path_, error);
+  if (error) throw ToolError("cannotRename", path_.string() + ": " + error.message());
 }
 
 fs::path withCdfExtension(const fs::path& path) {

@@ -8,28 +8,29 @@
 
 namespace ambrix::tool {
 
-/// A file on its way. It is written under a temporary name in the folder where it will stand,
-/// which becomes the current folder, because the CDF library creates no file whose path has
-/// characters outside ASCII. Unless `publish` is called, nothing stays when this object goes.
-/// Until then it holds back the signals that end the process.
+/// A file on its way. It is written in a new folder beside the place where it will stand, which
+/// nobody else can enter. Unless `publish` is called, nothing stays when this object goes. Until
+/// then it holds back the signals that end the process.
 class OutputFile {
  public:
-  /// The temporary name gets the extension. Throws `ToolError` when a file of that name exists or
-  /// its folder cannot be entered.
-  explicit OutputFile(const std::filesystem::path& path, const std::string& extension = "");
+  /// The unfinished file gets the extension. Throws `ToolError` when there is something of that
+  /// name or nothing can be written beside it.
+  explicit OutputFile(std::filesystem::path path, const std::string& extension = "");
   OutputFile(const OutputFile&) = delete;
   OutputFile& operator=(const OutputFile&) = delete;
   ~OutputFile();
 
-  /// Where to write.
-  [[nodiscard]] const std::string& temporaryName() const noexcept { return temporaryName_; }
+  /// The new folder, and the name of the file to write there.
+  [[nodiscard]] const std::filesystem::path& folder() const noexcept { return folder_; }
+  [[nodiscard]] const std::string& unfinishedName() const noexcept { return unfinishedName_; }
   /// Gives the file its name. Throws `ToolError` when another has come to bear it.
   void publish();
 
  private:
   HeldSignals held_;
-  std::filesystem::path name_;
-  std::string temporaryName_;
+  std::filesystem::path path_;
+  std::filesystem::path folder_;
+  std::string unfinishedName_;
 };
 
 /// The path with the extension ".cdf", which is added when there is none, in whatever case.

@@ -90,9 +90,9 @@ WorkerEnd endOf(int status, const Steps& steps) {
     end.status = WEXITSTATUS(status);
   } else {
     end.signal = WTERMSIG(status);
-    end.kind = isEndingSignal(end.signal) ? Kind::kInterrupted
-               : end.signal == SIGKILL    ? Kind::kKilled
-                                          : Kind::kCrashed;
+    end.kind = isCrash(end.signal)     ? Kind::kCrashed
+               : end.signal == SIGKILL ? Kind::kKilled
+                                       : Kind::kInterrupted;
   }
   return end;
 }
@@ -102,7 +102,7 @@ WorkerEnd watch(pid_t worker, const HeldSignals& held, const Steps& steps, doubl
   Patience patience(timeLimit, steps);
   for (;;) {
     const int signal = ::sigtimedwait(&held.all(), nullptr, &tick);
-    if (isEndingSignal(signal)) return giveUp(worker, Kind::kInterrupted, signal);
+    if (signal > 0 && signal != SIGCHLD) return giveUp(worker, Kind::kInterrupted, signal);
     bool gone = false;
     const int status = waitFor(worker, WNOHANG, gone);
     if (gone) return endOf(status, steps);

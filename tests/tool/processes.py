@@ -1,5 +1,6 @@
 """The processes of the tool, and a file that keeps them busy."""
 
+import glob
 import os
 import subprocess
 import time
@@ -67,15 +68,18 @@ class ProtectionCase(ToolCase):
     def converting(self, *options):
         """A conversion that has begun to write, and its worker."""
         process = self.start("convert", BUSY, "out.cdf", "--majority", "column", *options)
-        wait_until(lambda: len(self.files()) > 1)
+        wait_until(self.unfinished)
         return process, wait_until(lambda: children_of(process.pid))[0]
 
     def dumping(self, *options):
         """A dump into a file, and its worker."""
         process = self.start("dump", BUSY, "v", "--format", "csv", "--output", "out.csv", *options)
-        wait_until(lambda: any(os.path.getsize(self.path(f)) > 0 and "unfinished" in f
-                               for f in self.files()))
+        wait_until(lambda: any(os.path.getsize(path) > 0 for path in self.unfinished()))
         return process, wait_until(lambda: children_of(process.pid))[0]
+
+    def unfinished(self):
+        """The paths of outputs that are being written."""
+        return glob.glob(self.path(".ambrix-*/unfinished*"))
 
     def files(self):
         return sorted(os.listdir(self.folder))

@@ -134,7 +134,9 @@ class TimeLimitTest(ProtectionCase):
 class SignalTest(ProtectionCase):
     def test_the_tool_ends_by_the_signal_and_leaves_nothing(self):
         for begin in (self.converting, self.dumping):
-            for number in (signal.SIGINT, signal.SIGTERM, signal.SIGHUP, signal.SIGQUIT):
+            for number in (signal.SIGINT, signal.SIGTERM, signal.SIGHUP, signal.SIGQUIT,
+                           signal.SIGUSR1, signal.SIGUSR2, signal.SIGALRM, signal.SIGVTALRM,
+                           signal.SIGPROF, signal.SIGXCPU, signal.SIGIO, signal.SIGRTMIN):
                 process, worker = begin()
                 process.send_signal(number)
                 self.assertEqual(process.wait(), -number)
@@ -164,8 +166,8 @@ class SignalTest(ProtectionCase):
         process.kill()
         self.assertEqual(process.wait(), -signal.SIGKILL)
         wait_until(lambda: worker not in children_of(1) and not is_running(worker))
-        self.assertEqual([f for f in self.files() if f != BUSY],
-                         [f".ambrix-{process.pid}-unfinished.cdf"])  # nobody could remove it
+        self.assertEqual([os.path.basename(path) for path in self.unfinished()],
+                         ["unfinished.cdf"])  # nobody could remove it
 
     def test_a_reader_that_goes_away(self):
         process = self.start("dump", BUSY, "v", "--format", "csv", stdout=subprocess.PIPE)
@@ -196,6 +198,62 @@ class FullDiskTest(ProtectionCase):
         with open("/dev/full", "wb") as full:
             process = self.start("dump", BUSY, "v", "--records", "0", stdout=full)
         self.assertIn("standard output: " + os.strerror(errno.ENOSPC), self.error_of(process))
+
+
+class TemporaryFileTest(ProtectionCase):
+    """What is written before the output has its name."""
+
+    def test_files_of_others_are_left_alone(self):
+        process, _ = self.converting()
+        foreign = [f".ambrix-{process.pid + i}-unfinished.cdf" for i in range(1, 200)]
+        for name in foreign:
+            os.symlink("victim", self.path(name))
+        process.kill()
+        process.wait()
+        (unfinished,) = self.unfinished()
+        write_example(self.session(), "example", "ROW_MAJOR")
+        for name in ("a.cdf", "b.cdf"):
+            self.output("convert", "example.cdf", name)
+        self.output("dump", "example.cdf", "cube", "--output", "c.txt")
+        self.assertFalse(os.path.exists(self.path("victim")))
+        self.assertTrue(os.path.exists(unfinished))
+        self.assertEqual(self.files(), sorted(
+            [BUSY, "a.cdf", "b.cdf", "c.txt", "example.cdf",
+             os.path.basename(os.path.dirname(unfinished)), *foreign]))
+
+    def test_tools_with_the_same_number_do_not_meet(self):
+        tool = subprocess.list2cmdline([os.environ["AMBRIX_TOOL"]])
+        if subprocess.run(["unshare", "--pid", "--fork", "true"], capture_output=True).returncode:
+            self.skipTest("no namespaces of process numbers here")
+        write_example(self.session(), "example", "ROW_MAJOR")
+        command = f"for i in $(seq 8); do {tool} convert example.cdf out$0-$i.cdf || exit 1; done"
+        running = [subprocess.Popen(["unshare", "--pid", "--fork", "sh", "-c", command, str(i)],
+                                    cwd=self.folder) for i in range(2)]
+        self.assertEqual([process.wait() for process in running], [0, 0])
+        self.assertEqual(len(self.files()), 2 + 16)
+
+    def test_nobody_else_can_enter_its_folder_and_the_file_is_as_others(self):
+        process, _ = self.converting()
+        folder = os.path.dirname(self.unfinished()[0])
+        self.assertEqual(os.stat(folder).st_mode & 0o777, 0o700)
+        process.terminate()
+        process.wait()
+        mask = os.umask(0o027)
+        self.addCleanup(os.umask, mask)
+        self.output("dump", BUSY, "v", "--records", "60", "--output", "out.txt")
+        self.assertEqual(os.stat(self.path("out.txt")).st_mode & 0o777, 0o640)
+
+    def test_folders_that_cannot_be_written(self):
+        if os.geteuid() == 0:
+            self.skipTest("everything may be written here")
+        os.mkdir(self.path("fixed"), 0o500)
+        for command in (("convert", BUSY), ("dump", BUSY, "v", "--output")):
+            message = self.assert_fails("ambrix:cannotWrite", *command, "fixed/out.cdf")
+            self.assertEqual(message, "fixed: Permission denied")
+
+    def test_a_name_that_is_too_long_is_refused_before_the_work(self):
+        message = self.assert_fails("ambrix:cannotWrite", "dump", BUSY, "v", "--output", "x" * 300)
+        self.assertIn(os.strerror(errno.ENAMETOOLONG), message)
 
 
 class OutputTest(ProtectionCase):
