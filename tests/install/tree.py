@@ -32,10 +32,10 @@ Temperature: cdf_real4, 24 records of 2x2: 20 21.7 19.2 20.7
 """
 
 
-def run(*command, env=None):
+def run(*command, env=None, folder=None):
     """The standard output of a program, which must succeed."""
     done = subprocess.run([str(word) for word in command], stdout=subprocess.PIPE,
-                          stderr=subprocess.STDOUT, text=True, env=env)
+                          stderr=subprocess.STDOUT, text=True, env=env, cwd=folder)
     if done.returncode != 0:
         raise AssertionError(f"{command[0]} failed:\n{done.stdout}")
     return done.stdout
