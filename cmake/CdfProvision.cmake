@@ -32,14 +32,14 @@ macro(cdf_provision_library)
   set(cdf_include "${cdf_place}/include")
   set(cdf_samples "${cdf_place}/samples")
   set(cdf_version 3.9.1)
-  file(COPY "${cdf_place}/lib/libcdf.so" DESTINATION "${CMAKE_BINARY_DIR}/lib")
+  file(COPY "${cdf_place}/lib/libcdf.so" DESTINATION "${CMAKE_LIBRARY_OUTPUT_DIRECTORY}")
   add_library(cdf_shared SHARED IMPORTED GLOBAL)
   set_target_properties(cdf_shared PROPERTIES
-    IMPORTED_LOCATION "${CMAKE_BINARY_DIR}/lib/libcdf.so"
+    IMPORTED_LOCATION "${CMAKE_LIBRARY_OUTPUT_DIRECTORY}/libcdf.so"
     IMPORTED_NO_SONAME ON)  # else its path at build time would be recorded
   set(cdf_link cdf_shared)
   # Beside the module, where no other program takes it for the system's own.
-  install(PROGRAMS "${cdf_place}/lib/libcdf.so" DESTINATION "${CMAKE_INSTALL_LIBDIR}/ambrix")
+  install(PROGRAMS "${cdf_place}/lib/libcdf.so" DESTINATION "${AMBRIX_INSTALL_LIBDIR}")
 endmacro()
 
 macro(cdf_provision_source)

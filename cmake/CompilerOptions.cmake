@@ -17,14 +17,16 @@ foreach(language C CXX)
 endforeach()
 
 # The build tree is laid out like an installation and both use the same relative run paths, so that
-# either can be moved. (The run paths of the build are not padded for a rewrite at installation:
+# either can be moved. The libraries have a folder of their own: their names and interfaces are no
+# affair of the system's. (The run paths of the build are not padded for a rewrite at installation:
 # the padding would make the loader look in the current directory.)
 set(CMAKE_INSTALL_LIBDIR lib)
 set(CMAKE_RUNTIME_OUTPUT_DIRECTORY "${CMAKE_BINARY_DIR}/bin")
-set(CMAKE_LIBRARY_OUTPUT_DIRECTORY "${CMAKE_BINARY_DIR}/lib")
+set(AMBRIX_INSTALL_LIBDIR "${CMAKE_INSTALL_LIBDIR}/ambrix")
+set(CMAKE_LIBRARY_OUTPUT_DIRECTORY "${CMAKE_BINARY_DIR}/${AMBRIX_INSTALL_LIBDIR}")
 set(CMAKE_ARCHIVE_OUTPUT_DIRECTORY "${CMAKE_BINARY_DIR}/lib")
 set(CMAKE_BUILD_WITH_INSTALL_RPATH ON)
-set(CMAKE_INSTALL_RPATH "$ORIGIN/../lib")
+set(CMAKE_INSTALL_RPATH "$ORIGIN/../${AMBRIX_INSTALL_LIBDIR}")
 set(CMAKE_INSTALL_RPATH_USE_LINK_PATH ON)
 
 # What our own code is compiled with. The CDF library's sources are not ours and do not get it.

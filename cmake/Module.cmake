@@ -13,11 +13,10 @@ add_library(ambrix_module MODULE)
 set_target_properties(ambrix_module PROPERTIES
   PREFIX ""
   LINKER_LANGUAGE CXX
-  INSTALL_RPATH "$ORIGIN;$ORIGIN/.."  # the CDF library of an installation, and of the build
-  LIBRARY_OUTPUT_DIRECTORY "${CMAKE_LIBRARY_OUTPUT_DIRECTORY}/ambrix"
+  INSTALL_RPATH "$ORIGIN"  # the CDF library
   LINK_DEPENDS "${PROJECT_SOURCE_DIR}/cmake/module.map")
 target_link_libraries(ambrix_module PRIVATE ambrix_module_objects CDF::cdf)
 target_link_options(ambrix_module PRIVATE
   "LINKER:--version-script=${PROJECT_SOURCE_DIR}/cmake/module.map")
 
-install(TARGETS ambrix_module LIBRARY DESTINATION "${CMAKE_INSTALL_LIBDIR}/ambrix")
+install(TARGETS ambrix_module LIBRARY DESTINATION "${AMBRIX_INSTALL_LIBDIR}")

@@ -94,7 +94,7 @@ void LoadedLibrary::Close::operator()(void* handle) const noexcept {
 }
 
 std::filesystem::path defaultModulePath() {
-  return pathOfThisLibrary().parent_path() / "ambrix" / "ambrix_module.so";
+  return pathOfThisLibrary().parent_path() / "ambrix_module.so";
 }
 
 }  // namespace ambrix

@@ -101,8 +101,7 @@ TEST(EmbeddedLoadingTest, PathsMayBeRelative) {
 TEST(EmbeddedLoadingTest, TheModuleIsExpectedBesideTheLibrary) {
   const std::filesystem::path path = ambrix::defaultModulePath();
   EXPECT_EQ(path.filename(), "ambrix_module.so");
-  EXPECT_EQ(path.parent_path().filename(), "ambrix");
-  EXPECT_TRUE(std::filesystem::exists(path.parent_path().parent_path() / "libambrix_embedded.so"));
+  EXPECT_TRUE(std::filesystem::exists(path.parent_path() / "libambrix_embedded.so"));
 }
 
 }  // namespace

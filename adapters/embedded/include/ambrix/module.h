@@ -17,7 +17,7 @@
 
 namespace ambrix {
 
-/// Where the module is installed: ambrix/ambrix_module.so in the folder of this library.
+/// Where the module is installed: ambrix_module.so in the folder of this library.
 [[gnu::visibility("default")]] std::filesystem::path defaultModulePath();
 
 /// All results of a call.
