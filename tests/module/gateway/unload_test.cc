@@ -1,7 +1,12 @@
 // What unloading does with files that are still open.
+#include <sys/wait.h>
+#include <unistd.h>
+
+#include <cstdlib>
 #include <filesystem>
 #include <fstream>
 
+#include "tests/module/support/file_bytes.h"
 #include "tests/module/support/module_test.h"
 
 namespace ambrix_test {
@@ -35,6 +40,20 @@ TEST_F(UnloadTest, TwoOpenFilesAreWarnedOfOnceAndBothAreWritten) {
   module = ::ambrix::Module();
   EXPECT_EQ(does("getVarName", {open("first"), 0}), "char 1x3 'one'");
   EXPECT_EQ(does("getVarName", {open("second"), 0}), "char 1x3 'two'");
+}
+
+// What waits to be written is the parent's to write.
+TEST_F(UnloadTest, AChildThatEndsWritesNothingToFilesOfItsParent) {
+  const Given file = create();
+  const Given values = elements<std::int32_t>(1000);
+  results("putVarRecordData", {file, createVar(file, {.sizes = {1000}}), 0, values});
+  const std::string before = fileBytes("new.cdf");
+  const pid_t child = fork();
+  if (child == 0) std::exit(0);
+  waitpid(child, nullptr, 0);
+  EXPECT_EQ(fileBytes("new.cdf"), before);
+  results("close", {file});
+  EXPECT_NE(fileBytes("new.cdf"), before);
 }
 
 TEST_F(UnloadTest, AModuleLoadedAgainKnowsNoIdentifierOfTheOneBefore) {

@@ -164,7 +164,21 @@ TEST_F(FilesAndMemoryTest, NoFileIsOpenedUnlessItsIdentifierCanBeReturned) {
   }
 }
 
-TEST_F(FilesAndMemoryTest, RegisteringAndFreeingTakeNoMemoryOnceThereIsRoom) {
+TEST_F(FilesAndMemoryTest, NoFileIsOpenedUnlessItsIdentifierCanBeRegistered) {
+  for (const char* command : {"create", "open"}) {
+    const Array name = Array::fromNarrow("new.cdf");
+    for (std::uint64_t n = 1; n <= 4; ++n) {  // each of the registry's lists
+      TOLVEX::ambrix::openFileRegistry().clear();
+      fake.forgetCalls();
+      failNew(n);
+      EXPECT_THROW(module.call(command, {name}), ::ambrix::Error) << n;
+      EXPECT_THAT(fake.calls(), IsEmpty()) << command << ' ' << n;
+    }
+    EXPECT_FALSE(newFailurePending());
+  }
+}
+
+TEST_F(FilesAndMemoryTest, RegisteringAndMarkingTakeNoMemoryOnceThereIsRoom) {
   using TOLVEX::ambrix::CdfId;
   TOLVEX::ambrix::OpenFileRegistry registry;
   for (std::uint64_t id = 1; id <= 100; ++id) {
@@ -172,6 +186,7 @@ TEST_F(FilesAndMemoryTest, RegisteringAndFreeingTakeNoMemoryOnceThereIsRoom) {
     failNew(1);
     registry.insert(CdfId{id});
     registry.markFreed(CdfId{id});
+    registry.markWritten(CdfId{id});
     EXPECT_TRUE(newFailurePending()) << id;
     failNew(0);
   }

@@ -134,5 +134,14 @@ TEST_F(FileLifecycleTest, AFailedDeleteFreesTheFileOnlyWhenTheLibraryHasBegun) {
   }
 }
 
+TEST_F(FileLifecycleTest, ADeleteThatEndsWithAWarningHasFreedTheFile) {
+  for (const long status : {-1L, -1001L, -1999L}) {
+    call("open", {"any.cdf"});
+    fake.failCall(1, status);
+    EXPECT_EQ(errorOf("delete", {file()}), libraryFailure("CDFdelete", status));
+    EXPECT_EQ(errorOf("getFormat", {file()}), libraryFailure("CDFgetFormat", kBadCdfId));
+  }
+}
+
 }  // namespace
 }  // namespace ambrix_test

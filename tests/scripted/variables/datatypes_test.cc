@@ -74,6 +74,14 @@ TEST_F(DatatypesTest, Epoch16BuffersBecomePairs) {
   EXPECT_EQ(shownHere(createArrayFromBuffer({}, 32)), "double 2x0 []");
 }
 
+TEST_F(DatatypesTest, AnArrayHasAsManyBytesAsTheLibraryMayMove) {
+  const Given six = elements<double>(6);
+  for (const Row& row : kRows) {
+    const long sizeOfElement = row.code == 32 ? 8 : row.size;  // an epoch16 is a pair of them
+    EXPECT_EQ(bytesOfArray(six.view().handle(), row.code), 6 * sizeOfElement) << row.name;
+  }
+}
+
 TEST_F(DatatypesTest, CharacterBuffersBecomeTextUpToTheFirstZero) {
   EXPECT_EQ(shownHere(createArrayFromBuffer({'a', 'b', 'c', 0}, 52)), "char 1x3 'abc'");
   EXPECT_EQ(shownHere(createArrayFromBuffer({'a', 0, 'c', 0}, 51)), "char 1x1 'a'");

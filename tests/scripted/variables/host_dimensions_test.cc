@@ -107,6 +107,12 @@ TEST_F(HostDimensionsTest, VectorsForTheLibraryHaveTenEntriesAndFit32Bits) {
   EXPECT_THAT(libraryVector(Sizes(12, 5), -1), testing::Each(5));
 }
 
+TEST_F(HostDimensionsTest, MoreNumbersThanTenAreNotWrittenBehindTheVector) {
+  Sizes room(14, 7);
+  new (room.data()) DimensionVector(libraryVector(Sizes(14, 5), -1));
+  EXPECT_THAT(room, ElementsAre(5, 5, 5, 5, 5, 5, 5, 5, 5, 5, 7, 7, 7, 7));
+}
+
 TEST_F(HostDimensionsTest, BytesAreWidenedAsSignedNumbers) {
   const char bytes[] = {'\x00', '\x41', '\x7F', '\x80', '\xE9', '\xFF'};
   char16_t characters[6];

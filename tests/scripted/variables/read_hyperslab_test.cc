@@ -128,6 +128,7 @@ TEST_F(ReadHyperslabTest, NoneAreSkippedOfRecordsThatDoNotVary) {
     return calls().back();
   };
   describe({.sizes = {2, 3}, .variances = {-1, 0}, .recordVariance = 0});
+  EXPECT_THAT(intervalFor(2, {2, 1}), HasSubstr("zVAR_RECCOUNT_ 2 | zVAR_RECINTERVAL_ 1 |"));
   EXPECT_THAT(intervalFor(3, {2, 1}), HasSubstr("zVAR_RECCOUNT_ 3 | zVAR_RECINTERVAL_ 1 |"));
   EXPECT_THAT(intervalFor(1, {2, 1}), HasSubstr("zVAR_RECINTERVAL_ 2 |"));
   describe({.sizes = {2, 3}, .variances = {-1, 0}, .recordVariance = -1});

@@ -86,6 +86,13 @@ TEST_F(ReadValueTest, ADamagedDescriptionIsRefusedInTheLibrarysWords) {
   EXPECT_EQ(errorOf("getVarData", {file(), 3, 0, {0, 0}}), libraryFailure("CDFgetzVarData", -2004));
 }
 
+TEST_F(ReadValueTest, ARecordOfAsManyBytesAsTheLibraryCanCountIsRead) {
+  describe({.datatype = 1, .sizes = {2147483647}});
+  EXPECT_EQ(errorOf("getVarData", {file(), 3, 0, 0}), "no error");
+  describe({.datatype = 1, .sizes = {2147483647, 2}});
+  EXPECT_EQ(errorOf("getVarData", {file(), 3, 0, {0, 0}}), libraryFailure("CDFgetzVarData", -2004));
+}
+
 TEST_F(ReadValueTest, ArgumentsAreConvertedInOrderUnderTheirLabels) {
   EXPECT_EQ(errorOf("getVarData", {file(), "x", "x"}), notScalar("VARNUM"));
   EXPECT_EQ(errorOf("getVarData", {file(), 3, "x"}), notScalar("RECNUM"));

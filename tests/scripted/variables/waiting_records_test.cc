@@ -40,6 +40,25 @@ TEST_F(WaitingRecordsTest, AreWrittenFirst) {
   }
 }
 
+TEST_F(WaitingRecordsTest, EachCommandThatWritesRecordsLetsThemWait) {
+  const std::pair<std::string, Arguments> writers[] = {
+      {"putVarData", {file(), 3, 9, 0, 8}},
+      {"putVarRecordData", {file(), 3, 9, elements<double>(2)}},
+      {"hyperPutVarData", {file(), 3, 9, 1, 1, 0, 2, 1, elements<double>(2)}},
+      {"setVarInitialRecs", {file(), 3, 9}},
+  };
+  describe({.sizes = {2}});
+  answerCompressedSparse();
+  for (const auto& [command, arguments] : writers) {
+    call("close", {file()});
+    call("open", {"any.cdf"});
+    call(command, arguments);
+    fake.forgetCalls();
+    call("getVarData", {file(), 3, 4, 0});
+    EXPECT_THAT(calls(), Contains(kWrite)) << command;
+  }
+}
+
 TEST_F(WaitingRecordsTest, NotForVariablesThatHaveAllRecords) {
   put();
   for (const auto& [command, arguments] : readers) {

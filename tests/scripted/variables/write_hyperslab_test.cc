@@ -119,6 +119,16 @@ TEST_F(WriteHyperslabTest, CountsThatTheLibraryRefusesAreLeftToIt) {
   EXPECT_THAT(calls().back(), testing::HasSubstr("zVAR_RECCOUNT_ -1 | "));
 }
 
+// Two counts below one would make a product above it: data that the library never reads.
+TEST_F(WriteHyperslabTest, CountsThatTheLibraryRefusesNeedNoDataHoweverLargeTheirProduct) {
+  describe({.datatype = 4, .sizes = {2, 2}});
+  const Given counts{-2, -2, 0};
+  EXPECT_EQ(errorOf("hyperPutVarData",
+                    {file(), 3, 0, 1, 1, {0, 0, 0}, counts, {1, 1, 1}, elements<std::int32_t>(0)}),
+            "no error");
+  EXPECT_THAT(calls().back(), testing::HasSubstr("zVAR_DIMCOUNTS_ [-2 -2] | "));
+}
+
 TEST_F(WriteHyperslabTest, ArgumentsAreConvertedInOrderUnderTheirLabels) {
   const Given x = "x", cell = Array::cell({1, 1});
   const auto error = [&](const Arguments& arguments) {

@@ -71,6 +71,14 @@ TEST_F(WriteValueTest, TheOrderIsIndicesThenCountThenDatatypeThenClass) {
             cdflib("datatypeMismatch", "single", "CDF_REAL8"));
 }
 
+TEST_F(WriteValueTest, TheClassIsLookedAtAfterTheNumberOfElementsAndBeforeTheRecord) {
+  describe({.datatype = 4, .sizes = {65536, 65536}, .name = "B"});
+  EXPECT_EQ(errorOf("putVarData", {file(), 3, 0, {0, 0}, {1, 2}}),
+            cdflib("wrongNumberOfPutVarDataElements", "B", 1));
+  EXPECT_EQ(errorOf("putVarData", {file(), 3, 0, {0, 0}, 1}),
+            cdflib("datatypeMismatch", "double", "CDF_INT4"));
+}
+
 TEST_F(WriteValueTest, AClassServesEveryDatatypeThatHasIt) {
   for (const long datatype : {1L, 41L}) {
     describe({.datatype = datatype});
