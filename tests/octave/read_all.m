@@ -36,7 +36,7 @@ endfunction
 
 ## What was written back has all that can be told of what was read, but for what writing can't keep.
 function assertSame (written, s, file)
-  changing = {"name", "version", "encoding"};
+  changing = {"name", "path", "version", "encoding"};
   assert (isequaln (rmfield (written.file, changing), rmfield (s.file, changing)), file);
   assert (isequaln (written.attributes, s.attributes), file);
   assert (numel (fieldnames (written.variables)), sum (structfun (@(v) v.supported, s.variables)));

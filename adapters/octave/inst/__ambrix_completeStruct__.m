@@ -16,6 +16,7 @@ function s = __ambrix_completeStruct__ (s)
   parts = struct ("data", {struct()}, "variables", {struct()}, "attributes", {struct()}, ...
                   "file", {struct()}, "options", {struct()});
   parts.attributeList = struct ("name", {}, "scope", {}, "entries", {}, "datatypes", {});
+  parts.leftOut = {};
   for unknown = setdiff (fieldnames (s), fieldnames (parts))'
     error ("ambrix:invalidData", ["ambrix_write: \"%s\" is no part of what is written, which " ...
            "are %s; and a struct of arrays holds no structs"],
@@ -29,11 +30,33 @@ function s = __ambrix_completeStruct__ (s)
   endif
   s.file = withDefaults (s.file, struct ("format", "SINGLE_FILE", "majority", "COLUMN_MAJOR", ...
                                          "checksum", "NO_CHECKSUM"));
-  s.options = withDefaults (s.options, struct ("records", "first", "time", false, "fill", false));
+  s.options = withDefaults (s.options, struct ("records", "first", "time", [], "fill", false));
   if (! any (strcmp (s.options.records, {"first", "last"})))
     error ("ambrix:invalidData", "ambrix_write: records come \"first\" or \"last\"");
   endif
   s.variables = allVariables (s);
+  checkFields (s);
+endfunction
+
+## A field that nothing is made of is a slip of the pen.
+function checkFields (s)
+  refuseOthers (s.file, {"name", "path", "version", "format", "encoding", "majority", "checksum", ...
+                         "compression", "compressionParameter"}, "the file", "s.attributes");
+  refuseOthers (s.options, {"records", "text", "time", "fill"}, "the options", "s.attributes");
+  known = {"name", "number", "supported", "datatype", "elements", "sizes", "recordVariance", ...
+           "variances", "records", "written", "sparseRecords", "compression", ...
+           "compressionParameter", "blockingFactor", "padValue", "attributes", "filler"};
+  for [v, name] = s.variables
+    refuseOthers (v, known, sprintf ("variable \"%s\"", name), ...
+                  sprintf ("s.variables.%s.attributes", name));
+  endfor
+endfunction
+
+function refuseOthers (given, known, what, attributes)
+  for unknown = setdiff (fieldnames (given), known)'
+    error ("ambrix:invalidData", ["ambrix_write: \"%s\" is nothing that describes %s, but %s; " ...
+           "an attribute has its place in %s"], unknown{1}, what, strjoin (known, ", "), attributes);
+  endfor
 endfunction
 
 function s = withDefaults (s, defaults)
@@ -66,7 +89,13 @@ function variables = allVariables (s)
       error ("ambrix:invalidData", "ambrix_write: what describes variable \"%s\" must be a struct",
              name{1});
     endif
-    if (! isfield (v, "supported") || v.supported)
+    isSupported = ! isfield (v, "supported") || v.supported;
+    if (! isSupported && isfield (s.data, name{1}))
+      error ("ambrix:unsupportedDatatype", ["ambrix_write: variable \"%s\" was read with a " ...
+             "datatype that is not supported; set s.variables.%s = struct () to have a new one"], ...
+             name{1}, name{1});
+    endif
+    if (isSupported)
       variables.(name{1}) = withDefaults (v, struct ("attributes", {struct()}));
     endif
   endfor
@@ -82,6 +111,16 @@ endfunction
 %! s.variables.flux.attributes.UNITS = "nT";
 %! s = __ambrix_completeStruct__ (s);
 %! assert (fieldnames (s.variables), {"time"; "flux"});
+%!error <"UNITS" is nothing that describes variable "x".*place in s.variables.x.attributes>
+%! s = struct ("data", struct ("x", 1), "variables", struct ("x", struct ("UNITS", "nT")));
+%! __ambrix_completeStruct__ (s);
+%!error <"Majority" is nothing that describes the file>
+%! __ambrix_completeStruct__ (struct ("data", struct (), "file", struct ("Majority", 1)));
+%!error <"Time" is nothing that describes the options>
+%! __ambrix_completeStruct__ (struct ("data", struct (), "options", struct ("Time", true)));
+%!error id=ambrix:unsupportedDatatype
+%! s = struct ("data", struct ("x", 1), "variables", struct ("x", struct ("supported", false)));
+%! __ambrix_completeStruct__ (s);
 %!error id=ambrix:invalidData __ambrix_completeStruct__ (1)
 %!error <"position" is no part of what is written>
 %! __ambrix_completeStruct__ (struct ("position", struct ("x", 1)));

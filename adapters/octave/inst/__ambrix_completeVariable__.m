@@ -13,6 +13,10 @@ function [v, data] = __ambrix_completeVariable__ (name, v, s, rowMajor)
   elseif (! isfield (v, "datatype"))
     error ("ambrix:invalidData",
            "ambrix_write: variable \"%s\" has neither data nor a datatype", name);
+  elseif (isfield (v, "records") && v.records > 0)
+    error ("ambrix:invalidData", ["ambrix_write: variable \"%s\" is described with %d records, " ...
+           "and there are no data of it; remove s.variables.%s, too, or set its records to 0"], ...
+           name, v.records, name);
   endif
   if (! isfield (v, "datatype"))
     v.datatype = __ambrix_datatypeOf__ (data, sprintf ("variable \"%s\"", name));
@@ -46,9 +50,10 @@ function [v, data] = storable (v, data, options)
     error ("ambrix:unsupportedClass",
            "ambrix_write: variable \"%s\" is complex, and no datatype is", v.name);
   endif
-  if (options.time && strncmp (v.datatype, "CDF_EPOCH", 9))
-    data = __ambrix_fromDays__ (data, v.datatype, options.records);
-  elseif (options.fill && isfloat (data) && isfield (v.attributes, "FILLVAL"))
+  if (isfloat (data) && strncmp (v.datatype, "CDF_EPOCH", 9))
+    data = __ambrix_toEpochs__ (data, v.datatype, options, sprintf ("variable \"%s\"", v.name));
+  endif
+  if (options.fill && isfloat (data) && isfield (v.attributes, "FILLVAL"))
     data = withFill (data, v, options.records);
   endif
   if (iscellstr (data))
@@ -101,7 +106,7 @@ function [v, data] = shaped (v, data, records, rowMajor)
 endfunction
 
 %!shared s
-%! s.options = struct ("records", "first", "time", false, "fill", false);
+%! s.options = struct ("records", "first", "time", [], "fill", false);
 %! s.data = struct ("a", single ([1, 2, 3; 4, 5, 6]), "t", {{"ab"; "c"}}, "d", int64 (1), ...
 %!                  "i", true, "c", 1i);
 %!test
@@ -124,6 +129,9 @@ endfunction
 %!error <no datatype holds variable "d">
 %! __ambrix_completeVariable__ ("d", struct (), s, false);
 %!error id=ambrix:unsupportedClass __ambrix_completeVariable__ ("c", struct (), s, false);
+%!error <"gone" is described with 3 records, and there are no data of it; remove s.variables.gone>
+%! v = struct ("datatype", "CDF_INT4", "records", 3);
+%! __ambrix_completeVariable__ ("gone", v, s, false);
 %!error <neither data> __ambrix_completeVariable__ ("none", struct (), s, false);
 %!error <are 2-by-3, which does not fit dimensions of sizes .4.>
 %! __ambrix_completeVariable__ ("a", struct ("sizes", 4), s, false);

@@ -22,6 +22,7 @@ endfunction
 
 function [file, variables, attributes] = describeItself (id)
   file.name = __ambrix__ ("getName", id);
+  file.path = pathOf (file.name);
   [version, release, increment] = __ambrix__ ("getVersion", id);
   file.version = sprintf ("%d.%d.%d", version, release, increment);
   file.format = __ambrix__ ("getFormat", id);
@@ -29,6 +30,17 @@ function [file, variables, attributes] = describeItself (id)
   [file.encoding, variables, attributes] = inquired (id);
   file.checksum = __ambrix__ ("getChecksum", id);
   [file.compression, file.compressionParameter] = __ambrix__ ("getCompression", id);
+endfunction
+
+## Where it is, whatever the folder that is worked in; empty where that can't be told.
+function path = pathOf (name)
+  path = "";
+  for ending = {".cdf", "", ".CDF"}
+    path = canonicalize_file_name ([name ending{1}]);
+    if (! isempty (path))
+      return;
+    endif
+  endfor
 endfunction
 
 ## "inquire" knows no names for the encodings with the highest numbers, and fails.
@@ -71,6 +83,7 @@ endfunction
 %! [id, restore] = __ambrix_example__ ();
 %! [s, left] = __ambrix_describeFile__ (id);
 %! assert (s.file.majority, "ROW_MAJOR");
+%! assert (s.file.path, canonicalize_file_name ("example.cdf"));
 %! assert (fieldnames (s.variables), {"Time"; "Flux"; "Mode"});
 %! assert (s.variables.Flux.padValue, single (-1e30));
 %! assert (s.variables.Flux.attributes.Units, "km/s");

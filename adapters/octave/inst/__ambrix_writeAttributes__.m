@@ -7,7 +7,12 @@
 
 function __ambrix_writeAttributes__ (id, s, numbers)
   for attribute = allAttributes (s)
-    number = ambrix_createAttr (id, attribute.name, attribute.scope);
+    what = sprintf ("attribute \"%s\"", attribute.name);
+    try
+      number = ambrix_createAttr (id, attribute.name, attribute.scope);
+    catch err
+      __ambrix_raiseFor__ ("ambrix_write", what, err);
+    end_try_catch
     if (strcmp (attribute.scope, "GLOBAL_SCOPE"))
       writeGlobal (id, number, attribute, s.attributes.(attribute.field));
     else
@@ -65,12 +70,13 @@ function writeOfVariables (id, number, attribute, variables, numbers)
     if (! isfield (v.attributes, attribute.field))
       continue;
     endif
+    what = sprintf ("attribute \"%s\" of \"%s\"", attribute.name, name);
     value = v.attributes.(attribute.field);
     datatype = [attribute.datatypes(strcmp (attribute.entries, name)), {""}]{1};
     if (isempty (datatype) && isLimit (attribute.name))
       datatype = v.datatype;
+      value = limitOf (v, value, what);
     endif
-    what = sprintf ("attribute \"%s\" of \"%s\"", attribute.name, name);
     put (id, number, numbers.(name), datatype, value, what);
   endfor
 endfunction
@@ -78,6 +84,13 @@ endfunction
 ## Values that readers compare with those of the variable are of its datatype.
 function limit = isLimit (name)
   limit = any (strcmp (name, {"FILLVAL", "VALIDMIN", "VALIDMAX", "SCALEMIN", "SCALEMAX"}));
+endfunction
+
+## Times may be serial day numbers, as they may be in data.
+function value = limitOf (v, value, what)
+  if (isfloat (value) && strncmp (v.datatype, "CDF_EPOCH", 9))
+    value = __ambrix_toEpochs__ (value, v.datatype, struct ("records", "first", "time", []), what);
+  endif
 endfunction
 
 ## In the given datatype where the class of the value belongs to it.
@@ -98,7 +111,11 @@ function put (id, number, entry, datatype, value, what)
   if (ischar (value) && isempty (value))
     value = "\0";  # an entry has one character at least
   endif
-  ambrix_putAttrEntry (id, number, entry, datatype, value);
+  try
+    ambrix_putAttrEntry (id, number, entry, datatype, value);
+  catch err
+    __ambrix_raiseFor__ ("ambrix_write", what, err);
+  end_try_catch
 endfunction
 
 %!test  # numbers and datatypes are kept as long as they fit
@@ -119,6 +136,17 @@ endfunction
 %! assert (r.attributeList(1).datatypes, {"CDF_CHAR", "CDF_CHAR", "CDF_DOUBLE"});
 %! assert (r.variables.Flux.attributes.Units, 8);
 %! assert (r.attributeList(3).name, "New");
+%!test  # limits of times in serial day numbers
+%! [id, restore] = __ambrix_example__ ();
+%! ambrix_close (id);
+%! s.data.t = datenum (2024, 1, [1; 2]);
+%! s.variables.t.datatype = "CDF_EPOCH";
+%! s.variables.t.attributes = struct ("VALIDMIN", datenum (2000, 1, 1), "FILLVAL", -1e31);
+%! ambrix_write ("days", s);
+%! r = ambrix_read ("days", {}, "time");
+%! assert (r.data.t, s.data.t);
+%! assert (r.variables.t.attributes.VALIDMIN, ambrix_computeEpoch ([2000; 1; 1; 0; 0; 0; 0]));
+%! assert (r.variables.t.attributes.FILLVAL, -1e31);
 %!test  # blanks at the end of new names
 %! [id, restore] = __ambrix_example__ ();
 %! ambrix_close (id);

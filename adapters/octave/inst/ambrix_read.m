@@ -19,6 +19,9 @@
 ## the description that @code{ambrix_info} gives: @code{s.variables.Flux.attributes.UNITS}
 ## @item options
 ## how the data were read
+## @item leftOut
+## a cell array of texts that tell what the file holds and the struct does not: variables and records
+## that were not wanted, and what is not supported
 ## @end table
 ##
 ## @code{ambrix_write} makes the same file of it again.
@@ -129,7 +132,8 @@ function s = readSeveral (id, names, options)
     error ("ambrix:invalidOption", "ambrix_read: option \"slab\" needs the name of one variable");
   endif
   [description, left] = __ambrix_describeFile__ (id);
-  description.variables = chosen (id, description.variables, names);
+  all = description.variables;
+  description.variables = chosen (id, all, names);
   rowMajor = strcmp (description.file.majority, "ROW_MAJOR");
   s.data = struct ();
   for [v, name] = description.variables
@@ -140,8 +144,12 @@ function s = readSeveral (id, names, options)
     if (! v.supported)
       left{end+1} = sprintf ("variable \"%s\" (%s)", name, v.datatype);
     else
-      [s.data.(name), description.variables.(name)] = ...
-        __ambrix_readData__ (id, v, rowMajor, options, fill);
+      try
+        [s.data.(name), description.variables.(name)] = ...
+          __ambrix_readData__ (id, v, rowMajor, options, fill);
+      catch err
+        __ambrix_raiseFor__ ("ambrix_read", sprintf ("variable \"%s\"", name), err);
+      end_try_catch
     endif
   endfor
   for [part, name] = description
@@ -149,6 +157,7 @@ function s = readSeveral (id, names, options)
   endfor
   s.options = struct ("records", options.records, "text", options.text, "time", options.time, ...
                       "fill", options.fill);
+  s.leftOut = [left, __ambrix_unwanted__(all, s.variables, options)](:);
   __ambrix_warnOfUnsupported__ ("ambrix_read", s.file.name, left);
 endfunction
 
@@ -187,13 +196,17 @@ endfunction
 %! assert (flux(1,:), single ([1, 2, 5, 6]));
 %!test
 %! s = ambrix_read (file);
-%! assert (fieldnames (s), {"data"; "file"; "attributes"; "variables"; "attributeList"; "options"});
+%! assert (fieldnames (s), {"data"; "file"; "attributes"; "variables"; "attributeList"; ...
+%!                          "options"; "leftOut"});
+%! assert (s.leftOut, cell (0, 1));
 %! assert (s.data.Mode, {"fast"; "slow"});
 %! assert (s.variables.Flux.attributes.Units, "km/s");
 %!test
 %! s = ambrix_read (file, {"Mode", "Time"}, "range", [2, 2]);
 %! assert (fieldnames (s.data), {"Mode"; "Time"});
 %! assert (s.variables.Mode.records, 1);
+%! assert (s.leftOut, {"1 of 2 records of variable \"Time\""; "variable \"Flux\""; ...
+%!                     "1 of 2 records of variable \"Mode\""});
 %!test  # an open file stays open
 %! id = ambrix_open (file);
 %! assert (ambrix_read (id, "Mode"), {"fast"; "slow"});

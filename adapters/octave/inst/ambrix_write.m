@@ -1,11 +1,18 @@
 ## -*- texinfo -*-
 ## @deftypefn  {} {} ambrix_write (@var{file}, @var{s})
-## @deftypefnx {} {} ambrix_write (@var{file}, @var{s}, "overwrite")
+## @deftypefnx {} {} ambrix_write (@var{file}, @var{s}, @var{option}, @dots{})
 ## Write a struct of arrays to a new CDF file.
 ##
-## @var{file} is the path of the file; @code{.cdf} is added where it is missing. A file that exists
-## is the error @code{ambrix:fileExists}, or is replaced when the option @qcode{"overwrite"} is given.
-## The new file appears whole or not at all.
+## @var{file} is the path of the file; @code{.cdf} is added where it is missing. The new file appears
+## whole or not at all. The options are:
+##
+## @table @asis
+## @item @qcode{"overwrite"}
+## Replace a file that exists; else it is the error @code{ambrix:fileExists}.
+## @item @qcode{"incomplete"}
+## Replace even the file that @var{s} was read from without all that it holds, which is then lost;
+## else that is the error @code{ambrix:incomplete}. @code{s.leftOut} lists what is missing.
+## @end table
 ##
 ## @var{s} is a struct that @code{ambrix_read} has returned, or a struct of arrays, one for each
 ## variable. The first dimension of an array is that of the records, and a text is a row of
@@ -29,10 +36,20 @@
 ## @item s.file.majority
 ## and @code{format}, @code{checksum}, @code{compression} and @code{compressionParameter} of the
 ## file; without them it is column-major, a single file, not compressed
+## @item s.options
+## how the data are given, as the options of @code{ambrix_read}: @code{records}, @qcode{"first"} or
+## @qcode{"last"}; @code{time}, whether times are serial day numbers; @code{fill}, whether NaN stands
+## for the attribute FILLVAL
 ## @end table
 ##
-## Also @code{sizes}, @code{variances}, @code{sparseRecords}, @code{padValue} and
-## @code{blockingFactor} of a variable are those that @code{ambrix_info} describes.
+## Also @code{sizes}, @code{elements}, @code{variances}, @code{sparseRecords}, @code{padValue} and
+## @code{blockingFactor} of a variable are those that @code{ambrix_info} describes. Any other field
+## is the error @code{ambrix:invalidData}.
+##
+## Where @code{s.options.time} is missing, values of a CDF_EPOCH or CDF_EPOCH16 variable that are
+## serial day numbers of the years 0 to 9999 are taken for such; as epochs all of them would be in
+## the first hours of the year 0. Numbers that are not what @code{s.options.time} says are the error
+## @code{ambrix:invalidTime}. Day numbers are written to the millisecond.
 ##
 ## The datatypes by class: double CDF_DOUBLE, single CDF_FLOAT, int8 CDF_INT1, int16 CDF_INT2, int32
 ## CDF_INT4, uint8 and logical CDF_UINT1, uint16 CDF_UINT2, uint32 CDF_UINT4, text CDF_CHAR.
@@ -58,20 +75,18 @@ function ambrix_write (file, s, varargin)
   if (nargin < 2)
     print_usage ();
   endif
-  options = __ambrix_parseOptions__ ("ambrix_write", struct ("overwrite", false), varargin);
+  defaults = struct ("overwrite", false, "incomplete", false);
+  options = __ambrix_parseOptions__ ("ambrix_write", defaults, varargin);
   if (! ischar (file) || rows (file) != 1)
     error ("ambrix:invalidFile", "ambrix_write: give the path of the file as a text");
   endif
   s = __ambrix_completeStruct__ (s);
   target = targetOf (file);
-  if (! options.overwrite && ! isempty (stat ([target ".cdf"])))
-    error ("ambrix:fileExists",
-           "ambrix_write: there is a file \"%s.cdf\"; option \"overwrite\" replaces it", target);
-  endif
+  __ambrix_mayReplace__ (target, s, options);
   temporary = fullfile (fileparts (target), [".ambrix" regexprep(tempname (), '.*-', "-")]);
   id = __ambrix__ ("create", temporary);
   discard = onCleanup (@() discardFile (id, temporary));
-  fillFile (id, s);
+  __ambrix_fillFile__ (id, s);
   __ambrix__ ("close", id);
   __ambrix_moveFile__ (temporary, target, options.overwrite);
 endfunction
@@ -89,31 +104,6 @@ function target = targetOf (file)
   if (! isempty (there) && S_ISLNK (there.mode))
     linked = regexp (canonicalize_file_name ([target ".cdf"]), '^(.+)\.cdf$', "tokens", "once");
     target = [linked, {target}]{1};
-  endif
-endfunction
-
-function fillFile (id, s)
-  applySettings (id, s.file);
-  rowMajor = strcmp (__ambrix__ ("getMajority", id), "ROW_MAJOR");
-  numbers = struct ();
-  for [v, name] = s.variables
-    [v, data] = __ambrix_completeVariable__ (name, v, s, rowMajor);
-    numbers.(name) = __ambrix_writeVariable__ (id, v, data, rowMajor);
-    s.variables.(name) = v;
-  endfor
-  __ambrix_writeAttributes__ (id, s, numbers);
-endfunction
-
-## In the order that the library wants: format and compression before there are variables.
-function applySettings (id, file)
-  ambrix_setFormat (id, file.format);
-  ambrix_setMajority (id, file.majority);
-  if (! strcmpi (file.checksum, "NO_CHECKSUM"))
-    ambrix_setChecksum (id, file.checksum);
-  endif
-  compression = __ambrix_compressionArguments__ (file);
-  if (! isempty (compression))
-    ambrix_setCompression (id, compression{:});
   endif
 endfunction
 
