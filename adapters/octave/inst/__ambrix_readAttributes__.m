@@ -17,8 +17,15 @@ function [s, left] = __ambrix_readAttributes__ (id, s, names, count)
       last = lastGlobal;
     endif
     field = __ambrix_fieldName__ (list(k).name);
-    entries = readEntries (id, k - 1, kind, last);
+    if (isempty (kind))
+      last = min (last, numel (names) - 1);
+    endif
+    [entries, unfound] = readEntries (id, k - 1, kind, last);
     left = [left, unsupportedIn(list(k).name, entries, kind, names, s.variables)];
+    if (unfound > 0 && ! isempty (kind))
+      left{end+1} = sprintf ("%d entries of attribute \"%s\", whose numbers are far apart", ...
+                             unfound, list(k).name);
+    endif
     entries = entries(! strcmp ({entries.datatype}, ""));
     if (isempty (kind))
       [s.variables, entries] = givenToVariables (s.variables, field, entries, names);
@@ -32,26 +39,41 @@ function [s, left] = __ambrix_readAttributes__ (id, s, names, count)
   s.attributeList = list;
 endfunction
 
-## All entries of an attribute; the datatype is empty where it is not supported.
-function entries = readEntries (id, attribute, kind, last)
+## The entries of an attribute, and how many could not be found. Only the library's look-up tells
+## which numbers there are, up to some thousand millions. Entries are mostly together, at the
+## beginning or at the end, so both are searched, each as long as there are entries.
+function [entries, unfound] = readEntries (id, attribute, kind, last)
   entries = struct ("number", {}, "datatype", {}, "value", {});
-  left = __ambrix__ (["getNumAttr" kind "Entries"], id, attribute);
-  for number = 0:last
-    if (left == 0)
-      return;
+  unfound = __ambrix__ (["getNumAttr" kind "Entries"], id, attribute);
+  [first, missed, fromEnd] = deal (0, 0, false);
+  while (unfound > 0 && first <= last && missed < 20000)
+    number = merge (fromEnd, last, first);
+    entry = readEntry (id, attribute, kind, number);
+    first += ! fromEnd;
+    last -= fromEnd;
+    if (isempty (entry))
+      missed += 1;
+      fromEnd = ! fromEnd;
+    else
+      entries(end+1) = entry;
+      unfound -= 1;
     endif
-    entry = struct ("number", number, "datatype", "", "value", []);
-    try
-      entry.datatype = upper (__ambrix__ (["inquireAttr" kind "Entry"], id, attribute, number));
-      entry.value = __ambrix__ (["getAttr" kind "Entry"], id, attribute, number);
-    catch err
-      if (isMissing (err))
-        continue;
-      endif
-    end_try_catch
-    entries(end+1) = entry;
-    left -= 1;
-  endfor
+  endwhile
+  [~, order] = sort ([entries.number]);
+  entries = entries(order);
+endfunction
+
+## Empty where there is none; its datatype is empty where that is not supported.
+function entry = readEntry (id, attribute, kind, number)
+  entry = struct ("number", number, "datatype", "", "value", []);
+  try
+    entry.datatype = upper (__ambrix__ (["inquireAttr" kind "Entry"], id, attribute, number));
+    entry.value = __ambrix__ (["getAttr" kind "Entry"], id, attribute, number);
+  catch err
+    if (isMissing (err))
+      entry = [];
+    endif
+  end_try_catch
 endfunction
 
 ## Whether there is no such entry; errors other than that, and an unsupported datatype, go on.
@@ -98,4 +120,17 @@ endfunction
 %! assert (s.attributeList(1).entries, [0, 3]);
 %! assert (s.attributeList(1).datatypes, {"CDF_CHAR", "CDF_INT2"});
 %! assert (s.attributeList(3).entries, []);
+%! ambrix_close (id);
+%!test  # numbers that are far apart
+%! [id, restore] = __ambrix_example__ ();
+%! ambrix_putAttrgEntry (id, 0, 20e6, "CDF_CHAR", "last");
+%! ambrix_putAttrgEntry (id, 0, 20e6 - 2, "CDF_CHAR", "nearly");
+%! [s, left] = __ambrix_describeFile__ (id);
+%! assert (s.attributeList(1).entries, [0, 20e6 - 2, 20e6]);
+%! assert (s.attributes.Title, {"Solar wind"; "nearly"; "last"});
+%! assert (left, {});
+%! ambrix_putAttrgEntry (id, 0, 10e6, "CDF_CHAR", "lost");
+%! [s, left] = __ambrix_describeFile__ (id);
+%! assert (numel (s.attributes.Title), 3);
+%! assert (left, {"1 entries of attribute \"Title\", whose numbers are far apart"});
 %! ambrix_close (id);

@@ -5,7 +5,7 @@
 
 function __ambrix_warnOfUnsupported__ (caller, file, left)
   if (! isempty (left))
-    warning ("ambrix:unsupportedDatatype", "%s: datatypes not supported, left out of \"%s\": %s\n",
+    warning ("ambrix:unsupportedDatatype", "%s: not supported, and left out of \"%s\": %s\n",
              caller, file, strjoin (left, ", "));
   endif
 endfunction
