@@ -1,4 +1,4 @@
-// The two functions that the module exports.
+// The two functions that the module exports, and the one for hosts that are linked with it.
 #include <boost/numeric/conversion/cast.hpp>
 #include <cstdint>
 #include <string>
@@ -41,4 +41,8 @@ extern "C" [[gnu::visibility("default")]] void qvhfilerequiredapiversion(
     std::uint32_t* releaseCode, std::uint32_t* apiVersion) {
   *releaseCode = qvhReleaseCode;
   *apiVersion = qvhApiVersion;
+}
+
+extern "C" void qvhAbandonFile(std::uint64_t file) {
+  abandonFile(CdfId{file});
 }

@@ -121,6 +121,12 @@ void deleteFile(int, qvArray*[], std::int32_t, const qvArray* arguments[], const
   openFileRegistry().erase(file);
 }
 
+void abandonFile(CdfId file) {
+  OpenFileRegistry& registry = openFileRegistry();
+  if (registry.contains(file)) closeSilently(file);
+  registry.erase(file);
+}
+
 void closeAllOnUnload() {
   if (openFileRegistry().size() == 0) return;
   const ClosingAll closing;  // even if the host makes an error of the warning

@@ -3,6 +3,7 @@
 
 #include <cstdint>
 
+#include "gateway/cdf_id.h"
 #include "gateway/command.h"
 
 namespace TOLVEX::ambrix {
@@ -25,6 +26,10 @@ void closeFile(int, qvArray*[], std::int32_t, const qvArray* arguments[], const 
 /// "delete" (identifier): removes the file from disk. Raises `libraryFailure` ("CDFdelete"); the
 /// identifier then stays registered, usable if the library refused to begin.
 void deleteFile(int, qvArray*[], std::int32_t, const qvArray* arguments[], const CommandEntry*);
+
+/// For a host that opens files for itself: closes one, ignoring failures, and unregisters it even
+/// where "close" has failed before.
+void abandonFile(CdfId file);
 
 /// The unload handler: one warning if any file is open, then closes every one, ignoring failures. A
 /// process that ends without calling it has its files closed without the warning.

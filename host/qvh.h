@@ -22,4 +22,8 @@ void qvhAtExit(qvhExitHandler handler);
 void qvhFunction(int outputCount, qvArray* outputs[], int inputCount, const qvArray* inputs[]);
 void qvhfilerequiredapiversion(std::uint32_t* releaseCode, std::uint32_t* apiVersion);
 
+/// For a host that is linked with the module and opens files for itself, not for its user: gives
+/// one up by its identifier, whatever state it is in. "close" keeps the identifier when it fails.
+void qvhAbandonFile(std::uint64_t file);
+
 }  // extern "C"

@@ -30,6 +30,12 @@ octave_value_list takeResults(const Slots& slots, int nargout) {
   return results;
 }
 
+/// Whether a function of the package gives up a file of its own. No command has such a name.
+bool givesUpFile(const octave_value_list& args) {
+  return args.length() == 2 && args(0).is_string() && args(0).string_value() == "-abandon" &&
+         args(1).is_uint64_type();
+}
+
 octave_value_list callModule(const octave_value_list& args, int nargout) {
   const CallFrame frame;
   std::vector<qvArray> arguments;
@@ -54,6 +60,10 @@ DEFUN_DLD(__ambrix__, args, nargout,
   if (args.length() == 0) print_usage();
   // Octave knows how to go on after exceptions of its own; any other would end the process.
   try {
+    if (givesUpFile(args)) {
+      qvhAbandonFile(args(1).uint64_scalar_value().value());
+      return {};
+    }
     return callModule(args, nargout);
   } catch (const octave::execution_exception&) {
     throw;

@@ -1,6 +1,7 @@
 ## The functions of the package: those of the commands against the table of commands and the running
 ## module, and the tests and help texts in all of them.
 1;
+addpath (fullfile (fileparts (mfilename ("fullpath")), "support"));
 
 function files = functionFiles ()
   files = glob (fullfile (getenv ("AMBRIX_OCTAVE"), "*.m"));
@@ -9,7 +10,8 @@ endfunction
 ## All functions that users call: for whole files, and one for each command.
 function names = expectedFunctions (commands)
   names = cellfun (@(command) ["ambrix_" command.name], commands, "UniformOutput", false);
-  names = sort ([names; {"ambrix"; "ambrix_info"; "ambrix_read"; "ambrix_write"; "ambrix_plot"}]);
+  names = sort ([names; {"ambrix"; "ambrix_info"; "ambrix_read"; "ambrix_write"; "ambrix_plot"; ...
+                        "ambrix_check"}]);
 endfunction
 
 function commands = table ()
@@ -91,6 +93,19 @@ function testFunctionsAreFoundAndTheirResultsIndexed ()
   ambrix_close (id);
 endfunction
 
+## Demonstrations run, and leave nothing behind.
+function testDemosRun ()
+  [folder, cleanup] = scratchFolder ();
+  back = cd (folder);
+  for name = {"ambrix_info", "ambrix_read", "ambrix_write"}
+    shown = evalc (["demo " name{1} " 1"]);
+    assert (isempty (strfind (shown, "error")), shown);
+    assert (any (strfind (shown, "file = [tempname() \".cdf\"]")), shown);
+  endfor
+  assert (numel (readdir (folder)), 2);
+  cd (back);
+endfunction
+
 function testTestsInFunctionsPass ()
   for file = functionFiles ()'
     [passed, count] = test (file{1}, "quiet", stdout);
@@ -105,4 +120,5 @@ testTheIndexListsEachFunction (commands);
 testFunctionsTakeAndReturnAsManyAsTheTableSays (commands);
 testEveryFunctionHasHelp ();
 testFunctionsAreFoundAndTheirResultsIndexed ();
+testDemosRun ();
 testTestsInFunctionsPass ();

@@ -68,7 +68,7 @@ class PackageTest(unittest.TestCase):
                      "inst/ambrix_read.m", "inst/ambrix_hyperGetVarData.m"):
             self.assertIn(name, members)
         kinds = {pathlib.Path(name).suffix for name, member in members.items() if member.isfile()}
-        self.assertEqual(kinds, {"", ".c", ".cc", ".h", ".m", ".map"})
+        self.assertEqual(kinds, {"", ".c", ".cc", ".h", ".m", ".map", ".md", ".png"})
         with tarfile.open(self.package) as tar:
             named = [member.name for member in tar
                      if member.isfile() and str(ROOT).encode() in tar.extractfile(member).read()]
@@ -81,6 +81,15 @@ class PackageTest(unittest.TestCase):
         listed = re.findall(r"^ (ambrix\w*)$", (folder / "INDEX").read_text(), re.M)
         functions = [path.stem for path in (folder / "inst").glob("ambrix*.m")]
         self.assertEqual(sorted(listed), sorted(functions))
+
+    def test_documents_are_in_it_and_link_to_nothing_else(self):
+        folder = self.unpack() / "doc"
+        for name in ("octave.md", "commands.md"):
+            text = (folder / name).read_text()
+            links = set(re.findall(r"\]\(([^)#]+)[^)]*\)", text))
+            self.assertTrue(links)
+            self.assertEqual([link for link in links if not (folder / link).exists()], [])
+        self.assertIn("ambrix_read", (folder / "octave.md").read_text())
 
     def test_installs_offline_and_passes_its_tests(self):
         code = f"""

@@ -1,6 +1,7 @@
 // A module that shows its host from the inside: what arguments look like there, and what becomes of
 // results, messages and exceptions that the real module has no use for.
 #include <algorithm>
+#include <cstdint>
 #include <new>
 #include <span>
 #include <stdexcept>
@@ -172,6 +173,8 @@ constexpr Command kCommands[] = {
 };
 
 }  // namespace
+
+extern "C" void qvhAbandonFile(std::uint64_t) {}
 
 extern "C" void qvhFunction(int outputCount, qvArray* outputs[], int inputCount,
                             const qvArray* inputs[]) {

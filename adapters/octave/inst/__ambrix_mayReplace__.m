@@ -15,9 +15,9 @@ function __ambrix_mayReplace__ (target, s, options)
   endif
   isSource = ! isfield (s.file, "path") || any (strcmp (s.file.path, {there, ""}));
   if (! isempty (s.leftOut) && isSource && ! options.incomplete)
-    parts = s.leftOut(1:min (end, 5))(:)';
-    if (numel (s.leftOut) > 5)
-      parts{end+1} = sprintf ("and %d more", numel (s.leftOut) - 5);
+    parts = s.leftOut(1:min (end, 3))(:)';
+    if (numel (s.leftOut) > 3)
+      parts{end+1} = sprintf ("and %d more", numel (s.leftOut) - 3);
     endif
     error ("ambrix:incomplete", ["ambrix_write: \"%s.cdf\" holds more than was read from it, " ...
            "which would be lost: %s. Write to another file; option \"incomplete\" replaces " ...

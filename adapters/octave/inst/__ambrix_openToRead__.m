@@ -17,7 +17,7 @@ function [id, closer] = __ambrix_openToRead__ (file)
            "ambrix: give the file as a path, or as an identifier from ambrix_open");
   endif
   id = __ambrix__ ("open", tilde_expand (file));
-  closer = onCleanup (@() __ambrix__ ("close", id));
+  closer = onCleanup (@() __ambrix__ ("-abandon", id));
   __ambrix__ ("setReadOnlyMode", id, -1);
 endfunction
 

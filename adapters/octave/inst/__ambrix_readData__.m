@@ -127,3 +127,20 @@ endfunction
 %! data = __ambrix_readData__ (id, v, true, options, []);
 %! assert (data, zeros (0, 3, "int16"));
 %! ambrix_close (id);
+%!test  # an EPOCH16 is missing where both of its numbers say so; other fill values are left alone
+%! s.data.t = [-1e31, 0; 5, 0; -1e31, 7];
+%! s.data.v = [1, 2; 3, 4];
+%! s.variables.t.datatype = "CDF_EPOCH16";
+%! s.variables.t.attributes.FILLVAL = [-1e31, 0];
+%! s.variables.v.attributes.FILLVAL = "none";
+%! [id, restore] = __ambrix_example__ ();
+%! ambrix_close (id);
+%! ambrix_write ("filled", s);
+%! r = ambrix_read ("filled", {}, "fill");
+%! assert (r.data.t, [NaN, NaN; 5, 0; -1e31, 7]);
+%! assert (r.data.v, s.data.v);
+%! for records = {"first", "last"}
+%!   ambrix_write ("again", ambrix_read ("filled", {}, "fill", "records", records{1}), "overwrite");
+%!   r = ambrix_read ("again");
+%!   assert (r.data, s.data);
+%! endfor

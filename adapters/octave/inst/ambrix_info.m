@@ -80,3 +80,14 @@ endfunction
 %!error id=TOLVEX:ambrix:cdflib:fileOpenError ambrix_info ("no such file")
 %!error id=ambrix:invalidFile ambrix_info (1)
 %!error id=Octave:invalid-fun-call ambrix_info ()
+
+%!demo
+%! # What is in a new file, printed and as a struct
+%! file = [tempname() ".cdf"];
+%! s.data.B = single ([4.5 0.5 -2; 4 0 -1.5]);
+%! s.variables.B.attributes.UNITS = "nT";
+%! s.attributes.Title = "Magnetic field";
+%! ambrix_write (file, s);
+%! ambrix_info (file)
+%! units = ambrix_info (file).variables.B.attributes.UNITS
+%! delete (file);

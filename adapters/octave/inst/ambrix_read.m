@@ -20,8 +20,7 @@
 ## @item options
 ## how the data were read
 ## @item leftOut
-## a cell array of texts that tell what the file holds and the struct does not: variables and records
-## that were not wanted, and what is not supported
+## a cell array of texts that tell what the file holds and the struct does not
 ## @end table
 ##
 ## @code{ambrix_write} makes the same file of it again.
@@ -51,8 +50,7 @@
 ## With @qcode{"char"} texts are arrays of characters, all of them, along a last dimension.
 ## @end table
 ##
-## Variables and entries of attributes whose datatype is not supported are left out, with the
-## warning
+## Variables and entries of attributes whose datatype is not supported are left out, with the warning
 ## @code{ambrix:unsupportedDatatype}. A wrong option is the error @code{ambrix:invalidOption}; other
 ## errors are those of the commands.
 ##
@@ -91,10 +89,7 @@ function data = readOne (id, name, options)
   if (! v.supported)
     refuse (id, name, v);
   endif
-  fill = [];
-  if (options.fill)
-    fill = fillOf (id, number);
-  endif
+  fill = fillOf (id, number, options.fill);
   data = __ambrix_readData__ (id, v, rowMajor, options, fill);
 endfunction
 
@@ -119,11 +114,13 @@ function refuse (id, name, v)
   end_try_catch
 endfunction
 
-function fill = fillOf (id, number)
+## Most variables of most files have one, but none need.
+function fill = fillOf (id, number, wanted)
+  fill = [];
   try
-    fill = __ambrix__ ("getAttrEntry", id, __ambrix__ ("getAttrNum", id, "FILLVAL"), number);
-  catch
-    fill = [];  # most variables of most files have one, but none need
+    if (wanted)
+      fill = __ambrix__ ("getAttrEntry", id, __ambrix__ ("getAttrNum", id, "FILLVAL"), number);
+    endif
   end_try_catch
 endfunction
 
@@ -211,23 +208,6 @@ endfunction
 %! id = ambrix_open (file);
 %! assert (ambrix_read (id, "Mode"), {"fast"; "slow"});
 %! ambrix_close (id);
-%!test  # an EPOCH16 is missing where both of its numbers say so; other fill values are left alone
-%! s.data.t = [-1e31, 0; 5, 0; -1e31, 7];
-%! s.data.v = [1, 2; 3, 4];
-%! s.variables.t.datatype = "CDF_EPOCH16";
-%! s.variables.t.attributes.FILLVAL = [-1e31, 0];
-%! s.variables.v.attributes.FILLVAL = "none";
-%! [id, restore] = __ambrix_example__ ();
-%! ambrix_close (id);
-%! ambrix_write ("filled", s);
-%! r = ambrix_read ("filled", {}, "fill");
-%! assert (r.data.t, [NaN, NaN; 5, 0; -1e31, 7]);
-%! assert (r.data.v, s.data.v);
-%! for records = {"first", "last"}
-%!   ambrix_write ("again", ambrix_read ("filled", {}, "fill", "records", records{1}), "overwrite");
-%!   r = ambrix_read ("again");
-%!   assert (r.data, s.data);
-%! endfor
 %!test  # fill values
 %! [id, restore] = __ambrix_example__ ();
 %! ambrix_createAttr (id, "FILLVAL", "VARIABLE_SCOPE");
@@ -251,3 +231,14 @@ endfunction
 %!error id=ambrix:invalidOption ambrix_read (file, "Flux", "range", [1, 3]);
 %!error id=ambrix:invalidOption ambrix_read (file, "Flux", "range", [1, 2, 0]);
 %!error id=Octave:invalid-fun-call ambrix_read ()
+
+%!demo
+%! # Two variables of a new file: speeds, of which one is missing, and their times
+%! file = [tempname() ".cdf"];
+%! s.data = struct ("time", datenum (2024, 1, 1, 0:2, 0, 0).', "speed", single ([400; -1e31; 420]));
+%! s.variables.time.datatype = "CDF_EPOCH";
+%! s.variables.speed.attributes.FILLVAL = single (-1e31);
+%! ambrix_write (file, s);
+%! times = datestr (ambrix_read (file, "time", "time"))
+%! speed = ambrix_read (file, "speed", "fill")
+%! delete (file);

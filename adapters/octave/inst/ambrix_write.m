@@ -83,11 +83,16 @@ function ambrix_write (file, s, varargin)
   s = __ambrix_completeStruct__ (s);
   target = targetOf (file);
   __ambrix_mayReplace__ (target, s, options);
-  temporary = fullfile (fileparts (target), [".ambrix" regexprep(tempname (), '.*-', "-")]);
+  [temporary, discard] = __ambrix_temporaryFile__ (target);
   id = __ambrix__ ("create", temporary);
-  discard = onCleanup (@() discardFile (id, temporary));
+  giveUp = onCleanup (@() __ambrix__ ("-abandon", id));  # unless it was closed
   __ambrix_fillFile__ (id, s);
-  __ambrix__ ("close", id);
+  try
+    __ambrix__ ("close", id);
+  catch err
+    what = sprintf ("\"%s.cdf\" can't be finished, perhaps for want of room on the disk", target);
+    __ambrix_raiseFor__ ("ambrix_write", what, err);
+  end_try_catch
   __ambrix_moveFile__ (temporary, target, options.overwrite);
 endfunction
 
@@ -105,19 +110,6 @@ function target = targetOf (file)
     linked = regexp (canonicalize_file_name ([target ".cdf"]), '^(.+)\.cdf$', "tokens", "once");
     target = [linked, {target}]{1};
   endif
-endfunction
-
-function discardFile (id, temporary)
-  try
-    __ambrix__ ("delete", id);
-  catch
-    # it was closed, and most likely renamed
-  end_try_catch
-  for part = [__ambrix_partsOf__(temporary), {[temporary ".cdf"]}]
-    if (! isempty (stat (part{1})))
-      unlink (part{1});
-    endif
-  endfor
 endfunction
 
 %!function s = back (s, varargin)
@@ -233,4 +225,18 @@ endfunction
 %!error id=ambrix:invalidData ambrix_write ("x", 1)
 %!error id=ambrix:invalidOption ambrix_write ("x", struct (), "force")
 %!error id=TOLVEX:ambrix:cdflib:fileCreateError ambrix_write ("/no such folder/x", struct ("a", 1))
+%!assert (exist ("/no such folder"), 0)
 %!error id=Octave:invalid-fun-call ambrix_write ("x")
+
+%!demo
+%! # A magnetic field with its times, units and the names of its components
+%! file = [tempname() ".cdf"];
+%! s.data.Epoch = datenum (2024, 1, 1, 0, [0; 1], 0);
+%! s.data.B = single ([4.5 0.5 -2; 4 0 -1.5]);
+%! s.data.labels = {"Bx"; "By"; "Bz"};
+%! s.variables.Epoch.datatype = "CDF_EPOCH";
+%! s.variables.labels.recordVariance = false;
+%! s.variables.B.attributes = struct ("UNITS", "nT", "DEPEND_0", "Epoch", "LABL_PTR_1", "labels");
+%! ambrix_write (file, s);
+%! ambrix_info (file)
+%! delete (file);

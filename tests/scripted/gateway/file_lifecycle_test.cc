@@ -113,6 +113,23 @@ TEST_F(FileLifecycleTest, AFailedCloseLeavesTheIdentifierRegisteredButNotUsable)
   EXPECT_THAT(calls(), IsEmpty());
 }
 
+TEST_F(FileLifecycleTest, AnAbandonedFileIsClosedAndUnregistered) {
+  qvhAbandonFile(7);
+  EXPECT_THAT(calls(), ElementsAre("SELECT_ CDF_ 7 | CLOSE_ CDF_"));
+  EXPECT_THAT(openFiles(), IsEmpty());
+  qvhAbandonFile(7);
+  EXPECT_THAT(calls(), IsEmpty());
+}
+
+TEST_F(FileLifecycleTest, AFileThatDoesNotCloseCanBeAbandoned) {
+  fake.failCall(1, kCloseError);
+  errorOf("close", {file()});
+  fake.forgetCalls();
+  qvhAbandonFile(7);
+  EXPECT_THAT(calls(), IsEmpty());
+  EXPECT_THAT(openFiles(), IsEmpty());
+}
+
 TEST_F(FileLifecycleTest, AnIdentifierHandedOutAnewIsUsableAgain) {
   fake.failCall(1, kCloseError);
   errorOf("close", {file()});
