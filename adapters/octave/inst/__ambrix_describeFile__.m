@@ -13,9 +13,13 @@ function [s, left] = __ambrix_describeFile__ (id)
   s.variables = struct ();
   names = cell (1, 0);
   for number = 0:variables - 1
-    v = __ambrix_describeVariable__ (id, number, rowMajor);
-    names{end+1} = __ambrix_fieldName__ (v.name);
-    s.variables.(names{end}) = withStorage (id, v);
+    try
+      v = __ambrix_describeVariable__ (id, number, rowMajor);
+      names{end+1} = __ambrix_fieldName__ (v.name);
+      s.variables.(names{end}) = withStorage (id, v);
+    catch err
+      __ambrix_raiseFor__ ("ambrix", sprintf ("variable %d of \"%s\"", number, s.file.name), err);
+    end_try_catch
   endfor
   [s, left] = __ambrix_readAttributes__ (id, s, names, attributes);
 endfunction

@@ -22,9 +22,9 @@ function [s, left] = __ambrix_readAttributes__ (id, s, names, count)
     endif
     [entries, unfound] = readEntries (id, k - 1, kind, last);
     left = [left, unsupportedIn(list(k).name, entries, kind, names, s.variables)];
-    if (unfound > 0 && ! isempty (kind))
-      left{end+1} = sprintf ("%d entries of attribute \"%s\", whose numbers are far apart", ...
-                             unfound, list(k).name);
+    if (unfound > 0)
+      why = merge (isempty (kind), "that belong to no variable", "whose numbers are far apart");
+      left{end+1} = sprintf ("%d entries of attribute \"%s\" %s", unfound, list(k).name, why);
     endif
     entries = entries(! strcmp ({entries.datatype}, ""));
     if (isempty (kind))
@@ -121,6 +121,12 @@ endfunction
 %! assert (s.attributeList(1).datatypes, {"CDF_CHAR", "CDF_INT2"});
 %! assert (s.attributeList(3).entries, []);
 %! ambrix_close (id);
+%!test  # an entry of a variable that there is not
+%! [id, restore] = __ambrix_example__ ();
+%! ambrix_putAttrEntry (id, 1, 7, "CDF_CHAR", "of nothing");
+%! [s, left] = __ambrix_describeFile__ (id);
+%! assert (left, {"1 entries of attribute \"Units\" that belong to no variable"});
+%! ambrix_close (id);
 %!test  # numbers that are far apart
 %! [id, restore] = __ambrix_example__ ();
 %! ambrix_putAttrgEntry (id, 0, 20e6, "CDF_CHAR", "last");
@@ -132,5 +138,5 @@ endfunction
 %! ambrix_putAttrgEntry (id, 0, 10e6, "CDF_CHAR", "lost");
 %! [s, left] = __ambrix_describeFile__ (id);
 %! assert (numel (s.attributes.Title), 3);
-%! assert (left, {"1 entries of attribute \"Title\", whose numbers are far apart"});
+%! assert (left, {"1 entries of attribute \"Title\" whose numbers are far apart"});
 %! ambrix_close (id);

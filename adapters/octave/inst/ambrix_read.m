@@ -90,7 +90,11 @@ function data = readOne (id, name, options)
     refuse (id, name, v);
   endif
   fill = fillOf (id, number, options.fill);
-  data = __ambrix_readData__ (id, v, rowMajor, options, fill);
+  try
+    data = __ambrix_readData__ (id, v, rowMajor, options, fill);
+  catch err
+    __ambrix_raiseFor__ ("ambrix_read", sprintf ("variable \"%s\"", name), err);
+  end_try_catch
 endfunction
 
 ## The library's own words for a name that there is not are hard to understand.
