@@ -4,12 +4,12 @@ _ambrix() {
   local word=$2 previous=$3 command=${COMP_WORDS[1]}
   local commands="info dump check call convert session"
   declare -A options=(
-    [info]="--attributes --json --time-limit --help"
-    [dump]="--records --format --output --time-limit --help"
-    [check]="--json --quiet --time-limit --help"
+    [info]="--attributes --json --time-limit --memory-limit --help"
+    [dump]="--records --format --output --defuse-formulas --time-limit --memory-limit --help"
+    [check]="--json --quiet --time-limit --memory-limit --help"
     [call]="--file --help"
-    [convert]="--compression --majority --checksum --skip-unsupported --time-limit --help"
-    [session]="--max-array-bytes --help"
+    [convert]="--compression --majority --checksum --skip-unsupported --time-limit --memory-limit --help"
+    [session]="--max-array-bytes --max-line-bytes --help"
   )
   declare -A values=(
     [--format]="table csv json"

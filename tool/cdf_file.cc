@@ -5,6 +5,7 @@
 #include <utility>
 
 #include "tool/failure.h"
+#include "tool/open_failure.h"
 #include "tool/steps.h"
 
 namespace ambrix::tool {
@@ -22,17 +23,27 @@ CdfFile CdfFile::from(Module& module, std::string_view command, std::string_view
   throw ToolError("badFileName", "the name of the file is not valid UTF-8");
 }
 
-CdfFile CdfFile::open(Module& module, std::string_view path) {
+CdfFile CdfFile::open(Module& module, const std::string& path) try {
   beginStep("opening the file");
+  requireOpenable(path);
   return from(module, "open", path);
+} catch (const Error& error) {
+  if (!isOpenFailure(error)) throw;
+  throw OpenError(explainRefusal(module, path));
 }
 
-CdfFile CdfFile::create(Module& module, std::string_view path) {
-  return from(module, "create", path);
+CdfFile CdfFile::create(Module& module, std::string_view path, const std::string& shownName) try {
+  CdfFile file = from(module, "create", path);
+  file.shownName_ = shownName;
+  return file;
+} catch (const Error& error) {
+  throw FileError(shownName, error.identifier(), error.what());
 }
 
 CdfFile::CdfFile(CdfFile&& other) noexcept
-    : module_(other.module_), id_(std::exchange(other.id_, Array())) {}
+    : module_(other.module_),
+      id_(std::exchange(other.id_, Array())),
+      shownName_(std::move(other.shownName_)) {}
 
 CdfFile::~CdfFile() {
   try {
@@ -45,7 +56,16 @@ CdfFile::~CdfFile() {
 std::vector<Array> CdfFile::call(std::string_view command, std::span<const ArrayView> arguments) {
   std::vector<ArrayView> all = {id_};
   all.insert(all.end(), arguments.begin(), arguments.end());
-  return module_->call(command, std::span<const ArrayView>(all));
+  return callNamed(command, all);
+}
+
+/// Errors of a file that was created are told of it.
+std::vector<Array> CdfFile::callNamed(std::string_view command,
+                                      std::span<const ArrayView> arguments) try {
+  return module_->call(command, arguments);
+} catch (const Error& error) {
+  if (shownName_.empty()) throw;
+  throw FileError(shownName_, error.identifier(), error.what());
 }
 
 std::vector<Array> CdfFile::call(std::string_view command,
@@ -71,7 +91,8 @@ void CdfFile::setReadOnly() {
 void CdfFile::close() {
   if (!id_) return;
   const Array id = std::exchange(id_, Array());
-  module_->call("close", {id});
+  const ArrayView arguments[] = {id};
+  callNamed("close", arguments);
 }
 
 double constantValue(Module& module, std::string_view name) {

@@ -17,9 +17,11 @@ std::string bytesOf(ArrayView characters);
 /// An open file, which is closed with this object.
 class CdfFile {
  public:
-  static CdfFile open(Module& module, std::string_view path);
-  /// Creates a file; the library appends ".cdf" to a path without that extension.
-  static CdfFile create(Module& module, std::string_view path);
+  /// Throws `OpenError` with the cause when the file cannot be opened.
+  static CdfFile open(Module& module, const std::string& path);
+  /// Creates a file; the library appends ".cdf" to a path without that extension. Errors of the
+  /// file, those of creating it included, become `FileError` with the name that people know.
+  static CdfFile create(Module& module, std::string_view path, const std::string& shownName);
   CdfFile(CdfFile&& other) noexcept;
   CdfFile& operator=(CdfFile&&) = delete;
   /// Closes the file, silently; call `close` to learn whether that works.
@@ -43,10 +45,12 @@ class CdfFile {
 
  private:
   CdfFile(Module& module, Array id) : module_(&module), id_(std::move(id)) {}
+  std::vector<Array> callNamed(std::string_view command, std::span<const ArrayView> arguments);
   static CdfFile from(Module& module, std::string_view command, std::string_view path);
 
   Module* module_;
   Array id_;
+  std::string shownName_;  // of a file that was created
 };
 
 /// The value of a named constant.

@@ -50,28 +50,28 @@ int examine(const std::string& path) try {
   return EXIT_SUCCESS;
 }
 
-Verdict check(const std::string& path, double timeLimit) {
+Verdict check(const std::string& path, const Limits& limits) {
   Verdict verdict{path, {}, {}, 0};
   if (const int reason = unreadable(path); reason != 0) {
     verdict.problems.push_back({"", "ambrix:unreadable", std::strerror(reason)});
     return verdict;
   }
-  const WorkerEnd end = supervise(timeLimit, [&] { return examine(path); });
+  const WorkerEnd end = supervise(limits, [&] { return examine(path); });
   takeFindings(end.told, verdict);
   verdict.unlisted = end.untold;
   if (end.kind != WorkerEnd::Kind::kDone) {
-    verdict.problems.push_back({"", "ambrix:" + identifierOf(end), describeEnd(end, timeLimit)});
+    verdict.problems.push_back({"", "ambrix:" + identifierOf(end), describeEnd(end, limits)});
   }
   return verdict;
 }
 
 }  // namespace
 
-int runCheck(const CheckOptions& options, double timeLimit, StandardOutput& output) {
+int runCheck(const CheckOptions& options, const Limits& limits, StandardOutput& output) {
   std::vector<Verdict> shown;
   bool allSound = true;
   for (const std::string& path : options.files) {
-    Verdict verdict = check(path, timeLimit);
+    Verdict verdict = check(path, limits);
     allSound = allSound && verdict.sound();
     if (options.quiet && verdict.sound()) continue;
     if (options.json) {

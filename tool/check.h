@@ -8,6 +8,7 @@
 
 #include "tool/cdf_file.h"
 #include "tool/standard_output.h"
+#include "tool/supervision.h"
 
 namespace ambrix::tool {
 
@@ -34,7 +35,7 @@ struct Verdict {
 };
 
 /// Returns the exit status: of success only if all files are sound.
-int runCheck(const CheckOptions& options, double timeLimit, StandardOutput& output);
+int runCheck(const CheckOptions& options, const Limits& limits, StandardOutput& output);
 
 /// Reads all that is in a file and tells its watcher what it finds.
 void examineFile(Module& module, const std::string& path);

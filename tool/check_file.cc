@@ -30,10 +30,6 @@ std::string quoted(const char* kind, const std::string& name) {
   return std::string(kind) + " \"" + printable(name) + '"';
 }
 
-bool isOpenFailure(const Error& error) {
-  return error.identifier() == "TOLVEX:ambrix:cdflib:fileOpenError";
-}
-
 /// Examines one file part by part: what is wrong with one part keeps no other from being read.
 class Examination {
  public:
@@ -138,16 +134,9 @@ void Examination::readAttribute(double number) {
 
 }  // namespace
 
-void examineFile(Module& module, const std::string& path) try {
+void examineFile(Module& module, const std::string& path) {
   module.call("setValidate", {Array::scalar(constantValue(module, "VALIDATEFILEON"))});
   Examination(module, path).run();
-} catch (const Error& error) {
-  if (!isOpenFailure(error)) throw;
-  // The module does not say why, and its advice is for those who do not know that there is a file.
-  tellProblem(
-      {"", error.identifier(),
-       "The CDF library refuses the file, which it validates as it opens it: it is "
-       "damaged, no CDF file, or of a kind that this version of the library does not take."});
 }
 
 }  // namespace ambrix::tool

@@ -50,13 +50,30 @@ std::string requireSeconds(const std::string& text) {
   return understood ? "" : "'" + text + "' is no number of seconds";
 }
 
-void addTimeLimit(CLI::App& command, Arguments& arguments) {
+std::string requireBytes(const std::string& text) {
+  return text.starts_with('-') ? "'" + text + "' is no number of bytes" : "";
+}
+
+/// A number of bytes, also as "512MB" or "4GiB".
+void addBytes(CLI::App& command, const char* name, std::size_t& bytes, const char* help) {
+  CLI::AsSizeValue size(false);
+  size.description("");
+  command.add_option(name, bytes, help)
+      ->type_name("BYTES")
+      ->transform(size)
+      ->transform(CLI::Validator(requireBytes, ""));  // the last one is the first to be asked
+}
+
+void addLimits(CLI::App& command, Arguments& arguments) {
   command
-      .add_option("--time-limit", arguments.timeLimit,
+      .add_option("--time-limit", arguments.limits.seconds,
                   fmt::format("Give up when nothing was read for so long (default: {}; 0: never)",
                               kTimeLimit))
       ->type_name("SECONDS")
       ->check(requireSeconds);
+  addBytes(command, "--memory-limit", arguments.limits.memory,
+           "Give up when reading takes more memory, as in 2GB (default: three\n"
+           "quarters of the machine's; 0: no limit)");
 }
 
 void addInfo(CLI::App& app, Arguments& arguments) {
@@ -64,7 +81,7 @@ void addInfo(CLI::App& app, Arguments& arguments) {
   info.add_option("FILE", arguments.info.file, "The file")->required()->type_name("");
   info.add_flag("--attributes", arguments.info.attributes, "Also list the attributes and entries");
   info.add_flag("--json", arguments.info.json, "Print a JSON object");
-  addTimeLimit(info, arguments);
+  addLimits(info, arguments);
 }
 
 void addDump(CLI::App& app, Arguments& arguments) {
@@ -84,7 +101,10 @@ void addDump(CLI::App& app, Arguments& arguments) {
                   "Write to a new file, which appears when it is complete")
       ->type_name("OUT")
       ->check(requireName);
-  addTimeLimit(dump, arguments);
+  dump.add_flag("--defuse-formulas", arguments.dump.defuseFormulas,
+                "In CSV, put an apostrophe before texts that a spreadsheet would\n"
+                "take for formulas: that begin with = + - @ tab or carriage return");
+  addLimits(dump, arguments);
 }
 
 void addCheck(CLI::App& app, Arguments& arguments) {
@@ -92,7 +112,7 @@ void addCheck(CLI::App& app, Arguments& arguments) {
   check.add_option("FILE", arguments.check.files, "The files")->required()->type_name("");
   check.add_flag("--json", arguments.check.json, "Print a JSON list with an object for each file");
   check.add_flag("--quiet", arguments.check.quiet, "Tell only of files that are not sound");
-  addTimeLimit(check, arguments);
+  addLimits(check, arguments);
 }
 
 void addConvert(CLI::App& app, Arguments& arguments) {
@@ -117,7 +137,7 @@ void addConvert(CLI::App& app, Arguments& arguments) {
       ->transform(CLI::IsMember({"md5", "none"}));
   convert.add_flag("--skip-unsupported", options.skipUnsupported,
                    "Leave out what the module does not support, and list it");
-  addTimeLimit(convert, arguments);
+  addLimits(convert, arguments);
 }
 
 void addCall(CLI::App& app, Arguments& arguments) {
@@ -131,10 +151,10 @@ void addCall(CLI::App& app, Arguments& arguments) {
 
 void addSession(CLI::App& app, Arguments& arguments) {
   CLI::App& session = addCommand(app, kSessionHelp);
-  session
-      .add_option("--max-array-bytes", arguments.maxArrayBytes,
-                  "The most bytes one array or scratch buffer may take (default: 4 GiB)")
-      ->type_name("N");
+  addBytes(session, "--max-array-bytes", arguments.session.arrayBytes,
+           "The most bytes one array or scratch buffer may take (default: 4 GiB)");
+  addBytes(session, "--max-line-bytes", arguments.session.lineBytes,
+           "The most bytes a request line may have (default: 256 MiB)");
 }
 
 }  // namespace

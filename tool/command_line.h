@@ -22,8 +22,8 @@ struct Arguments {
   ConvertOptions convert;
   DumpOptions dump;
   InfoOptions info;
-  double timeLimit = kTimeLimit;
-  std::size_t maxArrayBytes = kSessionArrayBytes;
+  Limits limits;
+  SessionLimits session;
   bool version = false;
   bool manual = false;
 };

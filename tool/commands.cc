@@ -3,11 +3,14 @@
 #include <cstdlib>
 #include <filesystem>
 #include <functional>
+#include <new>
 #include <optional>
 #include <string>
 
 #include "tool/check.h"
 #include "tool/exit_status.h"
+#include "tool/failure.h"
+#include "tool/open_failure.h"
 #include "tool/output_file.h"
 #include "tool/supervision.h"
 #include "tool/warnings.h"
@@ -24,20 +27,35 @@ struct Context {
   StandardOutput& output;
 };
 
+/// Errors while the file is read are told of it; those that name a file already stay as they are.
+void readNamed(const std::string& file, const std::function<void()>& read) try {
+  requireOpenable(file);
+  read();
+} catch (const FileError&) {
+  throw;
+} catch (const ToolError& error) {
+  throw FileError(file, error.identifier(), error.what());
+} catch (const Error& error) {
+  throw FileError(file, error.identifier(), error.what());
+} catch (const std::bad_alloc&) {
+  throw FileError(file, "TOLVEX:host:outOfMemory",
+                  "there is not enough memory; --memory-limit may allow more");
+}
+
 /// Reads the file in a worker, which writes to the output as this process would.
 int readInWorker(const Context& context, const std::string& file,
                  const std::function<void(Module&)>& read) {
-  const double timeLimit = context.arguments.timeLimit;
+  const Limits& limits = context.arguments.limits;
   const auto work = [&] {
     Module module;
     module.setWarningHandler(printWarning);
     setByteLimit(kSessionArrayBytes);
-    read(module);
+    readNamed(file, [&] { read(module); });
     context.output.flush();
     return EXIT_SUCCESS;
   };
-  const WorkerEnd end = supervise(timeLimit, [&] { return exitStatusOf(context.parser, work); });
-  return statusOf(end, timeLimit, file);
+  const WorkerEnd end = supervise(limits, [&] { return exitStatusOf(context.parser, work); });
+  return statusOf(end, limits, file);
 }
 
 int info(const Context& context) {
@@ -51,7 +69,9 @@ int dump(const Context& context) {
   std::optional<OutputFile> output;
   if (!options.output.empty()) output.emplace(options.output);
   const int status = readInWorker(context, options.file, [&](Module& module) {
-    if (output) context.output.redirect(output->folder() / output->unfinishedName());
+    if (output) {
+      context.output.redirect(output->folder() / output->unfinishedName(), options.output);
+    }
     runDump(module, options, context.output);
   });
   if (output && status == EXIT_SUCCESS) output->publish();
@@ -84,18 +104,20 @@ int convert(const Context& context) {
 int call(const Context& context) {
   Module module;
   module.setWarningHandler(printWarning);
-  runCall(module, context.arguments.call, context.output);
+  const CallOptions& options = context.arguments.call;
+  const auto run = [&] { runCall(module, options, context.output); };
+  options.file.empty() ? run() : readNamed(options.file, run);
   return EXIT_SUCCESS;
 }
 
 int session(const Context& context) {
-  runSession(context.arguments.maxArrayBytes, context.output);
+  runSession(context.arguments.session, context.output);
   return EXIT_SUCCESS;
 }
 
 int check(const Context& context) {
   const CheckOptions& options = context.arguments.check;
-  return runCheck(options, context.arguments.timeLimit, context.output);
+  return runCheck(options, context.arguments.limits, context.output);
 }
 
 struct Command {

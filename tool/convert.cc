@@ -5,6 +5,8 @@
 
 #include "tool/attributes.h"
 #include "tool/failure.h"
+#include "tool/file_header.h"
+#include "tool/open_failure.h"
 #include "tool/output_file.h"
 #include "tool/steps.h"
 #include "tool/text.h"
@@ -34,21 +36,56 @@ void reportUnsupported(CdfFile& input, bool skip) {
                   " (--skip-unsupported leaves it out)");
 }
 
+/// A folder or a device is no name for a file, and neither is one with an extension behind it.
+void requireFileName(const fs::path& wanted) {
+  std::error_code error;
+  const fs::file_status status = fs::status(wanted, error);
+  if (wanted.filename().empty() || fs::is_directory(status)) {
+    throw ToolError("noFileName", wanted.string() + " is a folder; name the file to write in it");
+  }
+  if (fs::exists(status) && !fs::is_regular_file(status)) {
+    throw ToolError("noFileName", wanted.string() + " is a device or a pipe, and no file");
+  }
+}
+
+std::string counted(std::size_t count, const char* thing) {
+  return std::to_string(count) + ' ' + thing + (count == 1 ? "" : "s");
+}
+
+/// Tells on one line what of the input the module cannot carry over as it is.
+void reportChanges(const Conversion& conversion) {
+  std::string text;
+  const auto header = readFileHeader(fileOf(conversion.options.input));
+  if (header && header->rVariables > 0) {
+    text = counted(header->rVariables, "rVariable") +
+           " became zVariables, without dimensions that do not vary";
+  }
+  if (conversion.cutTexts > 0) {
+    text += (text.empty() ? "" : "; ") + counted(conversion.cutTexts, "text") +
+            " of attributes ended at a zero byte, and what followed is zeros now";
+  }
+  if (text.empty()) return;
+  std::fprintf(stderr, "ambrix: changed in %s: %s\n", printable(conversion.options.output).c_str(),
+               text.c_str());
+}
+
 void writeCopy(Module& module, const ConvertOptions& options, CdfFile& input,
                const std::string& name) {
-  CdfFile output = CdfFile::create(module, name);
-  Conversion conversion{module, options, input, output, false, {}};
+  CdfFile output = CdfFile::create(module, name, options.output);
+  Conversion conversion{module, options, input, output, false, {}, 0};
   copySettings(conversion);
   createVariables(conversion);
   copyAttributes(conversion);
   copyData(conversion);
   const Pause pause;  // compressing a large file takes its time
   output.close();
+  reportChanges(conversion);
 }
 
 }  // namespace
 
 fs::path chooseOutput(const std::string& wanted) {
+  requireFileName(wanted);
   const fs::path path = withCdfExtension(wanted);
   if (path != wanted) {
     std::fprintf(stderr, "ambrix: the file will be %s\n", printable(path.string()).c_str());

@@ -39,6 +39,7 @@ struct Conversion {
   CdfFile& output;
   bool transposes = false;        // the files differ in majority
   std::vector<Copied> variables;  // those that are copied
+  std::size_t cutTexts = 0;       // texts of attributes that the module has ended at a zero byte
 };
 
 /// What the module cannot carry over, one line each.

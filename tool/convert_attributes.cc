@@ -1,5 +1,6 @@
 // Attributes and their entries.
 #include <algorithm>
+#include <utility>
 
 #include "tool/attributes.h"
 #include "tool/convert.h"
@@ -33,8 +34,11 @@ Array completeText(Array value, std::size_t elements) {
 }
 
 void copyEntry(Conversion& conversion, const Attribute& attribute, const EntryHeader& entry) {
-  const Array value = completeText(readEntry(conversion.input, attribute, entry.number),
-                                   static_cast<std::size_t>(entry.elements));
+  const auto elements = static_cast<std::size_t>(entry.elements);
+  Array given = readEntry(conversion.input, attribute, entry.number);
+  const std::size_t length = given.elementCount();
+  const Array value = completeText(std::move(given), elements);
+  if (value.elementCount() > length) ++conversion.cutTexts;
   const Array number = Array::scalar(attribute.number);
   const Array target = Array::scalar(targetEntry(conversion, attribute, entry.number));
   const Array datatype = Array::scalar(datatypeCode(conversion.module, entry.datatype));

@@ -107,7 +107,8 @@ std::string endingOf(const std::string& name) {
 std::unique_ptr<DumpFormat> makeFormat(const DumpOptions& options, const Variable& variable,
                                        const RecordRange& range, bool terminal) {
   const std::string name = options.format.empty() ? endingOf(options.output) : options.format;
-  if (name == "csv") return makeCsvFormat(variable);
+  if (name == "csv") return makeCsvFormat(variable, options.defuseFormulas);
+  if (options.defuseFormulas) throw UsageError("--defuse-formulas is for CSV only");
   if (name == "json") return makeJsonFormat(variable, range);
   return makeTableFormat(variable, range, terminal);
 }

@@ -16,6 +16,7 @@ struct DumpOptions {
   std::string records;
   std::string format;  // empty: what the output's name ends with, or a table
   std::string output;  // empty: standard output
+  bool defuseFormulas = false;
 };
 
 /// Throws `UsageError` for records that are no range, and `ToolError` for those that are not there.
@@ -40,7 +41,8 @@ class DumpFormat {
 
 std::unique_ptr<DumpFormat> makeTableFormat(const Variable& variable, const RecordRange& range,
                                             bool colours);
-std::unique_ptr<DumpFormat> makeCsvFormat(const Variable& variable);
+/// `defuses`: texts that a spreadsheet would take for formulas get an apostrophe before them.
+std::unique_ptr<DumpFormat> makeCsvFormat(const Variable& variable, bool defuses);
 std::unique_ptr<DumpFormat> makeJsonFormat(const Variable& variable, const RecordRange& range);
 
 }  // namespace ambrix::tool

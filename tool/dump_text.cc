@@ -41,6 +41,11 @@ class TableFormat : public DumpFormat {
   std::vector<std::size_t> widths_;
 };
 
+/// Whether a spreadsheet would take the text for a formula.
+bool isFormula(std::string_view text) {
+  return text.find_first_of("=+-@\t\r") == 0;
+}
+
 std::string csvCell(const std::string& text) {
   if (text.find_first_of(",\"\r\n") == std::string::npos) return text;
   std::string quoted = "\"";
@@ -51,13 +56,13 @@ std::string csvCell(const std::string& text) {
 
 class CsvFormat : public DumpFormat {
  public:
-  explicit CsvFormat(const Variable& variable) : variable_(variable) {}
+  CsvFormat(const Variable& variable, bool defuses) : variable_(variable), defuses_(defuses) {}
 
   std::string begin() override {
     std::string heading = "record";
     for (std::size_t i = 1; i <= variable_.sizes.size(); ++i)
       heading += fmt::format(",i{}", i);
-    return heading + ',' + csvCell(toUtf8(variable_.name)) + '\n';
+    return heading + ',' + textCell(variable_.name) + '\n';
   }
 
   std::string value(std::size_t record, const std::vector<std::size_t>& indices,
@@ -65,11 +70,17 @@ class CsvFormat : public DumpFormat {
     std::string line = fmt::format("{}", record);
     for (const std::size_t index : indices)
       line += fmt::format(",{}", index);
-    return line + ',' + csvCell(value.isText ? toUtf8(trimmed(value.text)) : value.text) + '\n';
+    const bool isText = isCharacterType(variable_.datatype);
+    return line + ',' + (isText ? textCell(trimmed(value.text)) : csvCell(value.text)) + '\n';
   }
 
  private:
+  [[nodiscard]] std::string textCell(std::string_view bytes) const {
+    return csvCell((defuses_ && isFormula(bytes) ? "'" : "") + printableLines(bytes));
+  }
+
   const Variable& variable_;
+  bool defuses_;
 };
 
 }  // namespace
@@ -79,8 +90,8 @@ std::unique_ptr<DumpFormat> makeTableFormat(const Variable& variable, const Reco
   return std::make_unique<TableFormat>(variable, range, colours);
 }
 
-std::unique_ptr<DumpFormat> makeCsvFormat(const Variable& variable) {
-  return std::make_unique<CsvFormat>(variable);
+std::unique_ptr<DumpFormat> makeCsvFormat(const Variable& variable, bool defuses) {
+  return std::make_unique<CsvFormat>(variable, defuses);
 }
 
 }  // namespace ambrix::tool

@@ -7,6 +7,7 @@
 #include "ambrix/embedded.h"
 #include "tool/failure.h"
 #include "tool/standard_output.h"
+#include "tool/text.h"
 
 namespace ambrix::tool {
 namespace {
@@ -14,12 +15,13 @@ namespace {
 int failUsage(const std::string& message, const CLI::App& parser) {
   const auto commands = parser.get_subcommands();
   const std::string topic = commands.empty() ? "" : " " + commands.front()->get_name();
-  std::fprintf(stderr, "ambrix: %s\nTry 'ambrix%s --help'.\n", message.c_str(), topic.c_str());
+  std::fprintf(stderr, "ambrix: %s\nTry 'ambrix%s --help'.\n", printable(message).c_str(),
+               topic.c_str());
   return kExitUsage;
 }
 
 int fail(const std::string& identifier, const char* message) {
-  std::fprintf(stderr, "ambrix: %s: %s\n", identifier.c_str(), message);
+  std::fprintf(stderr, "ambrix: %s: %s\n", identifier.c_str(), printable(message).c_str());
   return kExitFailure;
 }
 

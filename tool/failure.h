@@ -3,6 +3,7 @@
 
 #include <stdexcept>
 #include <string>
+#include <utility>
 
 namespace ambrix::tool {
 
@@ -14,8 +15,27 @@ class ToolError : public std::runtime_error {
 
   [[nodiscard]] const std::string& identifier() const noexcept { return identifier_; }
 
+ protected:
+  struct Whole {};  // the identifier is taken as it is
+  ToolError(Whole, std::string identifier, const std::string& message)
+      : std::runtime_error(message), identifier_(std::move(identifier)) {}
+
  private:
   std::string identifier_;
+};
+
+/// A file that cannot be opened: the module's error, with the cause as its text.
+class OpenError : public ToolError {
+ public:
+  explicit OpenError(const std::string& cause)
+      : ToolError(Whole(), "TOLVEX:ambrix:cdflib:fileOpenError", cause) {}
+};
+
+/// Any error, told of the file whose name is put before its text.
+class FileError : public ToolError {
+ public:
+  FileError(const std::string& file, std::string identifier, const std::string& message)
+      : ToolError(Whole(), std::move(identifier), file + ": " + message) {}
 };
 
 /// Arguments that the tool does not understand.

@@ -23,8 +23,7 @@ inline constexpr HelpText kToolHelp = {
     "  ambrix COMMAND --help\n"};
 
 inline constexpr HelpText kInfoHelp = {
-    "info", "FILE [--attributes] [--json] [--time-limit SECONDS]",
-    "Shows what a file is made of: its settings and its variables",
+    "info", "FILE [OPTION...]", "Shows what a file is made of: its settings and its variables",
     "Dimensions are listed as a host's arrays have them: the one that varies fastest comes first.\n"
     "\"Varies\" tells whether values differ from record to record and, after the slash, along\n"
     "each dimension. The percentage is what compression leaves of the size.\n"
@@ -46,8 +45,7 @@ inline constexpr HelpText kDumpHelp = {
     "  ambrix dump data.cdf B_GSE --output b_gse.csv\n"};
 
 inline constexpr HelpText kCheckHelp = {
-    "check", "FILE... [--json] [--quiet] [--time-limit SECONDS]",
-    "Tells whether files are sound, by reading all that is in them",
+    "check", "FILE... [OPTION...]", "Tells whether files are sound, by reading all that is in them",
     "The CDF library validates each file, its checksum included if it has one; then every "
     "attribute,\n"
     "entry and value is read. What cannot be read is listed, and so is where the library crashed "
@@ -71,7 +69,8 @@ inline constexpr HelpText kCallHelp = {
     "  ambrix call --file data.cdf renameVar 0 Epoch\n"};
 
 inline constexpr HelpText kSessionHelp = {
-    "session", "[--max-array-bytes N]", "Answers calls of the module through a pipe",
+    "session", "[--max-array-bytes BYTES] [--max-line-bytes BYTES]",
+    "Answers calls of the module through a pipe",
     "Each line of standard input is a request and each line of standard output its answer, both "
     "in\n"
     "JSON. docs/session-protocol.md describes them.\n",
@@ -79,8 +78,12 @@ inline constexpr HelpText kSessionHelp = {
 
 inline constexpr HelpText kConvertHelp = {
     "convert", "IN OUT [OPTION...]", "Writes a copy of a file with other settings",
-    "What no option names stays as it is. But the encoding becomes that of this computer, and a\n"
-    "file in several parts becomes one.\n"
+    "What no option names stays as it is. But the encoding becomes that of this computer, a file "
+    "in\n"
+    "several parts becomes one, and a small file may grow or shrink, as the library reserves room\n"
+    "anew. rVariables become zVariables and lose the dimensions along which they do not vary, and\n"
+    "texts of attributes keep their length but nothing behind a zero byte; where that happened, a\n"
+    "line on standard error says so, for rVariables only if IN is not compressed as a whole.\n"
     "OUT gets the extension .cdf when it has none. An existing file is never overwritten, and\n"
     "nothing is left behind when the conversion fails. Variables and entries of a datatype that "
     "is\n"

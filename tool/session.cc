@@ -1,5 +1,7 @@
 #include "tool/session.h"
 
+#include <fmt/format.h>
+
 #include <iostream>
 #include <optional>
 #include <utility>
@@ -7,6 +9,7 @@
 
 #include "ambrix/memory.h"
 #include "tool/json_value.h"
+#include "tool/line_reader.h"
 #include "tool/session_message.h"
 
 namespace ambrix::tool {
@@ -62,6 +65,18 @@ std::string describeCall(Module& module, std::string_view line, std::string& tag
   }
 }
 
+/// The answer to a line of which no more is known than that it is too long.
+std::string refuseLine(std::size_t limit) {
+  const JsonError error(fmt::format(
+      "the line has more than {} bytes, the most there may be; --max-line-bytes changes that",
+      limit));
+  std::string answer = R"({"error":)";
+  appendError(answer, std::make_exception_ptr(error));
+  answer += ',';
+  appendWarnings(answer, {});
+  return answer += "}\n";
+}
+
 }  // namespace
 
 std::string answerRequest(Module& module, std::string_view line) {
@@ -77,13 +92,13 @@ std::string answerRequest(Module& module, std::string_view line) {
   return answer += "}\n";
 }
 
-void runSession(std::size_t maxArrayBytes, StandardOutput& output) {
+void runSession(const SessionLimits& limits, StandardOutput& output) {
   Module module;
-  setByteLimit(maxArrayBytes);
+  setByteLimit(limits.arrayBytes);
   std::ios::sync_with_stdio(false);
-  std::string line;
-  while (std::getline(std::cin, line)) {
-    output.write(answerRequest(module, line));
+  Line line;
+  while (readLine(std::cin, limits.lineBytes, line)) {
+    output.write(line.whole ? answerRequest(module, line.text) : refuseLine(limits.lineBytes));
     output.flush();
   }
   module.unload();

@@ -45,11 +45,11 @@ void StandardOutput::flush() {
   writeNow(text);
 }
 
-void StandardOutput::redirect(const std::string& path) {
+void StandardOutput::redirect(const std::string& path, const std::string& name) {
   const int file = ::open(path.c_str(), O_WRONLY | O_CREAT | O_EXCL | O_CLOEXEC, 0666);
-  if (file < 0) throw std::system_error(errno, std::generic_category(), path);
+  if (file < 0) throw std::system_error(errno, std::generic_category(), name);
   ::close(std::exchange(descriptor_, file));
-  name_ = "the output file";
+  name_ = name;
 }
 
 void StandardOutput::writeNow(std::string_view text) {

@@ -24,8 +24,8 @@ class StandardOutput {
   /// Writes all of it, through a buffer. Throws `OutputClosed`, and std::system_error when the
   /// output cannot be written, a full disk for example.
   void write(std::string_view text);
-  /// From now on writes to a new file in place of standard output.
-  void redirect(const std::string& path);
+  /// From now on writes to a new file in place of standard output; errors call it by the name.
+  void redirect(const std::string& path, const std::string& name);
   void flush();
   [[nodiscard]] bool isTerminal() const noexcept;
 

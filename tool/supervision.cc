@@ -8,6 +8,7 @@
 #include <sys/prctl.h>
 #endif
 
+#include <algorithm>
 #include <cerrno>
 #include <chrono>
 #include <csignal>
@@ -30,9 +31,20 @@ using Kind = WorkerEnd::Kind;
 
 constexpr std::chrono::milliseconds kTick(100);
 
+/// A size in a damaged file can make the library fill all memory there is.
+void limitMemory(std::size_t bytes) {
+#ifdef __SANITIZE_ADDRESS__
+  bytes = 0;  // most of the address space is the sanitizer's
+#endif
+  rlimit space = {};
+  if (bytes == 0 || ::getrlimit(RLIMIT_AS, &space) != 0) return;
+  space.rlim_cur = std::min<rlim_t>(space.rlim_cur, bytes);
+  ::setrlimit(RLIMIT_AS, &space);
+}
+
 /// Dies with its watcher, leaves no core file, and takes a file that has become too large for an
 /// error of writing.
-void prepareWorker(pid_t watcher) {
+void prepareWorker(pid_t watcher, const Limits& limits) {
 #ifdef __linux__
   ::prctl(PR_SET_PDEATHSIG, SIGKILL);
 #endif
@@ -40,6 +52,7 @@ void prepareWorker(pid_t watcher) {
   const rlimit none = {0, 0};
   ::setrlimit(RLIMIT_CORE, &none);
   std::signal(SIGXFSZ, SIG_IGN);
+  limitMemory(limits.memory);
 }
 
 /// Counts the time in which a worker gets nowhere. It counts ticks, so that the time in which this
@@ -112,7 +125,14 @@ WorkerEnd watch(pid_t worker, const HeldSignals& held, const Steps& steps, doubl
 
 }  // namespace
 
-WorkerEnd supervise(double timeLimit, const std::function<int()>& work) {
+std::size_t mostMemory() noexcept {
+  const long pages = ::sysconf(_SC_PHYS_PAGES);
+  const long bytes = ::sysconf(_SC_PAGESIZE);
+  if (pages <= 0 || bytes <= 0) return 0;
+  return static_cast<std::size_t>(pages) / 4 * 3 * static_cast<std::size_t>(bytes);
+}
+
+WorkerEnd supervise(const Limits& limits, const std::function<int()>& work) {
   const HeldSignals held;
   const Steps steps;
   const ScratchFolder scratch;
@@ -120,7 +140,7 @@ WorkerEnd supervise(double timeLimit, const std::function<int()>& work) {
   const pid_t worker = ::fork();
   if (worker < 0) throw std::system_error(errno, std::generic_category(), "fork");
   if (worker == 0) {
-    prepareWorker(watcher);
+    prepareWorker(watcher, limits);
     scratch.use();
     held.release();
     steps.adopt();
@@ -128,7 +148,7 @@ WorkerEnd supervise(double timeLimit, const std::function<int()>& work) {
     steps.finish();
     std::exit(status);
   }
-  WorkerEnd end = watch(worker, held, steps, timeLimit);
+  WorkerEnd end = watch(worker, held, steps, limits.seconds);
   end.step = steps.last();
   end.told = steps.told();
   end.untold = steps.untold();
@@ -136,7 +156,7 @@ WorkerEnd supervise(double timeLimit, const std::function<int()>& work) {
   return end;
 }
 
-std::string describeEnd(const WorkerEnd& end, double timeLimit) {
+std::string describeEnd(const WorkerEnd& end, const Limits& limits) {
   const std::string during = end.step.empty() ? "" : " while " + end.step;
   switch (end.kind) {
     case Kind::kCrashed:
@@ -146,7 +166,7 @@ std::string describeEnd(const WorkerEnd& end, double timeLimit) {
     case Kind::kKilled:
       return "the process was killed" + during + ", perhaps for want of memory";
     case Kind::kTooSlow:
-      return fmt::format("nothing was read for {} seconds{}", timeLimit, during);
+      return fmt::format("nothing was read for {} seconds{}", limits.seconds, during);
     case Kind::kInterrupted:
       return "it was interrupted" + during;
     case Kind::kDone:
@@ -161,7 +181,7 @@ std::string identifierOf(const WorkerEnd& end) {
   return "libraryCrashed";
 }
 
-int statusOf(const WorkerEnd& end, double timeLimit, const std::string& file) {
+int statusOf(const WorkerEnd& end, const Limits& limits, const std::string& file) {
   if (end.kind == Kind::kDone) return end.status;
   if (end.kind == Kind::kInterrupted) return kExitFailure;
   if (errorIsTerminal()) std::fputs("\r\033[K", stderr);  // where a progress bar was
@@ -171,7 +191,7 @@ int statusOf(const WorkerEnd& end, double timeLimit, const std::string& file) {
       : end.kind == Kind::kKilled ? "there is no complete output"
                                   : "the file is probably damaged, see 'ambrix check'";
   throw ToolError(identifierOf(end),
-                  printable(file) + ": " + describeEnd(end, timeLimit) + "; " + advice);
+                  printable(file) + ": " + describeEnd(end, limits) + "; " + advice);
 }
 
 }  // namespace ambrix::tool

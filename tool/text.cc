@@ -18,12 +18,20 @@ std::size_t characterLength(std::string_view text) {
   return 0;
 }
 
-bool isControl(char c) {
-  return static_cast<unsigned char>(c) < 0x20 || c == 0x7F;
+/// What could change more on a terminal than the place where it stands: control characters, those
+/// that turn the direction of texts, and separators of lines.
+bool isControl(char16_t unit) {
+  return unit < 0x20 || (unit >= 0x7F && unit < 0xA0) || unit == 0x061C ||
+         (unit >= 0x200E && unit <= 0x200F) || (unit >= 0x2028 && unit <= 0x202E) ||
+         (unit >= 0x2066 && unit <= 0x2069);
 }
 
-std::string escapeControl(char c) {
-  switch (c) {
+bool isBlankControl(char16_t unit) {
+  return unit == u'\n' || unit == u'\r' || unit == u'\t';
+}
+
+std::string escapeControl(char16_t unit) {
+  switch (unit) {
     case '\n':
       return "\\n";
     case '\r':
@@ -31,8 +39,23 @@ std::string escapeControl(char c) {
     case '\t':
       return "\\t";
     default:
-      return fmt::format("\\x{:02x}", static_cast<unsigned char>(c));
+      return unit < 0x100 ? fmt::format("\\x{:02x}", static_cast<unsigned>(unit))
+                          : fmt::format("\\u{:04x}", static_cast<unsigned>(unit));
   }
+}
+
+/// UTF-8 of the bytes, with escapes for the units that are not wanted.
+std::string escapeUnits(std::string_view bytes, bool (*unwanted)(char16_t)) {
+  std::string text = toUtf8(bytes);
+  const std::u16string units = catalogue::toUtf16(text).value();
+  if (std::ranges::none_of(units, unwanted)) return text;
+  std::u16string escaped;
+  for (const char16_t unit : units) {
+    const std::string escape = unwanted(unit) ? escapeControl(unit) : "";
+    escaped +=
+        escape.empty() ? std::u16string(1, unit) : std::u16string(escape.begin(), escape.end());
+  }
+  return catalogue::toUtf8(escaped);
 }
 
 /// Combining marks take no column; the scripts of East Asia and pictures take two.
@@ -64,12 +87,11 @@ std::string toUtf8(std::string_view bytes) {
 }
 
 std::string printable(std::string_view bytes) {
-  std::string text = toUtf8(bytes);
-  if (std::ranges::none_of(text, isControl)) return text;
-  std::string escaped;
-  for (const char c : text)
-    escaped += isControl(c) ? escapeControl(c) : std::string(1, c);
-  return escaped;
+  return escapeUnits(bytes, isControl);
+}
+
+std::string printableLines(std::string_view bytes) {
+  return escapeUnits(bytes, [](char16_t unit) { return isControl(unit) && !isBlankControl(unit); });
 }
 
 std::string_view trimmed(std::string_view bytes) {

@@ -10,8 +10,11 @@ namespace ambrix::tool {
 
 /// The bytes as UTF-8: what is not UTF-8 is taken byte by byte as the characters of those numbers.
 std::string toUtf8(std::string_view bytes);
-/// The same on one line: control characters become escapes such as \n and \x1b.
+/// The same on one line: control characters, and those that turn the direction of texts, become
+/// escapes such as \n, \x1b and \u202e.
 std::string printable(std::string_view bytes);
+/// The same, but tabs and the ends of lines stay.
+std::string printableLines(std::string_view bytes);
 /// Without the blanks and zero bytes at the end.
 std::string_view trimmed(std::string_view bytes);
 /// The columns that a UTF-8 text takes on a terminal.

@@ -2,11 +2,13 @@
 
 #include <cstdio>
 
+#include "tool/text.h"
+
 namespace ambrix::tool {
 
 void printWarning(const MessageId& id) {
   std::fprintf(stderr, "ambrix: warning: %s: %s\n", id.fullIdentifier().c_str(),
-               messageText(id).c_str());
+               printable(messageText(id)).c_str());
 }
 
 }  // namespace ambrix::tool

@@ -122,7 +122,7 @@ class DamageTest(CheckCase):
             self.assertEqual((problem["place"], problem["identifier"]), ("", OPEN_ERROR))
         text = self.check("cut.cdf", "example.cdf", status=1).splitlines()
         self.assertEqual([text[0], text[2]], ["cut.cdf: not sound", "example.cdf: sound"])
-        self.assertTrue(text[1].startswith(f"    {OPEN_ERROR}: The CDF library refuses"))
+        self.assertTrue(text[1].startswith(f"    {OPEN_ERROR}: it is damaged"))
         self.assertEqual(self.check("--quiet", "example.cdf", "cut.cdf", status=1).splitlines(),
                          text[:2])
 

@@ -112,6 +112,33 @@ class CopyTest(ConvertCase):
         self.convert(out="OTHER.CDF")
         self.assertIn("OTHER.CDF", self.files())
 
+    def test_what_changes_is_told(self):
+        session = self.session()
+        (file,) = session.call("create", "text")
+        session.call("createAttr", file, "a", 1)
+        session.call("putAttrgEntry", file, 0, 0, 51, "ab\0cd")
+        session.call("close", file)
+        done = self.run_tool("convert", "text.cdf", "out.cdf")
+        self.assertEqual(done.stderr.decode(),
+                         "ambrix: changed in out.cdf: 1 text of attributes ended at a zero byte, "
+                         "and what followed is zeros now\n")
+
+    def test_long_paths_are_alike_in_all_commands(self):
+        folder = "/".join(["d" * 100] * 4)
+        os.makedirs(self.path(folder))
+        os.rename(self.path("example.cdf"), self.path(folder + "/example.cdf"))
+        deep = self.path(folder)
+        for name, ok in (("./" * 40 + "example.cdf", True),
+                         (deep + "/" * (512 - len(deep) - 11) + "example.cdf", True),
+                         (deep + "/" * (513 - len(deep) - 11) + "example.cdf", False),
+                         (deep + "/" * (510 - len(deep) - 7) + "example", False)):
+            for command in (("info", name), ("dump", name, "cube"), ("check", name),
+                            ("convert", name, "out.cdf"), ("call", "--file", name, "inquire")):
+                self.run_tool(*command, status=0 if ok else 1, cwd=deep)
+            if ok:
+                os.remove(deep + "/out.cdf")
+        self.assertEqual(os.listdir(deep), ["example.cdf"])
+
     def test_sample_files(self):
         for name in ("cacsst2", "example1", "geocpi0"):
             self.convert(file=sample(name + ".cdf"), out=name + ".cdf")
@@ -164,6 +191,14 @@ class RefusalTest(ConvertCase):
         self.run_tool("convert", "example.cdf", "link.cdf", "--skip-unsupported", status=1)
         self.run_tool("convert", "example.cdf", "example.cdf", "--skip-unsupported", status=1)
         self.assertEqual(self.files(), ["example.cdf", "link.cdf", "out.cdf"])
+
+    def test_outputs_that_are_no_files(self):
+        os.mkdir(self.path("folder"))
+        os.mkfifo(self.path("pipe"))
+        for name in ("folder/", "folder", "missing/", ".", "..", "/dev/null", "pipe"):
+            self.assert_fails("ambrix:noFileName", "convert", "example.cdf", name)
+        self.assertEqual(self.files(), ["example.cdf", "folder", "pipe"])
+        self.assertFalse(os.path.exists("/dev/null.cdf"))
 
     def test_failures(self):
         self.assert_fails("TOLVEX:ambrix:cdflib:fileOpenError", "convert", "missing.cdf", "out.cdf")

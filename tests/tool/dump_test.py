@@ -48,6 +48,28 @@ class DumpTest(ToolCase):
         self.assertEqual(rows[1:], [["0", "0", "0", "caf\u00e9"], ["0", "1", "0", "b"],
                                     ["0", "0", "1", "c"], ["0", "1", "1", "d"]])
 
+    def test_csv_for_terminals_and_spreadsheets(self):
+        session = self.session()
+        (file,) = session.call("create", "texts")
+        call = session.call
+        texts = ("=1+1  ", "+1    ", "-1    ", "@x    ", "\tx    ", "\rx    ", "a\nb   ",
+                 "a\x1b[2J ", "\u00c2\u009b1m  ", "\u00e2\u0080\u00aex  ", "a=1   ")
+        call("createVar", file, "=v", 51, 6, [], True, [])
+        call("hyperPutVarData", file, 0, 0, len(texts), 1, [], [], [],
+             array("char", "".join(texts), [6 * len(texts), 1]))
+        call("createVar", file, "n", 45, 1, [], True, [])
+        call("hyperPutVarData", file, 1, 0, 2, 1, [], [], [], array("double", [-1.5, float("-inf")]))
+        call("close", file)
+        plain = ["=1+1", "+1", "-1", "@x", "\tx", "\rx", "a\nb", "a\\x1b[2J", "\\x9b1m", "\\u202ex",
+                 "a=1"]
+        run = lambda *options: list(csv.reader(io.StringIO(self.output(
+            "dump", "texts.cdf", *options, "--format", "csv"), newline="")))
+        self.assertEqual([row[1] for row in run("0")], ["=v"] + plain)
+        self.assertEqual([row[1] for row in run("0", "--defuse-formulas")],
+                         ["'=v"] + ["'" + text for text in plain[:6]] + plain[6:])
+        self.assertEqual([row[1] for row in run("n", "--defuse-formulas")], ["n", "-1.5", "-Inf"])
+        self.assertIn("CSV", self.assert_misused("dump", "texts.cdf", "0", "--defuse-formulas"))
+
     def test_json_is_nested_with_the_first_index_innermost(self):
         cube = self.data("cube")
         self.assertEqual([len(cube), len(cube[0]), len(cube[0][0]), len(cube[0][0][0])],
@@ -67,7 +89,8 @@ class DumpTest(ToolCase):
                                            ("texts", "1", "the variable has only record 0"),
                                            ("empty", "0", "the variable has no records")):
             self.assertEqual(self.assert_fails("ambrix:noSuchRecord", "dump", "example.cdf",
-                                               variable, "--records", records), message)
+                                               variable, "--records", records),
+                             "example.cdf: " + message)
         for records in ("2:1", "x", "1:x", "1:2:3", "1.5"):
             self.assert_misused("dump", "example.cdf", "cube", "--records", records)
 
@@ -106,6 +129,8 @@ class DumpTest(ToolCase):
         self.assertIn("'ambrix info'", message)
         self.assert_fails("ambrix:noSuchVariable", "dump", "example.cdf", "99")
         self.assert_fails("TOLVEX:ambrix:cdflib:fileOpenError", "dump", "missing.cdf", "v")
+        message = self.assert_fails("ambrix:noSuchVariable", "dump", "example.cdf", "\x1b[2J\u202e")
+        self.assertTrue(message.startswith('example.cdf: there is no variable "\\x1b[2J\\u202e"'))
         self.assert_misused("dump", "example.cdf")
         self.assert_misused("dump", "example.cdf", "cube", "--format", "xml")
 

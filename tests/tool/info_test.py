@@ -1,6 +1,7 @@
 """`ambrix info`."""
 
 import json
+import os
 import subprocess
 import unittest
 
@@ -99,6 +100,32 @@ class InfoTest(ToolCase):
             file.write(b"junk" * 1000)
         self.assert_fails("TOLVEX:ambrix:cdflib:fileOpenError", "info", "junk.cdf")
         self.assert_misused("info")
+        os.mkfifo(self.path("pipe"))
+        os.mkdir(self.path("folder"))
+        with open(self.path("example.cdf"), "rb") as file:
+            sound = file.read()
+        leap = int.from_bytes(sound[20:28], "big") + 76  # in the record of the file's own facts
+        for name, content, cause in (
+                ("missing", None, "there is no such file"), ("folder", None, "it is a folder"),
+                ("pipe", None, "it is a device or a pipe"), ("empty", b"", "it is empty"),
+                ("text", b"text" * 99, "it is no CDF file"),
+                ("netcdf", b"CDF\x01" + bytes(99), "it is no CDF file but one of netCDF"),
+                ("hdf", b"\x89HDF\r\n\x1a\n" + bytes(99), "it is no CDF file but one of HDF5"),
+                ("gzip", b"\x1f\x8b" + bytes(99), "it is no CDF file but something packed by gzip"),
+                ("cut", sound[:-2000], "it is damaged: it breaks off after"),
+                ("later", sound[:28] + b"\0\0\0\4" + sound[32:], "it was written by version 4."),
+                ("new", b"\xcd\xf4" + sound[2:], "it was written by a later version"),
+                ("x" * 600, None, "the path has 600 bytes, and the CDF library takes 512 at most"),
+                ("\x1b", None, "there is no such file")):
+            if content is not None:
+                with open(self.path(name), "wb") as file:
+                    file.write(content)
+            shown = name.replace("\x1b", "\\x1b")
+            for command in (("info", name), ("dump", name, "v"), ("convert", name, "out.cdf"),
+                            ("call", "--file", name, "inquire")):
+                message = self.assert_fails("TOLVEX:ambrix:cdflib:fileOpenError", *command)
+                self.assertTrue(message.startswith(f"{shown}: {cause}"), message)
+        self.assertEqual(sound[leap:leap + 4], (20170101).to_bytes(4, "big"))
         self.assert_misused("info", "example.cdf", "more")
         self.assert_misused("info", "example.cdf", "--nonsense")
 

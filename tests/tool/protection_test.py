@@ -131,6 +131,35 @@ class TimeLimitTest(ProtectionCase):
             self.assert_misused("info", BUSY, "--time-limit", limit)
 
 
+class MemoryLimitTest(ProtectionCase):
+    def test_a_worker_that_takes_too_much_is_given_up(self):
+        process = self.start("dump", BUSY, "v", "--output", "out.csv", "--memory-limit", "40MB")
+        text = self.error_of(process)
+        if "TOLVEX:host:outOfMemory" not in text:
+            self.assertIn("ambrix:libraryCrashed", text)
+        self.assertIn(BUSY, text)
+        self.assert_nothing_left()
+
+    def test_the_limit_is_that_of_the_process_that_reads(self):
+        for options, limit in ((("--memory-limit", "5GB"), 5 << 30), ((), None)):
+            process, worker = self.converting(*options)
+            with open(f"/proc/{worker}/limits", encoding="ascii") as limits:
+                line = next(line for line in limits if line.startswith("Max address space"))
+            if limit is None:
+                limit = os.sysconf("SC_PHYS_PAGES") // 4 * 3 * os.sysconf("SC_PAGESIZE")
+            if line.split()[3] == "unlimited":
+                self.skipTest("the sanitizer needs all of the address space")
+            self.assertEqual(int(line.split()[3]), limit)
+            process.kill()
+            process.wait()
+            for path in self.unfinished():
+                os.remove(path)
+
+    def test_limits_that_are_none(self):
+        for limit in ("-1", "x", ""):
+            self.assert_misused("info", BUSY, "--memory-limit", limit)
+
+
 class SignalTest(ProtectionCase):
     def test_the_tool_ends_by_the_signal_and_leaves_nothing(self):
         for begin in (self.converting, self.dumping):
@@ -193,7 +222,7 @@ class FullDiskTest(ProtectionCase):
 
     def test_dump(self):
         process = self.limited("dump", BUSY, "v", "--format", "csv", "--output", "out.csv")
-        self.assertIn("the output file: " + os.strerror(errno.EFBIG), self.error_of(process))
+        self.assertIn("out.csv: " + os.strerror(errno.EFBIG), self.error_of(process))
         self.assert_nothing_left()
         with open("/dev/full", "wb") as full:
             process = self.start("dump", BUSY, "v", "--records", "0", stdout=full)

@@ -309,6 +309,46 @@ class LimitTest(SessionCase):
                 self.assertEqual(answers[0]["error"]["values"], [])
 
 
+    def test_limits_that_are_none(self):
+        for option in ("--max-array-bytes", "--max-line-bytes"):
+            for value in ("-1", "-0", "x", "", "1 tree"):
+                done, answers = run_session(b"", option, value)
+                self.assertEqual((done.returncode, answers), (2, []), (option, value))
+                self.assertIn(option.encode(), done.stderr)
+
+    def test_lines_that_are_too_long(self):
+        request = b'{"command":"getLibraryVersion","tag":1}'
+        size = len(request)
+        for length, limit, good in ((size, str(size), True), (size, str(size - 1), False),
+                                    (1 << 20, "1MB", True), (1 << 20, "1048575", False),
+                                    (65535, "65535", True), (65536, "65535", False)):
+            for end in (b"", b"\n"):
+                line = request.ljust(length)
+                done, answers = run_session(request + b"\n" + line + end,
+                                            "--max-line-bytes", limit)
+                self.assertEqual(len(answers), 3, (length, limit))
+                self.assertEqual("outputs" in answers[1], good, (length, limit))
+        done, answers = run_session(b" " * 100 + b"\n" + request, "--max-line-bytes", "99")
+        error = answers[0]["error"]
+        self.assertEqual((error["identifier"], error["values"]), (BAD_REQUEST, []))
+        self.assertIn("--max-line-bytes", error["message"])
+        self.assertEqual(sorted(answers[0]), ["error", "warnings"])
+        self.assertIn("outputs", answers[1])
+
+    def test_lines_that_are_too_long_are_not_held_in_memory(self):
+        with subprocess.Popen([TOOL, "session"], stdin=subprocess.PIPE,
+                              stdout=subprocess.PIPE) as process:
+            for _ in range(300):
+                process.stdin.write(b" " * (1 << 20))  # and 256 are the most at first
+            process.stdin.write(b"\n")
+            process.stdin.flush()
+            self.assertEqual(json.loads(process.stdout.readline())["error"]["identifier"],
+                             BAD_REQUEST)
+            with open(f"/proc/{process.pid}/status", encoding="ascii") as status:
+                peak = next(int(line.split()[1]) for line in status if line.startswith("VmHWM"))
+            self.assertLess(peak, 400 << 10)
+
+
 class StreamTest(unittest.TestCase):
     def test_a_reader_that_goes_away_ends_the_session_quietly(self):
         process = subprocess.Popen([TOOL, "session"], stdin=subprocess.PIPE, stdout=subprocess.PIPE,

@@ -39,7 +39,8 @@ class ToolCase(unittest.TestCase):
         return os.path.join(self.folder, name)
 
     def run_tool(self, *arguments, status=0, **options):
-        done = subprocess.run([TOOL, *arguments], capture_output=True, cwd=self.folder, **options)
+        done = subprocess.run([TOOL, *arguments], capture_output=True,
+                              **{"cwd": self.folder, **options})
         self.assertEqual(done.returncode, status, done.stderr)
         return done
 
