@@ -41,12 +41,14 @@ endfunction
 
 ## The entries of an attribute, and how many could not be found. Only the library's look-up tells
 ## which numbers there are, up to some thousand millions. Entries are mostly together, at the
-## beginning or at the end, so both are searched, each as long as there are entries.
+## beginning or at the end, so both are searched, each as long as there are entries. Those of variables
+## have numbers of variables.
 function [entries, unfound] = readEntries (id, attribute, kind, last)
   entries = struct ("number", {}, "datatype", {}, "value", {});
   unfound = __ambrix__ (["getNumAttr" kind "Entries"], id, attribute);
+  most = merge (isempty (kind), Inf, 20000);
   [first, missed, fromEnd] = deal (0, 0, false);
-  while (unfound > 0 && first <= last && missed < 20000)
+  while (unfound > 0 && first <= last && missed < most)
     number = merge (fromEnd, last, first);
     entry = readEntry (id, attribute, kind, number);
     first += ! fromEnd;

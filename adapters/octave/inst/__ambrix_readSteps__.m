@@ -15,7 +15,7 @@ function __ambrix_readSteps__ (file)
 endfunction
 
 function readAll (file)
-  warning ("off", "all");
+  warning ("off", "all", "local");
   ambrix_setValidate (-1);
   [id, closer] = __ambrix_openToRead__ (file);
   at ("the descriptions");
@@ -52,7 +52,9 @@ endfunction
 %!test
 %! [id, restore] = __ambrix_example__ ();
 %! ambrix_close (id);
+%! before = warning ("query", "ambrix:unsupportedDatatype").state;
 %! said = evalc ("__ambrix_readSteps__ (\"example\")");
+%! assert (warning ("query", "ambrix:unsupportedDatatype").state, before);
 %! assert (said, ["at the beginning\nat the descriptions\nat variable \"Time\"\n.\n" ...
 %!                "at variable \"Flux\"\n.\nat variable \"Mode\"\n.\nat end\n"]);
 %!test
