@@ -21,9 +21,6 @@ constexpr long multiplySaturated(long a, long b) {
 /// The product of all factors: 1 for none, 0 as soon as one is 0 however large the others are.
 constexpr long productOf(std::span<const long> factors) {
   long product = 1;
-  for (const long factor : factors) {
-    if (factor == 0) return 0;
-  }
   for (const long factor : factors)
     product = multiplySaturated(product, factor);
   return product;
