@@ -56,6 +56,17 @@ TEST_F(UnloadTest, AChildThatEndsWritesNothingToFilesOfItsParent) {
   EXPECT_NE(fileBytes("new.cdf"), before);
 }
 
+TEST_F(UnloadTest, AChildThatEndsHasItsOwnFilesWritten) {
+  const pid_t child = fork();
+  if (child == 0) {
+    const Given file = create();
+    results("putVarRecordData", {file, createVar(file, {}), 0, row<std::int32_t>({7})});
+    std::exit(0);
+  }
+  waitpid(child, nullptr, 0);
+  EXPECT_EQ(does("getVarRecordData", {open("new"), 0, 0}), "int32 1x1 [7]");
+}
+
 TEST_F(UnloadTest, AModuleLoadedAgainKnowsNoIdentifierOfTheOneBefore) {
   const Given file = create();
   module.unload();

@@ -114,6 +114,13 @@ TEST_F(KindsOfNumbersTest, EachKindOfNumberIsReplacedByOneOfItsKind) {
   }
 }
 
+TEST_F(KindsOfNumbersTest, TheFirstNumbersBeyondAreReplaced) {
+  for (const double first : {2147483648.0, -2147483649.0}) {
+    call("setVarBlockingFactor", {file(), 3, first});
+    EXPECT_EQ(calls().back(), "SELECT_ CDF_ 7 | zVAR_ 3 | PUT_ zVAR_BLOCKINGFACTOR_ -1");
+  }
+}
+
 TEST_F(KindsOfNumbersTest, The32BitNumbersThemselvesPassAsTheyAre) {
   call("setVarBlockingFactor", {file(), 3, 2147483647.0});
   EXPECT_EQ(calls().back(), "SELECT_ CDF_ 7 | zVAR_ 3 | PUT_ zVAR_BLOCKINGFACTOR_ 2147483647");

@@ -70,6 +70,14 @@ TEST_F(OpenFileRegistryTest, OnlyRegisteredFilesAreMarkedAsWritten) {
   EXPECT_TRUE(registry.isWritten(kFive));
 }
 
+TEST_F(OpenFileRegistryTest, AFileThatIsOpenedAnewWasNotWritten) {
+  OpenFileRegistry registry;
+  registry.insert(kFive);
+  registry.markWritten(kFive);
+  registry.insert(kFive);
+  EXPECT_FALSE(registry.isWritten(kFive));
+}
+
 TEST_F(OpenFileRegistryTest, AClearedRegistryKnowsNoFile) {
   OpenFileRegistry registry;
   registry.insert(kFive);

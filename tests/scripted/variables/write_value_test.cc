@@ -97,6 +97,9 @@ TEST_F(WriteValueTest, ADamagedDescriptionIsRefusedInTheLibrarysWords) {
   describe({.datatype = 4, .elements = 1000});
   EXPECT_EQ(errorOf("putVarData", {file(), 3, 0, {}, row<std::int32_t>({1})}),
             libraryFailure("CDFputzVarData", -2011));
+  describe({.datatype = 1, .elements = 2});  // one byte too many to read
+  EXPECT_EQ(errorOf("putVarData", {file(), 3, 0, {}, row<std::int8_t>({1})}),
+            libraryFailure("CDFputzVarData", -2011));
   describe({.datatype = 4, .sizes = {65536, 65536}});
   EXPECT_EQ(errorOf("putVarData", {file(), 3, 0, {0, 0}, row<std::int32_t>({1})}),
             libraryFailure("CDFputzVarData", -2004));
