@@ -3,8 +3,9 @@
 ## What @code{ambrix_plot} draws of a variable.
 ##
 ## @var{picture} has the @code{values}, without invalid ones, whether their axis @code{isLog}, its
-## @code{label}, the @code{names} of components and a @code{title}; and @code{x}, with @code{values},
-## a @code{label} and whether it @code{isTime}. Pictures of values over two axes have @code{y}, too.
+## @code{label} and @code{units}, the @code{names} of components and a @code{title}; and @code{x},
+## with @code{values}, a @code{label}, @code{units} and whether it @code{isTime} or @code{isLog}.
+## Pictures of values over two axes have @code{y}, too.
 ## @end deftypefn
 
 function picture = __ambrix_plotData__ (id, name, range)
@@ -19,11 +20,15 @@ function picture = __ambrix_plotData__ (id, name, range)
   if (isempty (values))
     error ("ambrix:cannotPlot", "ambrix_plot: there are no records of \"%s\" to plot", name);
   endif
-  values = validOf (values, v.attributes);
-  picture = struct ("isLog", isLogarithmic (v.attributes), "label", labelOf (v), ...
-                    "title", textOf (v.attributes, {"CATDESC", "FIELDNAM"}, name), "names", {{}});
-  picture.x = recordAxis (id, s, v, range, rows (values));
-  picture.values = values;
+  picture = labelled (v, {"LABLAXIS"});
+  picture.title = titleOf (v);
+  picture.names = {};
+  if (isTime (v))
+    [picture.values, picture.units] = daysOf (id, v, range);
+  else
+    picture.values = __ambrix_validOf__ (values, v.attributes);
+  endif
+  picture.x = recordAxis (id, s, v, range, rows (picture.values));
   if (numel (v.sizes) == 2)
     picture = imageOf (id, s, v, picture);
   elseif (isSpectrogram (s, v))
@@ -35,6 +40,17 @@ function picture = __ambrix_plotData__ (id, name, range)
   endif
 endfunction
 
+## Days from the beginning of the first day: graphics cards have too few digits for epochs.
+function [days, units] = daysOf (id, v, range)
+  days = double (ambrix_read (id, v.name, "time", "fill", "range", range));
+  first = [floor(min (days(:))), 0](1);
+  if (isnan (first))
+    first = 0;
+  endif
+  days -= first;
+  units = ["days since " datestr(first, "yyyy-mm-dd")];
+endfunction
+
 ## The first record, over its two dimensions.
 function picture = imageOf (id, s, v, picture)
   if (v.recordVariance)
@@ -43,23 +59,6 @@ function picture = imageOf (id, s, v, picture)
   endif
   picture.x = dimensionAxis (id, s, v, 1);
   picture.y = dimensionAxis (id, s, v, 2);
-endfunction
-
-function values = validOf (values, attributes)
-  values = double (values);
-  for [limit, name] = attributes
-    if (! isnumeric (limit) || ! any (numel (limit) == [1, columns(values)]))
-      continue;
-    endif
-    limit = double (limit(:).');
-    if (strcmp (name, "FILLVAL"))
-      values(values == limit) = NaN;
-    elseif (strcmp (name, "VALIDMIN"))
-      values(values < limit) = NaN;
-    elseif (strcmp (name, "VALIDMAX"))
-      values(values > limit) = NaN;
-    endif
-  endfor
 endfunction
 
 ## The variable that an attribute names, empty when there is no such that can be read.
@@ -74,8 +73,7 @@ function other = named (s, v, attribute)
 endfunction
 
 function axis = recordAxis (id, s, v, range, count)
-  axis = struct ("values", (1:count).', "label", "record", "isTime", false, "isLog", false, ...
-                 "first", "");
+  axis = numbered (count, "record");
   other = named (s, v, "DEPEND_0");
   if (isempty (other))
     other = onlyEpochs (s, v.records);
@@ -84,9 +82,15 @@ function axis = recordAxis (id, s, v, range, count)
       || other.records != v.records || ! hasNumbers (other))
     return;
   endif
-  axis.values = double (ambrix_read (id, other.name, "time", "fill", "range", range));
-  axis.isTime = strncmp (other.datatype, "CDF_EPOCH", 9);
-  axis.label = labelOf (other, {"LABLAXIS", "FIELDNAM"});
+  values = double (ambrix_read (id, other.name, "time", "fill", "range", range));
+  if (! any (isfinite (values)))
+    return;
+  endif
+  axis = labelled (other, {"LABLAXIS", "FIELDNAM"});
+  axis.values = values;
+  axis.isTime = isTime (other);
+  axis.isLog = ! axis.isTime && axis.isLog && all (values > 0);
+  axis.first = "";
   if (axis.isTime && ! isnan (axis.values(1)))
     axis.first = datestr (axis.values(1), "yyyy-mm-dd HH:MM");
   endif
@@ -95,7 +99,7 @@ endfunction
 function epochs = onlyEpochs (s, records)
   epochs = [];
   for v = struct2cell (s.variables)'
-    if (strncmp (v{1}.datatype, "CDF_EPOCH", 9) && v{1}.records == records)
+    if (isTime (v{1}) && v{1}.records == records)
       if (! isempty (epochs))
         epochs = [];
         return;
@@ -121,18 +125,29 @@ endfunction
 
 ## The numbers along a dimension; those of the first record where they change.
 function axis = dimensionAxis (id, s, v, k)
-  axis = struct ("values", (1:v.sizes(k)).', "label", sprintf ("index %d", k), "isTime", false, ...
-                 "isLog", false, "first", "");
+  axis = numbered (v.sizes(k), sprintf ("index %d", k));
   other = named (s, v, sprintf ("DEPEND_%d", k));
   if (isempty (other))
     other = onlyNumbers (s, v.sizes(k));
   endif
   if (! isempty (other) && isequal (other.sizes, v.sizes(k)) && hasNumbers (other))
     values = ambrix_read (id, other.name, "range", [1, 1]);
-    axis.values = double (values(:));
-    axis.label = labelOf (other, {"LABLAXIS", "FIELDNAM"});
-    axis.isLog = isLogarithmic (other.attributes) && all (axis.values > 0);
+    values = __ambrix_validOf__ (values(:), other.attributes);
+    if (any (isfinite (values)))
+      axis = setfield (labelled (other, {"LABLAXIS", "FIELDNAM"}), "values", values);
+      axis.isLog = axis.isLog && all (values > 0 | isnan (values));
+      axis.isTime = false;
+    endif
   endif
+endfunction
+
+function axis = numbered (count, label)
+  axis = struct ("values", (1:count).', "label", label, "units", "", "isTime", false, ...
+                 "isLog", false, "first", "");
+endfunction
+
+function time = isTime (v)
+  time = strncmp (v.datatype, "CDF_EPOCH", 9);
 endfunction
 
 function numbers = hasNumbers (v)
@@ -147,8 +162,14 @@ function spectrogram = isSpectrogram (s, v)
                               || (v.sizes > 4 && ! strncmpi (type, "time_series", 11)));
 endfunction
 
+## None where there is one line, or so many that their names would hide more than they tell.
 function names = componentNames (id, s, v)
-  names = arrayfun (@(k) sprintf ("%s %d", v.name, k), 1:prod (v.sizes), "UniformOutput", false);
+  names = {};
+  if (! any (prod (v.sizes) == 2:10))
+    return;
+  endif
+  names = arrayfun (@(k) sprintf ("%s %d", __ambrix_fieldName__ (v.name), k), ...
+                    1:prod (v.sizes), "UniformOutput", false);
   for attribute = {"LABL_PTR_1", "DEPEND_1"}
     other = named (s, v, attribute{1});
     if (! isempty (other) && isequal (other.sizes, v.sizes) && ! hasNumbers (other))
@@ -162,12 +183,17 @@ function log = isLogarithmic (attributes)
   log = strncmpi (textOf (attributes, {"SCALETYP"}, ""), "log", 3);
 endfunction
 
-function label = labelOf (v, names = {"LABLAXIS"})
-  label = textOf (v.attributes, names, __ambrix_fieldName__ (v.name));
-  units = textOf (v.attributes, {"UNITS"}, "");
-  if (! isempty (units))
-    label = sprintf ("%s [%s]", label, units);
-  endif
+## What there is to say about an axis for a variable's values.
+function axis = labelled (v, names)
+  axis.label = textOf (v.attributes, names, __ambrix_fieldName__ (v.name));
+  axis.units = textOf (v.attributes, {"UNITS"}, "");
+  axis.isLog = isLogarithmic (v.attributes);
+endfunction
+
+## Where a description begins with an arrow, this marks variables that have been derived.
+function title = titleOf (v)
+  title = textOf (v.attributes, {"CATDESC", "FIELDNAM"}, __ambrix_fieldName__ (v.name));
+  title = regexprep (title, '^-+>\s*', "");
 endfunction
 
 ## The first of the attributes that is a text, without blanks around it.
@@ -187,6 +213,7 @@ endfunction
 %! picture = __ambrix_plotData__ (id, "Flux", []);
 %! assert (picture.values, [1, 3, 5; 2, 4, 6]);
 %! assert (picture.label, "Flux");
+%! assert (picture.units, "");
 %! assert (picture.title, "Flux 2024-01-01 00:00");
 %! assert (picture.x.label, "index 1");
 %! assert (picture.y.values, [1; 2; 3]);

@@ -5,30 +5,43 @@
 ## @deftypefnx {} {@var{h} =} ambrix_plot (@dots{})
 ## Plot variables of a CDF file, with axes as their attributes tell.
 ##
-## @var{file} is the path of a file, with or without @code{.cdf}, or the identifier of an open one;
-## several @var{names} in a cell array make panels one below the other. With @qcode{"range"} only
-## these records are plotted, counted from 1. @var{h} are the handles of what was plotted.
+## @var{file} is the path of a file, with or without @code{.cdf}, or the identifier of an open one.
+## One variable is plotted in the current axes. Several @var{names} in a cell array make panels one
+## below the other, instead of what is in the figure; those over time share one time axis. With
+## @qcode{"range"} only these records are plotted, counted from 1. @var{h} are the handles of what
+## was plotted.
 ##
 ## A scalar variable, or one of some components, becomes lines over the variable that its attribute
 ## DEPEND_0 names, else over the only epochs that there are as many of as records, else over record
-## numbers. The components have the labels in the variable that LABL_PTR_1 or DEPEND_1 names.
+## numbers. The components, if they are not more than ten, have their names at the right: those in
+## the variable that LABL_PTR_1 or DEPEND_1 names.
 ##
 ## A variable with one dimension whose DEPEND_1 has numbers, and more than four or with a
 ## DISPLAY_TYPE of spectrogram, becomes a picture of its values over time and these numbers. A
 ## variable with two dimensions becomes a picture of its first record.
 ##
 ## Values that equal FILLVAL, or are not from VALIDMIN to VALIDMAX, are left out. Axes are
-## logarithmic where SCALETYP says so; labels are made of LABLAXIS or the variable's name and of
-## UNITS, titles of CATDESC or FIELDNAM. Texts, variables with more dimensions and those without
-## records are the error @code{ambrix:cannotPlot}.
+## logarithmic where SCALETYP says so, without what is not positive; labels are made of LABLAXIS or
+## the variable's name and of UNITS, where the codes @code{!E}, @code{!U}, @code{!D} and @code{!N}
+## raise and lower, titles of CATDESC or FIELDNAM. Of lines with more than 4000 records the extremes
+## are drawn that axes can show, of pictures with more than 2000 means of neighbours. Texts,
+## variables with more dimensions and those without records are the error @code{ambrix:cannotPlot}.
+##
+## The x axis of plots over time counts days from the beginning of the first day, or minutes'
+## fractions of a day from that of the first minute where all is within one, because graphics cards
+## cannot tell moments apart in serial day numbers. The day number of its zero is kept with the
+## axes: @code{getappdata (gca (), "ambrix_start")}. What is added has to have it subtracted, as the
+## limits here; the labels of the axis follow the limits.
 ##
 ## @example
 ## @group
 ## ambrix_plot ("geocpi0", @{"HP_P_Den", "HP_V"@})
+## start = getappdata (gca (), "ambrix_start");
+## xlim (datenum (1994, 7, 26, 0, [10, 20], 0) - start)
 ## print ("-dpng", "plasma.png")
 ## @end group
 ## @end example
-## @seealso{ambrix_read, ambrix_info, plot, pcolor, print}
+## @seealso{ambrix_read, ambrix_info, plot, pcolor, xlim, datenum, print}
 ## @end deftypefn
 
 function h = ambrix_plot (file, names, varargin)
@@ -44,108 +57,57 @@ function h = ambrix_plot (file, names, varargin)
            "ambrix_plot: give the name of a variable, or a cell array of names");
   endif
   [id, closer] = __ambrix_openToRead__ (file);
-  handles = [];
-  for k = 1:numel (names)
-    picture = __ambrix_plotData__ (id, names{k}, options.range);
-    if (numel (names) > 1)
-      picture = panel (picture, k, numel (names));
-    endif
-    handles = [handles; drawn(picture)];
-  endfor
+  pictures = cellfun (@(name) __ambrix_plotData__ (id, name, options.range), names(:).',
+                      "UniformOutput", false);
+  handles = drawn (pictures);
   if (nargout > 0)
     h = handles;
   endif
 endfunction
 
-## Axes for one of several panels, which share what is below the last one.
-function picture = panel (picture, k, count)
-  height = 0.86 / count;
-  axes ("position", [0.14, 0.12 + (count - k) * height, 0.78, 0.88 * height]);
-  picture.title = "";
-  if (k < count)
-    picture.x.label = "";
+function handles = drawn (pictures)
+  start = [];
+  if (numel (pictures) > 1)
+    clf ();
+    pictures = cellfun (@(picture) setfield (picture, "title", ""), pictures, ...
+                        "UniformOutput", false);
+  elseif (ishold ())
+    start = getappdata (gca (), "ambrix_start");
+  endif
+  pictures = __ambrix_shareTimes__ (pictures, start);
+  panels = __ambrix_placeAxes__ (pictures);
+  handles = [];
+  for k = 1:numel (pictures)
+    handles = [handles; __ambrix_drawPicture__(panels(k), pictures{k})];
+    drawXAxis (panels(k), pictures{k}.x, pictures{k}.shows);
+  endfor
+  times = cellfun (@(picture) picture.x.isTime, pictures);
+  if (sum (times) > 1)
+    linkaxes (panels(times), "x");
   endif
 endfunction
 
-function h = drawn (picture)
-  if (isfield (picture, "y"))
-    h = drawnImage (picture);
-  else
-    h = drawnLines (picture);
-    fit (@xlim, picture.x.values);
+## The scale, limits, ticks and labels below, where the axis `shows` them.
+function drawXAxis (ax, x, shows)
+  held = isappdata (ax, "ambrix_start") && ishold (ax);
+  limits = x.limits;
+  if (held)
+    limits = [min(xlim (ax)(1), limits(1)), max(xlim (ax)(2), limits(2))];
   endif
-  ax = gca ();
-  xlabel (ax, picture.x.label, "interpreter", "none");
-  if (picture.x.isTime)
-    __ambrix_timeTicks__ (ax, ! isempty (picture.x.label));
-  elseif (isempty (picture.x.label))
+  xlim (ax, limits);
+  setappdata (ax, "ambrix_start", x.start);
+  if (x.isLog)
+    set (ax, "xscale", "log");
+  endif
+  if (x.isTime)
+    __ambrix_timeTicks__ (ax, x.start, shows);
+    addlistener (ax, "xlim", @(varargin) __ambrix_timeTicks__ (ax, x.start, shows));
+  elseif (shows)
+    [lines, interpreter] = __ambrix_labelText__ (x.label, x.units, 60);
+    xlabel (ax, strjoin (lines, " "), "interpreter", interpreter);
+  else
     set (ax, "xticklabel", {});
   endif
-  title (ax, picture.title, "interpreter", "none");
-endfunction
-
-function fit (limits, values)
-  range = [min(values(:)), max(values(:))];
-  if (numel (range) == 2 && range(1) < range(2))
-    limits (range);
-  endif
-endfunction
-
-function h = drawnLines (picture)
-  h = plot (picture.x.values, picture.values, ".-");
-  ylabel (picture.label, "interpreter", "none");
-  set (gca (), "gridcolor", [0.8, 0.8, 0.8]);
-  grid on
-  if (picture.isLog)
-    set (gca (), "yscale", "log");
-  endif
-  if (columns (picture.values) > 1)
-    if (! picture.isLog)
-      ylim (ylim () * [1, -0.25; 0, 1.25]);  # room for the names
-    endif
-    legend (picture.names, "interpreter", "none", "location", "northeast", ...
-            "orientation", "horizontal");
-    legend boxoff
-  endif
-endfunction
-
-## The values belong to the middles of the cells; the last row and column of `pcolor` don't show.
-function h = drawnImage (picture)
-  values = picture.values.';
-  label = picture.label;
-  if (picture.isLog)
-    values(values <= 0) = NaN;
-    values = log10 (values);
-    label = ["log10 " label];
-  endif
-  x = __ambrix_edges__ (picture.x.values, false);
-  y = __ambrix_edges__ (picture.y.values, picture.y.isLog);
-  h = pcolor (x, y, withColors (values)([1:end, end],[1:end, end]));
-  shading flat
-  fit (@xlim, x);
-  fit (@ylim, y);
-  ylabel (picture.y.label, "interpreter", "none");
-  if (picture.y.isLog)
-    set (gca (), "yscale", "log");
-  endif
-  ylabel (colorbar (), label, "interpreter", "none");
-endfunction
-
-## Invalid values become the lowest color, which is white: not all toolkits leave them out.
-function values = withColors (values)
-  invalid = ! isfinite (values);
-  limits = [min(values(! invalid)), max(values(! invalid))];
-  if (numel (limits) < 2 || limits(1) == limits(2))
-    limits = [[limits, 0](1), [limits, 0](1) + 1];
-  endif
-  colors = viridis (64);
-  if (any (invalid(:)))
-    limits(1) -= diff (limits) / 63;
-    colors(1,:) = [1, 1, 1];
-    values(invalid) = limits(1);
-  endif
-  colormap (gca (), colors);
-  caxis (limits);
 endfunction
 
 %!function [id, restore, f] = drawing ()
@@ -166,7 +128,9 @@ endfunction
 %!   ambrix_putAttrEntry (id, ambrix_getAttrNum (id, "SCALETYP"), number, "CDF_CHAR", "log");
 %!   h = ambrix_plot (id, "speed");
 %!   assert (numel (h), 2);
-%!   assert (get (h(1), "xdata")(:), ambrix_read (id, "Time", "time"));
+%!   start = getappdata (gca (), "ambrix_start");
+%!   assert (start, datenum (2024, 1, 1));
+%!   assert (get (h(1), "xdata")(:) + start, ambrix_read (id, "Time", "time"));
 %!   assert (get (h(2), "ydata")(:), [310; 390]);
 %!   assert (get (get (gca (), "ylabel"), "string"), "speed [km/s]");
 %!   assert (get (get (gca (), "xlabel"), "string"), "2024-01-01");
@@ -213,6 +177,56 @@ endfunction
 %!   assert (numel (axes), 2);
 %!   assert (get (get (axes(1), "children"), "ydata"), [6, 7]);
 %!   assert (get (get (axes(1), "xlabel"), "string"), "record");
+%! unwind_protect_cleanup
+%!   ambrix_close (id);
+%!   close (f);
+%! end_unwind_protect
+
+%!testif ; any (strcmp (available_graphics_toolkits (), "gnuplot"))  # panels share the times
+%! [id, restore, f] = drawing ();
+%! unwind_protect
+%!   energy = ambrix_createVar (id, "energy", "CDF_INT2", 1, 5, false, true);
+%!   ambrix_putVarRecordData (id, energy, 0, int16 (1:5));
+%!   flux = ambrix_createVar (id, "spectrum", "CDF_REAL4", 1, 5, true, true);
+%!   ambrix_hyperPutVarData (id, flux, 0, 2, 1, 0, 5, 1, single (1:10));
+%!   ambrix_putAttrEntry (id, ambrix_getAttrNum (id, "DEPEND_1"), flux, "CDF_CHAR", "energy");
+%!   count = ambrix_createVar (id, "count", "CDF_INT4", 1, [], true, []);
+%!   ambrix_hyperPutVarData (id, count, 0, 2, 1, [], [], [], int32 ([5; 6]));
+%!   plot (1:3);  # goes
+%!   h = ambrix_plot (id, {"count", "spectrum", "Time"});
+%!   panels = cell2mat (get (h, "parent"));
+%!   assert (numel (findobj (f, "type", "axes")), 4);  # with the scale of colors
+%!   boxes = cell2mat (get (panels, "position"));
+%!   assert (boxes(:,[1, 3]), repmat (boxes(1,[1, 3]), 3, 1), 1e-9);
+%!   times = ambrix_read (id, "Time", "time");
+%!   for panel = panels.'  # no cell begins on the day before
+%!     assert (xlim (panel), times([1, 2]).' - datenum (2024, 1, 1), 1e-9);
+%!     assert (get (panel, "xtick"), get (panels(3), "xtick"));
+%!   endfor
+%!   assert (get (panels(1), "xticklabel"), cell (0, 0));
+%!   assert (get (get (panels(3), "xlabel"), "string"), "2024-01-01");
+%!   xlim (panels(3), [0, 0.125]);  # ticks follow, in all panels
+%!   assert (get (panels(3), "xticklabel"){2}, "00:30");
+%!   assert (get (panels(1), "xtick")(2), 1 / 48, 1e-9);
+%! unwind_protect_cleanup
+%!   ambrix_close (id);
+%!   close (f);
+%! end_unwind_protect
+
+%!testif ; any (strcmp (available_graphics_toolkits (), "gnuplot"))  # what is added to a plot
+%! [id, restore, f] = drawing ();
+%! unwind_protect
+%!   later = ambrix_createVar (id, "later", "CDF_EPOCH", 1, [], true, []);
+%!   times = ambrix_computeEpoch ([2024; 1; 2; 6; 0; 0; 0]) + [0; 3600e3; 7200e3];
+%!   ambrix_hyperPutVarData (id, later, 0, 3, 1, [], [], [], times);
+%!   ambrix_plot (id, "Time");
+%!   limits = xlim ();
+%!   hold on
+%!   h = ambrix_plot (id, "later");
+%!   assert (get (h, "xdata"), 1 + [6, 7, 8] / 24, 1e-9);
+%!   assert (xlim (), [limits(1), 1 + 8 / 24], 1e-9);
+%!   assert (get (h, "ydata"), [6, 7, 8] / 24, 1e-9);
+%!   assert (get (get (gca (), "ylabel"), "string"), "later [days since 2024-01-02]");
 %! unwind_protect_cleanup
 %!   ambrix_close (id);
 %!   close (f);

@@ -1,0 +1,34 @@
+## -*- texinfo -*-
+## @deftypefn {} {@var{values} =} __ambrix_validOf__ (@var{values}, @var{attributes})
+## The values as doubles, with NaN for those that equal the attribute FILLVAL or are not from
+## VALIDMIN to VALIDMAX. There may be one of these for each column.
+## @end deftypefn
+
+function values = __ambrix_validOf__ (values, attributes)
+  kind = class (values);
+  values = double (values);
+  for [limit, name] = attributes
+    if (! isnumeric (limit) || ! any (numel (limit) == [1, columns(values)]))
+      continue;
+    endif
+    if (any (strcmp (kind, {"single", "double"})))
+      limit = cast (limit, kind);  # of single data these may be doubles
+    endif
+    limit = double (limit(:).');
+    if (strcmp (name, "FILLVAL"))
+      values(values == limit) = NaN;
+    elseif (strcmp (name, "VALIDMIN"))
+      values(values < limit) = NaN;
+    elseif (strcmp (name, "VALIDMAX"))
+      values(values > limit) = NaN;
+    endif
+  endfor
+endfunction
+
+%!test
+%! limits = struct ("VALIDMIN", [1, 4], "VALIDMAX", 5, "FILLVAL", int16 (3), "UNITS", "nT");
+%! values = __ambrix_validOf__ (int16 ([0, 3; 2, 4; 3, 5; 5, 6]), limits);
+%! assert (values, [NaN, NaN; 2, 4; NaN, 5; 5, NaN]);
+%!test  # a double fill value of single data
+%! assert (__ambrix_validOf__ (single ([0.1; 2]), struct ("FILLVAL", 0.1)), [NaN; 2]);
+%!assert (__ambrix_validOf__ (single ([0.1; 2]), struct ("VALIDMIN", 0.1)), double (single ([0.1; 2])))
