@@ -22,9 +22,12 @@ endfunction
 
 function h = drawLines (ax, picture)
   values = picture.values;
+  label = picture.label;
   isLog = picture.isLog && any (values(:) > 0);
   if (isLog)
     values(values <= 0) = NaN;
+  else
+    [values, label] = withoutBase (values, label);
   endif
   lines = {};
   for k = 1:columns (values)
@@ -39,8 +42,21 @@ function h = drawLines (ax, picture)
   if (isLog)
     set (ax, "yscale", "log");
   endif
-  labelY (ax, ax, picture.label, picture.units, leftOf (ax));
+  labelY (ax, ax, label, picture.units, leftOf (ax));
   nameLines (ax, h, picture.names);
+endfunction
+
+## Values that differ by little from each other, such as seconds since 1970 of one day, less a round
+## number: graphics cards count in single precision.
+function [values, label] = withoutBase (values, label)
+  span = max (values(:)) - min (values(:));
+  if (! (span > 0 && max (abs (values(:))) > 1e4 * span))
+    return;
+  endif
+  step = 10 ^ ceil (log10 (span));
+  base = floor (min (values(:)) / step) * step;
+  values -= base;
+  label = sprintf ("%s - %.15g", label, base);
 endfunction
 
 ## At the right, in the lines' colors: as a legend, but small and the same in all toolkits.
@@ -166,6 +182,11 @@ endfunction
 %!   picture.names = {};
 %!   __ambrix_drawPicture__ (gca (), picture);
 %!   assert (get (gca (), "yscale"), "linear");
+%!   picture.values = 1294333200 + [5; 60; 20];  # far from zero, and little else
+%!   picture.isLog = false;
+%!   h = __ambrix_drawPicture__ (gca (), picture);
+%!   assert (get (h, "ydata"), [5, 60, 20]);
+%!   assert (get (get (gca (), "ylabel"), "string"), "B - 1294333200 [nT]");
 %!   picture.values(:) = NaN;
 %!   __ambrix_drawPicture__ (gca (), picture);
 %!   assert (get (findobj (gca (), "type", "text"), "string"), "no valid values");

@@ -40,6 +40,15 @@ function picture = __ambrix_plotData__ (id, name, range)
   endif
 endfunction
 
+## Places along an axis. What files say of their valid range may be meant for others.
+function values = withoutFill (values, attributes)
+  limits = struct ();
+  if (isfield (attributes, "FILLVAL"))
+    limits.FILLVAL = attributes.FILLVAL;
+  endif
+  values = __ambrix_validOf__ (values, limits);
+endfunction
+
 ## Days from the beginning of the first day: graphics cards have too few digits for epochs.
 function [days, units] = daysOf (id, v, range)
   days = double (ambrix_read (id, v.name, "time", "fill", "range", range));
@@ -132,7 +141,7 @@ function axis = dimensionAxis (id, s, v, k)
   endif
   if (! isempty (other) && isequal (other.sizes, v.sizes(k)) && hasNumbers (other))
     values = ambrix_read (id, other.name, "range", [1, 1]);
-    values = __ambrix_validOf__ (values(:), other.attributes);
+    values = withoutFill (values(:), other.attributes);
     if (any (isfinite (values)))
       axis = setfield (labelled (other, {"LABLAXIS", "FIELDNAM"}), "values", values);
       axis.isLog = axis.isLog && all (values > 0 | isnan (values));
@@ -156,7 +165,7 @@ endfunction
 
 function spectrogram = isSpectrogram (s, v)
   other = named (s, v, "DEPEND_1");
-  type = textOf (v.attributes, {"DISPLAY_TYPE"}, "");
+  type = __ambrix_textOf__ (v.attributes, {"DISPLAY_TYPE"}, "");
   spectrogram = v.recordVariance && numel (v.sizes) == 1 && ! isempty (other) ...
     && hasNumbers (other) && (strncmpi (type, "spect", 5) ...
                               || (v.sizes > 4 && ! strncmpi (type, "time_series", 11)));
@@ -180,32 +189,20 @@ function names = componentNames (id, s, v)
 endfunction
 
 function log = isLogarithmic (attributes)
-  log = strncmpi (textOf (attributes, {"SCALETYP"}, ""), "log", 3);
+  log = strncmpi (__ambrix_textOf__ (attributes, {"SCALETYP"}, ""), "log", 3);
 endfunction
 
 ## What there is to say about an axis for a variable's values.
 function axis = labelled (v, names)
-  axis.label = textOf (v.attributes, names, __ambrix_fieldName__ (v.name));
-  axis.units = textOf (v.attributes, {"UNITS"}, "");
+  axis.label = __ambrix_textOf__ (v.attributes, names, __ambrix_fieldName__ (v.name));
+  axis.units = __ambrix_textOf__ (v.attributes, {"UNITS"}, "");
   axis.isLog = isLogarithmic (v.attributes);
 endfunction
 
 ## Where a description begins with an arrow, this marks variables that have been derived.
 function title = titleOf (v)
-  title = textOf (v.attributes, {"CATDESC", "FIELDNAM"}, __ambrix_fieldName__ (v.name));
+  title = __ambrix_textOf__ (v.attributes, {"CATDESC", "FIELDNAM"}, __ambrix_fieldName__ (v.name));
   title = regexprep (title, '^-+>\s*', "");
-endfunction
-
-## The first of the attributes that is a text, without blanks around it.
-function text = textOf (attributes, names, default)
-  text = default;
-  for name = names
-    if (isfield (attributes, name{1}) && ischar (attributes.(name{1}))
-        && ! isempty (strtrim (attributes.(name{1}))))
-      text = strtrim (attributes.(name{1}));
-      return;
-    endif
-  endfor
 endfunction
 
 %!test
@@ -217,6 +214,20 @@ endfunction
 %! assert (picture.title, "Flux 2024-01-01 00:00");
 %! assert (picture.x.label, "index 1");
 %! assert (picture.y.values, [1; 2; 3]);
+%! ambrix_close (id);
+%!test  # of an axis only fill values are left out
+%! s.data = struct ("image", magic (3), "place", [1; 99; -1]);
+%! s.variables.image.recordVariance = false;
+%! s.variables.place.recordVariance = false;
+%! s.variables.place.attributes = struct ("FILLVAL", -1, "VALIDMAX", 3);
+%! s.variables.image.attributes = struct ("DEPEND_1", "place", "VALIDMAX", 8);
+%! [id, restore] = __ambrix_example__ ();
+%! ambrix_close (id);
+%! ambrix_write ("places", s);
+%! id = ambrix_open ("places");
+%! picture = __ambrix_plotData__ (id, "image", []);
+%! assert (picture.x.values, [1; 99; NaN]);
+%! assert (isnan (picture.values), magic (3) > 8);
 %! ambrix_close (id);
 %!test  # what some files hold: one number, texts or fill values for times
 %! s.data = struct ("one", 5, "a", [1; 2], "b", [3; 4], "c", {{"x"; "y"}});

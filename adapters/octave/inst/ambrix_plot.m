@@ -27,11 +27,12 @@
 ## are drawn that axes can show, of pictures with more than 2000 means of neighbours. Texts,
 ## variables with more dimensions and those without records are the error @code{ambrix:cannotPlot}.
 ##
-## The x axis of plots over time counts days from the beginning of the first day, or minutes'
-## fractions of a day from that of the first minute where all is within one, because graphics cards
-## cannot tell moments apart in serial day numbers. The day number of its zero is kept with the
-## axes: @code{getappdata (gca (), "ambrix_start")}. What is added has to have it subtracted, as the
-## limits here; the labels of the axis follow the limits.
+## The x axis of plots over time counts days from the beginning of the first day, or of the first
+## minute where all is within one, because graphics cards cannot tell moments apart in serial day
+## numbers. The day number of its zero is kept with the axes, as
+## @code{getappdata (gca (), "ambrix_start")}. What is added has to have it subtracted, as the
+## limits here; the labels of the axis follow the limits. For the same reason values far from zero
+## that differ little are drawn less a number, which their label tells.
 ##
 ## @example
 ## @group
