@@ -27,7 +27,7 @@ function h = drawLines (ax, picture)
   if (isLog)
     values(values <= 0) = NaN;
   else
-    [values, label] = withoutBase (values, label);
+    [values, label] = withoutBase (ax, values, label);
   endif
   lines = {};
   for k = 1:columns (values)
@@ -36,7 +36,7 @@ function h = drawLines (ax, picture)
   endfor
   h = plot (ax, lines{:});
   if (rows (values) < 200)
-    set (h, "markersize", 10);  # a point alone is hardly seen else
+    set (h, "markersize", 8);  # a point alone is hardly seen else
   endif
   set (ax, "gridcolor", [0.8, 0.8, 0.8], "gridalpha", 1, "xgrid", "on", "ygrid", "on");
   if (isLog)
@@ -47,16 +47,26 @@ function h = drawLines (ax, picture)
 endfunction
 
 ## Values that differ by little from each other, such as seconds since 1970 of one day, less a round
-## number: graphics cards count in single precision.
-function [values, label] = withoutBase (values, label)
-  span = max (values(:)) - min (values(:));
-  if (! (span > 0 && max (abs (values(:))) > 1e4 * span))
-    return;
+## number: graphics cards count in single precision. What is added to a plot is less the same.
+function [values, label] = withoutBase (ax, values, label)
+  base = baseOf (values);
+  if (ishold (ax) && isappdata (ax, "ambrix_base"))
+    base = getappdata (ax, "ambrix_base");
   endif
-  step = 10 ^ ceil (log10 (span));
-  base = floor (min (values(:)) / step) * step;
+  setappdata (ax, "ambrix_base", base);
   values -= base;
-  label = sprintf ("%s - %.15g", label, base);
+  if (base != 0)
+    label = sprintf ("%s - %.15g", label, base);
+  endif
+endfunction
+
+function base = baseOf (values)
+  base = 0;
+  span = max (values(:)) - min (values(:));
+  if (span > 0 && max (abs (values(:))) > 1e4 * span)
+    step = 10 ^ ceil (log10 (span));
+    base = floor (min (values(:)) / step) * step;
+  endif
 endfunction
 
 ## At the right, in the lines' colors: as a legend, but small and the same in all toolkits.
@@ -187,6 +197,10 @@ endfunction
 %!   h = __ambrix_drawPicture__ (gca (), picture);
 %!   assert (get (h, "ydata"), [5, 60, 20]);
 %!   assert (get (get (gca (), "ylabel"), "string"), "B - 1294333200 [nT]");
+%!   hold on
+%!   picture.values += 1000;
+%!   assert (get (__ambrix_drawPicture__ (gca (), picture), "ydata"), [1005, 1060, 1020]);
+%!   hold off
 %!   picture.values(:) = NaN;
 %!   __ambrix_drawPicture__ (gca (), picture);
 %!   assert (get (findobj (gca (), "type", "text"), "string"), "no valid values");
