@@ -124,7 +124,7 @@ class PackageTest(unittest.TestCase):
                    env={**NOTHING_SET, "HOME": str(self.folder)})
 
     def assert_stands_alone(self):
-        """No file of what is installed names the repository, and a shared library is taken along."""
+        """No installed file names the repository, and a shared library is taken along."""
         files = [path for path in (self.folder / ".local").rglob("*") if path.is_file()]
         named = [path.name for path in files if str(ROOT).encode() in path.read_bytes()]
         self.assertEqual(named, [])

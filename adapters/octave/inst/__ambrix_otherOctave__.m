@@ -1,7 +1,8 @@
 ## -*- texinfo -*-
 ## @deftypefn {} {[@var{status}, @var{isLate}] =} __ambrix_otherOctave__ (@var{code}, @var{log}, @var{seconds})
-## Run code in another Octave, which has the package, and wait for its end. What it prints goes to the
-## file @var{log}. When that has not grown for so many @var{seconds} it is ended, and @var{isLate}.
+## Run code in another Octave, which has the package, and wait for its end. What it prints goes to
+## the file @var{log}. When that has not grown for so many @var{seconds} it is ended, and
+## @var{isLate}.
 ## @end deftypefn
 
 function [status, isLate] = __ambrix_otherOctave__ (code, log, seconds)

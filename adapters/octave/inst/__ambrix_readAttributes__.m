@@ -2,9 +2,9 @@
 ## @deftypefn {} {[@var{s}, @var{left}] =} __ambrix_readAttributes__ (@var{id}, @var{s}, @var{names}, @var{count})
 ## Put the attributes of a file into its description.
 ##
-## @var{names} are the fields of the variables by number. @var{left} lists the entries that had to be
-## left out because their datatype is not supported, but for those of variables of such a datatype.
-## @end deftypefn
+## @var{names} are the fields of the variables by number. @var{left} lists the entries that had to
+## be left out because their datatype is not supported, but for those of variables of such a
+## datatype. @end deftypefn
 
 function [s, left] = __ambrix_readAttributes__ (id, s, names, count)
   list = struct ("name", cell (1, count), "scope", "", "entries", [], "datatypes", []);
@@ -41,8 +41,8 @@ endfunction
 
 ## The entries of an attribute, and how many could not be found. Only the library's look-up tells
 ## which numbers there are, up to some thousand millions. Entries are mostly together, at the
-## beginning or at the end, so both are searched, each as long as there are entries. Those of variables
-## have numbers of variables.
+## beginning or at the end, so both are searched, each as long as there are entries. Those of
+## variables have numbers of variables.
 function [entries, unfound] = readEntries (id, attribute, kind, last)
   entries = struct ("number", {}, "datatype", {}, "value", {});
   unfound = __ambrix__ (["getNumAttr" kind "Entries"], id, attribute);

@@ -10,12 +10,13 @@ function __ambrix_readSteps__ (file)
     readAll (file);
     at ("end");
   catch err
-    printf ("failed %s\n", err.message);
+    printf ("failed %s\n", strrep (err.message, "\n", " "));
   end_try_catch
 endfunction
 
 function readAll (file)
-  warning ("off", "all", "local");
+  before = warning ("off", "all");
+  restore = onCleanup (@() warning (before));
   ambrix_setValidate (-1);
   [id, closer] = __ambrix_openToRead__ (file);
   at ("the descriptions");

@@ -12,8 +12,8 @@ function epochs = __ambrix_toEpochs__ (values, datatype, options, what)
   areDays = ! isempty (given) && isempty (outside);
   if (isequal (options.time, true))
     if (! isempty (outside))
-      error ("ambrix:invalidTime", ["ambrix_write: s.options.time says that %s is in serial day " ...
-             "numbers, but %g is none of the years 0 to 9999"], what, outside(1));
+      error ("ambrix:invalidTime", ["ambrix_write: s.options.time says that %s is in serial " ...
+             "day numbers, but %g is none of the years 0 to 9999"], what, outside(1));
     endif
     epochs = __ambrix_fromDays__ (values, datatype, options.records);
   elseif (areDays && isempty (options.time))

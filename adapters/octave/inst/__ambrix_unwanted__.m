@@ -1,7 +1,7 @@
 ## -*- texinfo -*-
 ## @deftypefn {} {@var{texts} =} __ambrix_unwanted__ (@var{all}, @var{read}, @var{options})
-## What the caller of @code{ambrix_read} did not ask for, or asked to have less exactly, of @var{all}
-## variables.
+## What the caller of @code{ambrix_read} did not ask for, or asked to have less exactly, of
+## @var{all} variables.
 ## @end deftypefn
 
 function texts = __ambrix_unwanted__ (all, read, options)

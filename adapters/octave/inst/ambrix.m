@@ -20,12 +20,12 @@
 ## @end table
 ##
 ## The commands are one function for each operation of the CDF library, such as @code{ambrix_open},
-## @code{ambrix_getVarData} and @code{ambrix_close}. @code{pkg describe -verbose ambrix} lists all of
-## them by subject; a part of a name and the Tab key complete it, and @code{lookfor} finds words in
-## their descriptions. The tutorial is @file{doc/octave.md} in the folder of the package.
+## @code{ambrix_getVarData} and @code{ambrix_close}. @code{pkg describe -verbose ambrix} lists all
+## of them by subject; a part of a name and the Tab key complete it, and @code{lookfor} finds words
+## in their descriptions. The tutorial is @file{doc/octave.md} in the folder of the package.
 ##
-## A damaged file can make the CDF library crash, which ends Octave. Use @code{ambrix_check} for files
-## that you don't trust before anything else.
+## A damaged file can make the CDF library crash, which ends Octave. Use @code{ambrix_check} for
+## files that you don't trust before anything else.
 ##
 ## @example
 ## @group

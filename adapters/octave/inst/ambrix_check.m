@@ -6,12 +6,13 @@
 ## Tell whether a CDF file is sound, by reading all that is in it.
 ##
 ## A damaged file can make the CDF library crash, which ends Octave, or never return. Here another
-## Octave reads the file, so that this one is safe: check a file that you don't trust before you read
-## it. Checking takes as long as reading, and the start of an Octave.
+## Octave reads the file, so that this one is safe: check a file that you don't trust before you
+## read it. Checking takes as long as reading, and the start of an Octave.
 ##
-## @var{file} is the path of the file, with or without @code{.cdf}. @var{sound} is true or false, and
-## @var{report} tells what is wrong; without outputs the report is printed. When nothing more was read
-## for @var{seconds}, 60 unless told otherwise, the other Octave is ended, and the file is not sound.
+## @var{file} is the path of the file, with or without @code{.cdf}. @var{sound} is true or false,
+## and @var{report} tells what is wrong; without outputs the report is printed. When nothing more
+## was read for @var{seconds}, 60 unless told otherwise, the other Octave is ended, and the file is
+## not sound.
 ##
 ## @example
 ## @group
@@ -51,12 +52,14 @@ endfunction
 function [isSound, said] = verdict (status, isLate, seconds, lines)
   steps = regexp (lines, '^at (.*)$', "tokens", "lineanchors", "dotexceptnewline");
   step = [{{"the start of another Octave"}}, steps]{end}{1};
-  failure = regexp (lines, '^failed (.*)', "tokens", "lineanchors", "once");
+  failure = regexp (lines, '^failed (.*)$', "tokens", "lineanchors", ...
+                    "dotexceptnewline", "once");
   isSound = false;
   if (isLate)
     said = sprintf ("not sound: nothing was read for %g seconds at %s", seconds, step);
   elseif (WIFSIGNALED (status))
-    said = sprintf ("not sound: the CDF library crashed (signal %d) at %s", WTERMSIG (status), step);
+    number = WTERMSIG (status);
+    said = sprintf ("not sound: the CDF library crashed (signal %d) at %s", number, step);
   elseif (! isempty (failure))
     said = ["not sound: " strtrim(failure{1})];
   elseif (strcmp (step, "end"))
@@ -78,7 +81,8 @@ endfunction
 %!test  # files whose damage makes some CDF libraries crash
 %! [id, restore] = __ambrix_example__ ();
 %! ambrix_close (id);
-%! s = struct ("data", struct ("x", magic (60)), "file", struct ("compression", "HUFF_COMPRESSION"));
+%! s.data.x = magic (60);
+%! s.file.compression = "HUFF_COMPRESSION";
 %! ambrix_write ("it's", s);
 %! for place = [60, 72, 80]
 %!   stream = fopen ("it's.cdf", "r+");

@@ -10,7 +10,8 @@
 ##
 ## @table @code
 ## @item file
-## what the file itself is: @code{name}, @code{path}, @code{version} of the CDF library that wrote it,
+## what the file itself is: @code{name}, @code{path}, @code{version} of the CDF library that wrote
+## it,
 ## @code{format}, @code{encoding}, @code{majority}, @code{checksum}, @code{compression} and
 ## @code{compressionParameter}
 ## @item attributes

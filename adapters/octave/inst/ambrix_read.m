@@ -50,7 +50,8 @@
 ## With @qcode{"char"} texts are arrays of characters, all of them, along a last dimension.
 ## @end table
 ##
-## Variables and entries of attributes whose datatype is not supported are left out, with the warning
+## Variables and entries of attributes whose datatype is not supported are left out, with the
+## warning
 ## @code{ambrix:unsupportedDatatype}. A wrong option is the error @code{ambrix:invalidOption}; other
 ## errors are those of the commands.
 ##

@@ -3,8 +3,8 @@
 ## @deftypefnx {} {} ambrix_write (@var{file}, @var{s}, @var{option}, @dots{})
 ## Write a struct of arrays to a new CDF file.
 ##
-## @var{file} is the path of the file; @code{.cdf} is added where it is missing. The new file appears
-## whole or not at all. The options are:
+## @var{file} is the path of the file; @code{.cdf} is added where it is missing. The new file
+## appears whole or not at all. The options are:
 ##
 ## @table @asis
 ## @item @qcode{"overwrite"}
@@ -38,8 +38,8 @@
 ## file; without them it is column-major, a single file, not compressed
 ## @item s.options
 ## how the data are given, as the options of @code{ambrix_read}: @code{records}, @qcode{"first"} or
-## @qcode{"last"}; @code{time}, whether times are serial day numbers; @code{fill}, whether NaN stands
-## for the attribute FILLVAL
+## @qcode{"last"}; @code{time}, whether times are serial day numbers; @code{fill}, whether NaN
+## stands for the attribute FILLVAL
 ## @end table
 ##
 ## Also @code{sizes}, @code{elements}, @code{variances}, @code{sparseRecords}, @code{padValue} and
