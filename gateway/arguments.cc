@@ -19,29 +19,12 @@ namespace {
   throw std::logic_error("basic_string::_M_construct null not valid");
 }
 
-long toLong(double value) {
-  return truncateToLong(value);
-}
-long toLong(float value) {
-  return truncateToLong(static_cast<double>(value));
-}
-long toLong(bool value) {
-  return value ? 1 : 0;
-}
-long toLong(char16_t value) {
-  return static_cast<long>(value);
-}
-template <typename Integer>
-long toLong(Integer value) {
-  return boost::numeric_cast<long>(value);
-}
-
 template <typename Element>
 std::vector<long> convertAll(const qvArray* argument) {
   const auto* elements = static_cast<const Element*>(qvGetReadOnlyData(argument));
   std::vector<long> values(qvGetNumberOfElements(argument));
   for (std::size_t i = 0; i < values.size(); ++i)
-    values[i] = toLong(elements[i]);
+    values[i] = truncateToLong(static_cast<double>(elements[i]));
   return values;
 }
 

@@ -31,9 +31,9 @@ void requireInRange(std::span<const double> values);
 /// Raises `argumentNotDoubleScalar` with the label unless the array is one double.
 long getLongScalarArg(const qvArray* argument, const char* label);
 
-/// All elements in storage order, of any numeric, logical or character array, by value; none of an
-/// empty array of whatever class. Raises `argumentNotDoublePrecision` with the label for anything
-/// else.
+/// All elements in storage order, of any numeric, logical or character array, each taken as a
+/// double (an integer of 64 bits is rounded to one); none of an empty array of whatever class.
+/// Raises `argumentNotDoublePrecision` with the label for anything else.
 std::vector<long> getLongVectorArg(const qvArray* argument, const char* label);
 
 /// The low 8 bits of each character up to the first zero. A `std::logic_error` if the array is not

@@ -89,7 +89,7 @@ TEST_F(ArgumentsTest, TheFirstElementOutOfRangeEndsAVector) {
   EXPECT_THROW(vector({1, -1e30, 1e30}), boost::numeric::negative_overflow);
 }
 
-TEST_F(ArgumentsTest, VectorsOfOtherClassesAreConvertedByValue) {
+TEST_F(ArgumentsTest, VectorsOfOtherClassesAreTakenAsDoubles) {
   EXPECT_THAT(vector(row<float>({1.75F, -2.75F})), ElementsAre(1, -2));
   EXPECT_THAT(vector(row<std::int8_t>({-128, 127})), ElementsAre(-128, 127));
   EXPECT_THAT(vector(row<std::uint8_t>({255})), ElementsAre(255));
@@ -97,10 +97,18 @@ TEST_F(ArgumentsTest, VectorsOfOtherClassesAreConvertedByValue) {
   EXPECT_THAT(vector(row<std::uint16_t>({65535})), ElementsAre(65535));
   EXPECT_THAT(vector(row<std::int32_t>({-5, 6})), ElementsAre(-5, 6));
   EXPECT_THAT(vector(row<std::uint32_t>({4294967295U})), ElementsAre(4294967295));
-  EXPECT_THAT(vector(row<std::int64_t>({kLeast, kMost})), ElementsAre(kLeast, kMost));
+  EXPECT_THAT(vector(row<std::int64_t>({-5, 6})), ElementsAre(-5, 6));
   EXPECT_THAT(vector(row<std::uint64_t>({7})), ElementsAre(7));
   EXPECT_THAT(vector(row<bool>({true, false})), ElementsAre(1, 0));
   EXPECT_THAT(vector("A~"), ElementsAre(65, 126));
+}
+
+TEST_F(ArgumentsTest, IntegersOf64BitsAreRoundedToDoubles) {
+  constexpr std::int64_t kFirstInexact = (1LL << 53) + 1;
+  EXPECT_THAT(vector(row<std::int64_t>({kFirstInexact, -kFirstInexact})),
+              ElementsAre(kFirstInexact - 1, 1 - kFirstInexact));
+  EXPECT_THROW(vector(row<std::int64_t>({kLeast})), boost::numeric::negative_overflow);
+  EXPECT_THROW(vector(row<std::int64_t>({kMost})), boost::numeric::positive_overflow);
 }
 
 TEST_F(ArgumentsTest, AVectorsUint64BeyondTheRangeOverflows) {
