@@ -2,7 +2,6 @@
 #pragma once
 
 #include <cstdint>
-#include <string_view>
 
 #include "host/qv.h"
 
@@ -17,7 +16,7 @@ using Handler = void (*)(int outputCount, qvArray* outputs[], std::int32_t argum
 
 struct CommandEntry {
   std::int32_t id;
-  std::string_view name;  // its length is known, so most rows differ at a glance
+  const char* name;  // as the user types it
   std::int32_t minimumArguments;
   std::int32_t maximumArguments;
   Handler handler;
