@@ -1,10 +1,13 @@
 #include "attributes/attribute_entries.h"
 
+#include <optional>
+
 #include "attributes/attribute_calls.h"
 #include "gateway/errors.h"
 #include "gateway/open_file_registry.h"
 #include "gateway/outputs.h"
 #include "gateway/raise_error.h"
+#include "gateway/scratch.h"
 #include "gateway/value_buffer.h"
 #include "variables/datatypes.h"
 #include "variables/library_data.h"
@@ -48,6 +51,23 @@ const EntryKind& kindForScope(long scope) {
   }
 }
 
+/// What the library reads of a value: of `CDF_CHAR` the host's narrow copy of the text.
+class EntryData {
+ public:
+  EntryData(const qvArray* value, long datatype) {
+    if (datatype == CDF_CHAR) {
+      text_.reset(qvArrayToString(value));
+    } else {
+      data_.emplace(value);
+    }
+  }
+  [[nodiscard]] void* bytes() const { return data_ ? data_->bytes() : text_.get(); }
+
+ private:
+  HostString text_;
+  std::optional<LibraryData> data_;
+};
+
 }  // namespace
 
 void getEntry(const EntryKind& kind, qvArray* outputs[], const qvArray* arguments[]) {
@@ -88,7 +108,7 @@ void putAttrEntry(int, qvArray*[], std::int32_t, const qvArray* arguments[], con
   }
   auto elements = static_cast<long>(qvGetNumberOfElements(value));
   if (datatype == CDF_EPOCH16) elements /= 2;  // each value is a pair of doubles
-  const LibraryData data(value);
+  const EntryData data(value, datatype);
   long scope = 0;
   callOnFile("CDFgetAttrScope", at.file, ATTR_, at.attribute, GET_, ATTR_SCOPE_, &scope);
   const EntryKind& kind = kindForScope(scope);

@@ -1,4 +1,5 @@
 // Writing attribute entries: one handler for both commands, the attribute's scope decides.
+#include "tests/support/host_texts.h"
 #include "tests/support/scripted_test.h"
 
 namespace ambrix_test {
@@ -46,6 +47,14 @@ TEST_F(PutEntryTest, CharactersGoAsTheirLowBitsWithAZeroBehindThem) {
     EXPECT_THAT(fake.bytesRead(), ElementsAre('a', 0xE9, 0xAC, 0));
     EXPECT_EQ(calls()[1], "CDFputAttrEntry 7 1 2 5 " + std::to_string(datatype) + " 3");
   }
+}
+
+TEST_F(PutEntryTest, TheHostNarrowsSignedTextsOnly) {
+  narrowCopiesMade();  // those of the commands' names count, too
+  call("putAttrEntry", {file(), 2, 5, 52, "abc"});
+  const std::size_t unsignedText = narrowCopiesMade();
+  call("putAttrEntry", {file(), 2, 5, 51, "abc"});
+  EXPECT_EQ(narrowCopiesMade(), unsignedText + 1);
 }
 
 TEST_F(PutEntryTest, AnEmptyTextHandsOverAZeroByteAndNeverNull) {
