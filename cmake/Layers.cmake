@@ -13,12 +13,13 @@ function(ambrix_root name)
   target_include_directories(ambrix_root_${name} INTERFACE "${root}")
 endfunction()
 
-# ambrix_layer(NAME [SEES folder...]): object library ambrix_NAME from the sources of this folder.
-# It sees itself, the folders named, the CDF header and Boost; it links with nothing.
+# ambrix_layer(NAME [SEES folder...]): object library ambrix_NAME from the sources of this folder
+# and those in it. It sees itself, the folders named, the CDF header and Boost; it links with nothing.
 function(ambrix_layer name)
   cmake_parse_arguments(PARSE_ARGV 1 arg "" "" "SEES")
   ambrix_root(${name})
-  file(GLOB sources CONFIGURE_DEPENDS "${CMAKE_CURRENT_SOURCE_DIR}/*.cc")
+  file(GLOB sources CONFIGURE_DEPENDS 
+    "${CMAKE_CURRENT_SOURCE_DIR}/*.cc" "${CMAKE_CURRENT_SOURCE_DIR}/*/*.cc")
   if(NOT sources)
     return()  # a folder of headers only
   endif()

@@ -97,10 +97,10 @@ void getCompression(int, qvArray* outputs[], std::int32_t, const qvArray* argume
 void getVarCompression(int, qvArray* outputs[], std::int32_t, const qvArray* arguments[],
                        const CommandEntry*) {
   const CdfId file = getCdfIdArg(arguments[0]);
-  const long variable = getLongScalarArg(arguments[1], "VARNUM");
+  const long number = getLongScalarArg(arguments[1], "VARNUM");
   Compression found;
-  callOnVariable("CDFgetzVarCompression", file, variable, GET_,  //
-                 zVAR_COMPRESSION_, &found.type, found.parameters, &found.percentage);
+  VariableOperation(file, number, "CDFgetzVarCompression")
+      .call(GET_, zVAR_COMPRESSION_, &found.type, found.parameters, &found.percentage);
   checkCompressionType(found.type);
   setOutputs(outputs, {qvCreateString(typeName(found.type)), variableParameter(found),
                        makeDoubleScalar(found.percentage)});
@@ -128,7 +128,7 @@ void setCompression(int, qvArray*[], std::int32_t argumentCount, const qvArray* 
 void setVarCompression(int, qvArray*[], std::int32_t argumentCount, const qvArray* arguments[],
                        const CommandEntry*) {
   const CdfId file = getCdfIdArg(arguments[0]);
-  const long variable = getLongScalarArg(arguments[1], "VARNUM");
+  const long number = getLongScalarArg(arguments[1], "VARNUM");
   const long type = getLongScalarArg(arguments[2], "CTYPE");
   checkCompressionType(type);
   long parameters[CDF_MAX_PARMS] = {};
@@ -137,8 +137,8 @@ void setVarCompression(int, qvArray*[], std::int32_t argumentCount, const qvArra
   } else if (type == GZIP_COMPRESSION) {
     raiseError(cdflib::unspecifiedGzipCompressionLevel());
   }
-  callOnVariable("CDFsetzVarCompression", file, variable, PUT_,  //
-                 zVAR_COMPRESSION_, type, parameters);
+  VariableOperation(file, number, "CDFsetzVarCompression")
+      .call(PUT_, zVAR_COMPRESSION_, type, parameters);
 }
 
 }  // namespace TOLVEX::ambrix

@@ -62,13 +62,39 @@ void callOnFile(const char* routine, CdfId file, Items... items) {
   callLibrary(routine, SELECT_, CDF_, libraryHandle(file, routine), items...);
 }
 
-template <typename... Items>
-void callOnVariable(const char* routine, CdfId file, long variable, Items... items) {
-  callOnFile(routine, file, zVAR_, variableOrAttributeNumber(variable), items...);
-}
-
 /// Selects zVariables in the routines that take either kind.
 inline constexpr int kZVariables = 1;
+
+/// A zVariable in hand: a routine of the library that is carried out on it, and under whose name
+/// every failure on the way is reported.
+class VariableOperation {
+ public:
+  VariableOperation(CdfId file, long number, const char* routine)
+      : file_(file), number_(variableOrAttributeNumber(number)), routine_(routine) {}
+
+  template <typename... Items>
+  void call(Items... items) const {
+    check(status(items...));
+  }
+  /// The same for callers who judge the status themselves.
+  template <typename... Items>
+  [[nodiscard]] long status(Items... items) const {
+    static_assert((kIsLibraryItem<Items> && ...), "CDFlib reads long values and pointers only");
+    return CDFlib(SELECT_, CDF_, handle(), zVAR_, number_, items..., NULL_);
+  }
+  void check(long status) const { checkLibraryStatus(status, routine_); }
+  [[noreturn]] void fail(long status) const { raiseLibraryFailure(status, routine_); }
+
+  [[nodiscard]] CdfId file() const { return file_; }
+  [[nodiscard]] void* handle() const { return libraryHandle(file_, routine_); }
+  /// As the library takes it.
+  [[nodiscard]] long number() const { return number_; }
+
+ private:
+  CdfId file_;
+  long number_;
+  const char* routine_;
+};
 
 /// `ROW_MAJOR` files hold their last dimension fastest, the host its first.
 bool isRowMajor(CdfId file);

@@ -15,16 +15,15 @@ bool wraps(long start, long count, long interval) {
 }
 
 template <typename... Items>
-void callOnHyperslab(const char* routine, CdfId file, long variable, const LibraryHyperslab& slab,
+void callOnHyperslab(const VariableOperation& variable, const LibraryHyperslab& slab,
                      Items... items) {
-  callOnVariable(routine, file, variable,                   //
-                 zVAR_RECNUMBER_, slab.recordStart,         //
-                 zVAR_RECCOUNT_, slab.recordCount,          //
-                 zVAR_RECINTERVAL_, slab.recordInterval,    //
-                 zVAR_DIMINDICES_, slab.start.data(),       //
-                 zVAR_DIMCOUNTS_, slab.count.data(),        //
-                 zVAR_DIMINTERVALS_, slab.interval.data(),  //
-                 items...);
+  variable.call(zVAR_RECNUMBER_, slab.recordStart,         //
+                zVAR_RECCOUNT_, slab.recordCount,          //
+                zVAR_RECINTERVAL_, slab.recordInterval,    //
+                zVAR_DIMINDICES_, slab.start.data(),       //
+                zVAR_DIMCOUNTS_, slab.count.data(),        //
+                zVAR_DIMINTERVALS_, slab.interval.data(),  //
+                items...);
 }
 
 }  // namespace
@@ -61,29 +60,29 @@ LibraryHyperslab::LibraryHyperslab(const Hyperslab& slab, std::span<const long> 
   }
 }
 
-bool takesWholeRecords(const VariableDescription& variable, const LibraryHyperslab& slab) {
-  for (std::size_t i = 0; i < variable.sizes().size(); ++i) {
-    const bool whole = variable.variances()[i] == NOVARY ? slab.count[i] <= 1
-                                                         : slab.count[i] == variable.sizes()[i];
+bool takesWholeRecords(const VariableDescription& description, const LibraryHyperslab& slab) {
+  for (std::size_t i = 0; i < description.sizes().size(); ++i) {
+    const bool varies = description.variances()[i] != NOVARY;
+    const bool whole = varies ? slab.count[i] == description.sizes()[i] : slab.count[i] <= 1;
     if (!whole) return false;
   }
   return true;
 }
 
-void skipNoRecordsThatDoNotVary(const VariableDescription& variable, LibraryHyperslab& slab) {
+void readSameRecordWithoutSkipping(const VariableDescription& description, LibraryHyperslab& slab) {
   const bool skips = slab.recordCount > 1 && slab.recordInterval > 1;
-  if (variable.recordVariance == NOVARY && skips && takesWholeRecords(variable, slab)) {
+  if (description.recordVariance == NOVARY && skips && takesWholeRecords(description, slab)) {
     slab.recordInterval = 1;
   }
 }
 
-void selectHyperslab(const char* routine, CdfId file, long variable, const LibraryHyperslab& slab) {
-  callOnHyperslab(routine, file, variable, slab);
+void selectHyperslab(const VariableOperation& variable, const LibraryHyperslab& slab) {
+  callOnHyperslab(variable, slab);
 }
 
-void moveHyperslab(const char* routine, CdfId file, long variable, const LibraryHyperslab& slab,
-                   long operation, const void* buffer) {
-  callOnHyperslab(routine, file, variable, slab, operation, zVAR_HYPERDATA_, buffer);
+void moveHyperslab(const VariableOperation& variable, const LibraryHyperslab& slab, long operation,
+                   const void* values) {
+  callOnHyperslab(variable, slab, operation, zVAR_HYPERDATA_, values);
 }
 
 }  // namespace TOLVEX::ambrix

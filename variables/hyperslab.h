@@ -27,6 +27,15 @@ struct Hyperslab {
 /// Converts six arguments from "RECSTART" on. The label of the interval vector is the caller's.
 Hyperslab getHyperslabArgs(const qvArray* arguments[], const char* intervalLabel);
 
+/// The records of one read or write, as the library takes them.
+struct RecordRange {
+  long first;
+  long count;
+  long interval;
+
+  [[nodiscard]] long last() const { return first + (count - 1) * interval; }
+};
+
 /// A hyperslab as the library reads it, in a variable of these dimension sizes. The library
 /// computes its last record and indices in 32 bits, where they can wrap around into the variable:
 /// such a hyperslab becomes one that starts beyond it, which the library refuses.
@@ -40,21 +49,23 @@ struct LibraryHyperslab {
   DimensionVector count;
   DimensionVector interval;
 
-  [[nodiscard]] long lastRecord() const { return recordStart + (recordCount - 1) * recordInterval; }
+  [[nodiscard]] RecordRange records() const { return {recordStart, recordCount, recordInterval}; }
+  [[nodiscard]] long lastRecord() const { return records().last(); }
 };
 
 /// Whether the library moves each record of the hyperslab in one piece.
-bool takesWholeRecords(const VariableDescription& variable, const LibraryHyperslab& slab);
+bool takesWholeRecords(const VariableDescription& description, const LibraryHyperslab& slab);
 
-/// Of a variable whose records do not vary the library reads whole records with all those between
-/// them, more than were asked for. Only one is stored, so none need be skipped.
-void skipNoRecordsThatDoNotVary(const VariableDescription& variable, LibraryHyperslab& slab);
+/// Guard: of a variable whose records do not vary every version of the library reads whole records
+/// with all those between them, more than were asked for. Only one is stored, so none need be
+/// skipped.
+void readSameRecordWithoutSkipping(const VariableDescription& description, LibraryHyperslab& slab);
 
 /// Selects the variable and the hyperslab.
-void selectHyperslab(const char* routine, CdfId file, long variable, const LibraryHyperslab& slab);
+void selectHyperslab(const VariableOperation& variable, const LibraryHyperslab& slab);
 
 /// The same, then performs GET_ or PUT_ of `zVAR_HYPERDATA_`.
-void moveHyperslab(const char* routine, CdfId file, long variable, const LibraryHyperslab& slab,
-                   long operation, const void* buffer);
+void moveHyperslab(const VariableOperation& variable, const LibraryHyperslab& slab, long operation,
+                   const void* values);
 
 }  // namespace TOLVEX::ambrix

@@ -6,117 +6,144 @@
 
 #include "gateway/arguments.h"
 #include "gateway/errors.h"
-#include "gateway/library.h"
 #include "gateway/open_file_registry.h"
 #include "gateway/raise_error.h"
 #include "gateway/sizes.h"
 #include "variables/datatypes.h"
+#include "variables/guards/record_limits.h"
+#include "variables/guards/unwritten_record.h"
+#include "variables/guards/waiting_records.h"
 #include "variables/host_dimensions.h"
 #include "variables/hyperslab.h"
 #include "variables/read_values.h"
-#include "variables/sparse_records.h"
-#include "variables/unwritten_record.h"
 #include "variables/variable_description.h"
 
 namespace TOLVEX::ambrix {
 namespace {
 
-void requireOnePerDimension(const std::vector<long>& numbers, const VariableDescription& variable) {
-  if (numbers.size() != variable.sizes().size()) {
-    raiseError(cdflib::badDimSpec(variable.dimensions, variable.name));
+void requireOnePerDimension(const std::vector<long>& numbers,
+                            const VariableDescription& description) {
+  if (numbers.size() != description.sizes().size()) {
+    raiseError(cdflib::badDimSpec(description.dimensions, description.name));
   }
 }
 
 std::vector<long> getOptionalIndices(std::int32_t argumentCount, const qvArray* arguments[],
-                                     const VariableDescription& variable) {
+                                     const VariableDescription& description) {
   if (argumentCount > 3) return getLongVectorArg(arguments[3], "INDICES");
-  if (variable.dimensions > 0) raiseError(cdflib::cannotOmitDimSpec());
+  if (description.dimensions > 0) raiseError(cdflib::cannotOmitDimSpec());
   return {};
+}
+
+/// Whether a value is a whole record to the library.
+bool storesOneValue(const VariableDescription& description) {
+  const long valueBytes =
+      multiplySaturated(description.elements, datatypeSize(description.datatype));
+  return description.storedBytesPerRecord() == valueBytes;
+}
+
+void readHyperslab(const VariableOperation& variable, const VariableDescription& description,
+                   const LibraryHyperslab& slab, void* result) {
+  const auto read = [&](void* values) { moveHyperslab(variable, slab, GET_, values); };
+  if (takesWholeRecords(description, slab)) {
+    return readWholeRecords(variable, description, slab.records(), result, read);
+  }
+  writeWaitingRecords(variable, description, slab.records());
+  read(result);
 }
 
 }  // namespace
 
+// Each reader converts its arguments, inquires the variable and shapes the result, in the order in
+// which its errors are promised. Then come the guards, which speak as the library does: those that
+// need no result before it is made, the others when it is, so that a size that cannot be had is
+// told first. The library reads last.
+
 void getVarData(int, qvArray* outputs[], std::int32_t argumentCount, const qvArray* arguments[],
                 const CommandEntry*) {
-  const char* routine = "CDFgetzVarData";
   const CdfId file = getCdfIdArg(arguments[0]);
   const long number = getLongScalarArg(arguments[1], "VARNUM");
   const long record = getLongScalarArg(arguments[2], "RECNUM");
-  const VariableDescription variable = inquireVariable(file, number);
-  std::vector<long> indices = getOptionalIndices(argumentCount, arguments, variable);
-  requireOnePerDimension(indices, variable);
+  const VariableDescription description = inquireVariable(file, number);
+  std::vector<long> indices = getOptionalIndices(argumentCount, arguments, description);
+  requireOnePerDimension(indices, description);
   if (isRowMajor(file)) std::ranges::reverse(indices);
-  const HostDimensions dimensions = valueDimensions(variable);
-  validateDatatype(variable.datatype);
-  const ReadRequest request{routine, 1, variable.elementsPerRecord(), true};
-  requireUsableRecord(variable, routine);
-  DimensionVector libraryIndices = libraryVector(indices, kBadNumber);
-  writeWaitingRecords(file, number, routine);
-  outputs[0] = readValues(variable, dimensions, request, [&](void* buffer) {
-    requireCountableRecord(variable, record, routine);
-    if (lacksItsRecord(file, number, variable, routine)) {
-      return fillValue(file, number, variable, record, libraryIndices, buffer, routine);
+  const HostDimensions dimensions = valueDimensions(description);
+  validateDatatype(description.datatype);
+
+  const VariableOperation variable(file, number, "CDFgetzVarData");
+  requireUsableRecord(variable, description);
+  const ReadRequest request{1, description.elementsPerRecord(), true};
+  const DimensionVector libraryIndices = libraryVector(indices, kBadNumber);
+  const long libraryRecord = libraryNumber(record, kBadNumber);
+  const auto readValue = [&](void* value) {
+    variable.call(zVAR_RECNUMBER_, libraryRecord,           //
+                  zVAR_DIMINDICES_, libraryIndices.data(),  //
+                  GET_, zVAR_DATA_, value);
+  };
+  outputs[0] = readValues(variable, description, dimensions, request, [&](void* value) {
+    requireCountableRecord(variable, description, record);
+    if (lacksItsRecord(variable, description)) {
+      return fillValue(variable, description, record, libraryIndices, value);
     }
-    callOnVariable(routine, file, number,                               //
-                   zVAR_RECNUMBER_, libraryNumber(record, kBadNumber),  //
-                   zVAR_DIMINDICES_, libraryIndices.data(),             //
-                   GET_, zVAR_DATA_, buffer);
+    if (!storesOneValue(description)) return readValue(value);
+    readWholeRecords(variable, description, {libraryRecord, 1, 1}, value, readValue);
   });
 }
 
 void getVarRecordData(int, qvArray* outputs[], std::int32_t, const qvArray* arguments[],
                       const CommandEntry*) {
-  const char* routine = "CDFgetzVarRecordData";
   const CdfId file = getCdfIdArg(arguments[0]);
   const long number = getLongScalarArg(arguments[1], "VARNUM");
   const long record = getLongScalarArg(arguments[2], "RECNUM");
-  const VariableDescription variable = inquireVariable(file, number);
-  validateDatatype(variable.datatype);
-  const HostDimensions dimensions = recordDimensions(variable, isRowMajor(file));
-  const ReadRequest request{routine, variable.valuesPerRecord(), variable.elementsPerRecord(),
-                            variable.allDimensionsVary()};
-  requireUsableRecord(variable, routine);
-  writeWaitingRecords(file, number, routine);
-  outputs[0] = readValues(variable, dimensions, request, [&](void* buffer) {
-    requireRecordNumber(record, routine);
-    requireCountableRecord(variable, record, routine);
-    if (lacksItsRecord(file, number, variable, routine)) {
-      return fillRecord(file, number, variable, buffer, routine);
-    }
-    checkLibraryStatus(CDFgetVarRecordData(libraryHandle(file, routine), kZVariables,
-                                           variableOrAttributeNumber(number), record, buffer),
-                       routine);
+  const VariableDescription description = inquireVariable(file, number);
+  validateDatatype(description.datatype);
+  const HostDimensions dimensions = recordDimensions(description, isRowMajor(file));
+
+  const VariableOperation variable(file, number, "CDFgetzVarRecordData");
+  requireUsableRecord(variable, description);
+  const ReadRequest request{description.valuesPerRecord(), description.elementsPerRecord(),
+                            description.allDimensionsVary()};
+  const auto readRecord = [&](void* values) {
+    variable.check(
+        CDFgetVarRecordData(variable.handle(), kZVariables, variable.number(), record, values));
+  };
+  outputs[0] = readValues(variable, description, dimensions, request, [&](void* values) {
+    requireRecordNumber(variable, record);
+    requireCountableRecord(variable, description, record);
+    if (lacksItsRecord(variable, description)) return fillRecord(variable, description, values);
+    readWholeRecords(variable, description, {record, 1, 1}, values, readRecord);
   });
 }
 
 void hyperGetVarData(int, qvArray* outputs[], std::int32_t, const qvArray* arguments[],
                      const CommandEntry*) {
-  const char* routine = "CDFhyperGetzVarData";
   const CdfId file = getCdfIdArg(arguments[0]);
   const long number = getLongScalarArg(arguments[1], "VARNUM");
-  Hyperslab slab = getHyperslabArgs(arguments + 2, "DIMSTRIDe");  // users know this spelling
-  const VariableDescription variable = inquireVariable(file, number);
-  requireOnePerDimension(slab.start, variable);
-  requireOnePerDimension(slab.count, variable);
-  requireOnePerDimension(slab.interval, variable);
+  Hyperslab slab = getHyperslabArgs(arguments + 2, "DIMSTRIDe");  // unlike that of the writer
+  const VariableDescription description = inquireVariable(file, number);
+  requireOnePerDimension(slab.start, description);
+  requireOnePerDimension(slab.count, description);
+  requireOnePerDimension(slab.interval, description);
   const bool rowMajor = isRowMajor(file);
   if (rowMajor) slab.reverseDimensions();
-  HostDimensions dimensions = hyperslabDimensions(variable, slab.count, slab.recordCount);
-  validateDatatype(variable.datatype);
+  HostDimensions dimensions = hyperslabDimensions(description, slab.count, slab.recordCount);
+  validateDatatype(description.datatype);
   if (rowMajor) reverseCounts(dimensions, slab.count.size());
+
+  const VariableOperation variable(file, number, "CDFhyperGetzVarData");
+  requireUsableRecord(variable, description);
   const long values = multiplySaturated(productOf(slab.count), slab.recordCount);
-  const long bufferBytes = multiplySaturated(variable.elementsPerRecord(), slab.recordCount);
-  const ReadRequest request{routine, values, bufferBytes, true};
-  requireUsableRecord(variable, routine);
-  LibraryHyperslab librarySlab(slab, variable.sizes());
-  skipNoRecordsThatDoNotVary(variable, librarySlab);
-  writeWaitingRecords(file, number, routine);
-  outputs[0] = readValues(variable, dimensions, request, [&](void* buffer) {
-    requireCountableRecord(variable, librarySlab.lastRecord(), routine);
-    if (lacksItsRecord(file, number, variable, routine)) {
-      return fillHyperslab(file, number, variable, librarySlab, buffer, routine);
+  const long bufferBytes = multiplySaturated(description.elementsPerRecord(), slab.recordCount);
+  const ReadRequest request{values, bufferBytes, true};
+  LibraryHyperslab librarySlab(slab, description.sizes());
+  readSameRecordWithoutSkipping(description, librarySlab);
+  outputs[0] = readValues(variable, description, dimensions, request, [&](void* result) {
+    requireCountableRecord(variable, description, librarySlab.lastRecord());
+    if (lacksItsRecord(variable, description)) {
+      return fillHyperslab(variable, description, librarySlab, result);
     }
-    moveHyperslab(routine, file, number, librarySlab, GET_, buffer);
+    readHyperslab(variable, description, librarySlab, result);
   });
 }
 

@@ -10,6 +10,7 @@
 #include "host/qv.h"
 #include "variables/characters.h"
 #include "variables/datatypes.h"
+#include "variables/guards/record_limits.h"
 #include "variables/host_dimensions.h"
 #include "variables/variable_description.h"
 
@@ -17,7 +18,6 @@ namespace TOLVEX::ambrix {
 
 /// What one read asks of the library.
 struct ReadRequest {
-  const char* routine;
   long values;       // that the library writes at the most
   long bufferBytes;  // that characters are read into: at least those of the values
   bool writesAll;    // else what the library leaves unwritten reads as zeros
@@ -37,21 +37,24 @@ qvArray* readCharacters(const HostDimensions& dimensions, const ReadRequest& req
 }
 
 template <typename Read>
-qvArray* readNumbers(const VariableDescription& variable, const HostDimensions& dimensions,
-                     const ReadRequest& request, const Read& read) {
-  const qvClassID classId = classIdForDatatype(variable.datatype);
+qvArray* readNumbers(const VariableOperation& variable, const VariableDescription& description,
+                     const HostDimensions& dimensions, const ReadRequest& request,
+                     const Read& read) {
+  const qvClassID classId = classIdForDatatype(description.datatype);
   const auto create = request.writesAll ? qvCreateUninitNumericArray : qvCreateNumericArray;
   qvArray* array = create(dimensions.count(), dimensions.data(), classId, qvREAL);
-  requireRoom(variable, request.values, bytesOfArray(array, variable.datatype), request.routine);
+  requireRoom(variable, description, request.values, bytesOfArray(array, description.datatype));
   read(qvGetData(array));
   return array;
 }
 
 template <typename Read>
-qvArray* readValues(const VariableDescription& variable, const HostDimensions& dimensions,
-                    const ReadRequest& request, const Read& read) {
-  return isCharacterDatatype(variable.datatype) ? readCharacters(dimensions, request, read)
-                                                : readNumbers(variable, dimensions, request, read);
+qvArray* readValues(const VariableOperation& variable, const VariableDescription& description,
+                    const HostDimensions& dimensions, const ReadRequest& request,
+                    const Read& read) {
+  return isCharacterDatatype(description.datatype)
+             ? readCharacters(dimensions, request, read)
+             : readNumbers(variable, description, dimensions, request, read);
 }
 
 }  // namespace TOLVEX::ambrix

@@ -82,20 +82,20 @@ void createVar(int, qvArray* outputs[], std::int32_t, const qvArray* arguments[]
 void inquireVar(int, qvArray* outputs[], std::int32_t, const qvArray* arguments[],
                 const CommandEntry*) {
   const CdfId file = getCdfIdArg(arguments[0]);
-  const VariableDescription variable =
+  const VariableDescription description =
       inquireVariable(file, getLongScalarArg(arguments[1], "VARNUM"));
-  std::vector<long> sizes(variable.sizes().begin(), variable.sizes().end());
-  std::vector<long> variances(variable.variances().begin(), variable.variances().end());
+  std::vector<long> sizes(description.sizes().begin(), description.sizes().end());
+  std::vector<long> variances(description.variances().begin(), description.variances().end());
   if (isRowMajor(file)) {
     std::ranges::reverse(sizes);
     std::ranges::reverse(variances);
   }
-  qvArray* datatype = datatypeNameArray(variable.datatype);
-  const bool recordVaries = varies(variable.recordVariance);
+  qvArray* datatype = datatypeNameArray(description.datatype);
+  const bool recordVaries = varies(description.recordVariance);
   std::vector<bool> dimensionVaries(variances.size());
   std::transform(variances.begin(), variances.end(), dimensionVaries.begin(), varies);
   setOutputs(outputs,
-             {qvCreateString(variable.name), datatype, makeDoubleScalar(variable.elements),
+             {qvCreateString(description.name), datatype, makeDoubleScalar(description.elements),
               makeSizes(sizes), makeLogicals({recordVaries}), makeLogicals(dimensionVaries)});
 }
 
@@ -103,20 +103,20 @@ void inquireVar(int, qvArray* outputs[], std::int32_t, const qvArray* arguments[
 void closeVar(int, qvArray*[], std::int32_t, const qvArray* arguments[], const CommandEntry*) {
   const CdfId file = getCdfIdArg(arguments[0]);
   const long number = getLongScalarArg(arguments[1], "CDFID");
-  callOnVariable("CDFclosezVar", file, number, CLOSE_, zVAR_);
+  VariableOperation(file, number, "CDFclosezVar").call(CLOSE_, zVAR_);
 }
 
 void deleteVar(int, qvArray*[], std::int32_t, const qvArray* arguments[], const CommandEntry*) {
   const CdfId file = getCdfIdArg(arguments[0]);
   const long number = getLongScalarArg(arguments[1], "VARNUM");
-  callOnVariable("CDFdeletezVar", file, number, DELETE_, zVAR_);
+  VariableOperation(file, number, "CDFdeletezVar").call(DELETE_, zVAR_);
 }
 
 void renameVar(int, qvArray*[], std::int32_t, const qvArray* arguments[], const CommandEntry*) {
   const CdfId file = getCdfIdArg(arguments[0]);
   const long number = getLongScalarArg(arguments[1], "VARNUM");
   const std::string name = getStringArg(arguments[2]);
-  callOnVariable("CDFrenamezVar", file, number, PUT_, zVAR_NAME_, name.c_str());
+  VariableOperation(file, number, "CDFrenamezVar").call(PUT_, zVAR_NAME_, name.c_str());
 }
 
 void getVarName(int, qvArray* outputs[], std::int32_t, const qvArray* arguments[],
@@ -124,7 +124,7 @@ void getVarName(int, qvArray* outputs[], std::int32_t, const qvArray* arguments[
   const CdfId file = getCdfIdArg(arguments[0]);
   const long number = getLongScalarArg(arguments[1], "VARNUM");
   char name[CDF_VAR_NAME_LEN256 + 1] = {};
-  callOnVariable("CDFgetzVarName", file, number, GET_, zVAR_NAME_, name);
+  VariableOperation(file, number, "CDFgetzVarName").call(GET_, zVAR_NAME_, name);
   outputs[0] = qvCreateString(name);
 }
 

@@ -5,7 +5,7 @@
 
 #include <span>
 
-#include "gateway/cdf_id.h"
+#include "gateway/library.h"
 
 namespace TOLVEX::ambrix {
 
@@ -35,34 +35,10 @@ struct VariableDescription {
   [[nodiscard]] std::size_t count() const { return static_cast<std::size_t>(dimensions); }
 };
 
-/// Raises `libraryFailure` with the routine that the inquiry stands for.
-VariableDescription inquireVariable(CdfId file, long variable,
-                                    const char* routine = "CDFinquirezVar");
+/// Raises `libraryFailure` ("CDFinquirezVar").
+VariableDescription inquireVariable(CdfId file, long number);
 
-/// Refuses, as the library's bad record number, a record that its routines for whole records must
-/// not see: they would abort all access to the file, or leave a file that cannot be opened.
-void requireRecordNumber(long record, const char* routine);
-
-/// The library counts records in 32 bits: refuses, as its bad record number, to read or write the
-/// one record whose number has a place there and whose count has none. Where records do not vary it
-/// is not so.
-void requireCountableRecord(const VariableDescription& variable, long record, const char* routine);
-
-/// Refuses, as the library's bad number of elements, values of no elements.
-void requireElements(const VariableDescription& variable, const char* routine);
-
-/// The library counts the bytes of a record in 32 bits: refuses, as its bad dimension size or bad
-/// number of elements, descriptions that only a damaged file or a variable too large to store has.
-/// Readers and writers call this after all their other checks.
-void requireUsableRecord(const VariableDescription& variable, const char* routine);
-
-/// Some commands make the library divide by the bytes of a record of a single-file CDF: refuses, as
-/// its bad dimension size, variables for which they wrap around to zero, and no others.
-void requireDivisibleRecord(CdfId file, const VariableDescription& variable, const char* routine);
-
-/// Refuses, as the library's bad number of elements, to move `values` values of the variable to or
-/// from `bytes` bytes if they are not enough.
-void requireRoom(const VariableDescription& variable, long values, std::size_t bytes,
-                 const char* routine);
+/// The same within another operation, for guards. Returns the status of the inquiry.
+long describe(const VariableOperation& variable, VariableDescription& found);
 
 }  // namespace TOLVEX::ambrix

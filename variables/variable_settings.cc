@@ -16,9 +16,9 @@ void requireMultiFile(CdfId file) {
 void getVarSparseRecords(int, qvArray* outputs[], std::int32_t, const qvArray* arguments[],
                          const CommandEntry*) {
   const CdfId file = getCdfIdArg(arguments[0]);
-  const long variable = getLongScalarArg(arguments[1], "VARNUM");
+  const long number = getLongScalarArg(arguments[1], "VARNUM");
   long mode = 0;
-  callOnVariable("CDFgetzVarSparseRecords", file, variable, GET_, zVAR_SPARSERECORDS_, &mode);
+  VariableOperation(file, number, "CDFgetzVarSparseRecords").call(GET_, zVAR_SPARSERECORDS_, &mode);
   outputs[0] =
       qvCreateString(lookupValueName(SparseRecordsNames, mode, "SPARSE RECORDS TYPE").c_str());
 }
@@ -26,32 +26,31 @@ void getVarSparseRecords(int, qvArray* outputs[], std::int32_t, const qvArray* a
 void getVarCacheSize(int, qvArray* outputs[], std::int32_t, const qvArray* arguments[],
                      const CommandEntry*) {
   const CdfId file = getCdfIdArg(arguments[0]);
-  const long variable = getLongScalarArg(arguments[1], "VARNUM");
+  const long number = getLongScalarArg(arguments[1], "VARNUM");
   requireMultiFile(file);
   long buffers = 0;
-  callOnVariable("CDFgetzVarCacheSize", file, variable, CONFIRM_, zVAR_CACHESIZE_, &buffers);
+  VariableOperation(file, number, "CDFgetzVarCacheSize").call(CONFIRM_, zVAR_CACHESIZE_, &buffers);
   outputs[0] = makeDoubleScalar(buffers);
 }
 
 void setVarCacheSize(int, qvArray*[], std::int32_t, const qvArray* arguments[],
                      const CommandEntry*) {
   const CdfId file = getCdfIdArg(arguments[0]);
-  const long variable = getLongScalarArg(arguments[1], "VARNUM");
+  const long number = getLongScalarArg(arguments[1], "VARNUM");
   const long buffers = libraryNumber(getLongScalarArg(arguments[2], "NUMBUFFERS"), kBadNumber);
   requireMultiFile(file);
-  callOnVariable("CDFsetzVarCacheSize", file, variable, zVAR_CACHESIZE_, buffers);
+  VariableOperation(file, number, "CDFsetzVarCacheSize").call(zVAR_CACHESIZE_, buffers);
 }
 
 void setVarAllocBlockRecords(int, qvArray*[], std::int32_t, const qvArray* arguments[],
                              const CommandEntry*) {
   const CdfId file = getCdfIdArg(arguments[0]);
-  const long variable = getLongScalarArg(arguments[1], "VARNUM");
+  const long number = getLongScalarArg(arguments[1], "VARNUM");
   const long first = libraryNumber(getLongScalarArg(arguments[2], "RECSTART"), kBadNumber);
   const long last = libraryNumber(getLongScalarArg(arguments[3], "RECSTOP"), kBadNumber);
-  const char* routine = "CDFsetzVarAllocBlockRecords";
-  requireDivisibleRecord(file, inquireVariable(file, variable, routine), routine);
-  callOnVariable(routine, file, variable, PUT_,  //
-                 zVAR_ALLOCATEBLOCK_, first, last);
+  const VariableOperation variable(file, number, "CDFsetzVarAllocBlockRecords");
+  requireDivisibleRecord(variable);
+  variable.call(PUT_, zVAR_ALLOCATEBLOCK_, first, last);
 }
 
 }  // namespace TOLVEX::ambrix

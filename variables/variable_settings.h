@@ -6,7 +6,7 @@
 
 #include "gateway/arguments.h"
 #include "gateway/families.h"
-#include "variables/variable_description.h"
+#include "variables/guards/record_limits.h"
 
 namespace TOLVEX::ambrix {
 
@@ -23,12 +23,11 @@ template <const VariableNumber& row>
 void getVariableNumber(int, qvArray* outputs[], std::int32_t, const qvArray* arguments[],
                        const CommandEntry*) {
   const CdfId file = getCdfIdArg(arguments[0]);
-  const long variable = getLongScalarArg(arguments[1], "VARNUM");
-  if constexpr (row.dividesByRecord) {
-    requireDivisibleRecord(file, inquireVariable(file, variable, row.routine), row.routine);
-  }
+  const long number = getLongScalarArg(arguments[1], "VARNUM");
+  const VariableOperation variable(file, number, row.routine);
+  if constexpr (row.dividesByRecord) requireDivisibleRecord(variable);
   long value = 0;
-  callOnVariable(row.routine, file, variable, row.operation, row.item, &value);
+  variable.call(row.operation, row.item, &value);
   outputs[0] = makeDoubleScalar(value);
 }
 
@@ -47,17 +46,16 @@ template <const VariableSetting& row>
 void setVariableNumber(int, qvArray*[], std::int32_t, const qvArray* arguments[],
                        const CommandEntry*) {
   const CdfId file = getCdfIdArg(arguments[0]);
-  const long variable = getLongScalarArg(arguments[1], "VARNUM");
+  const long number = getLongScalarArg(arguments[1], "VARNUM");
   const long value = libraryNumber(getLongScalarArg(arguments[2], row.label), kBadNumber);
-  if constexpr (row.dividesByRecord) {
-    requireDivisibleRecord(file, inquireVariable(file, variable, row.routine), row.routine);
-  }
-  openFileRegistry().markWritten(file);  // initial records are written as others
+  const VariableOperation variable(file, number, row.routine);
+  if constexpr (row.dividesByRecord) requireDivisibleRecord(variable);
   if constexpr (row.operation == SELECT_) {
-    callOnVariable(row.routine, file, variable, row.item, value);
+    variable.call(row.item, value);
   } else {
-    callOnVariable(row.routine, file, variable, row.operation, row.item, value);
+    variable.call(row.operation, row.item, value);
   }
+  if constexpr (row.item == zVAR_INITIALRECS_) openFileRegistry().markWritten(file);
 }
 
 // clang-format off

@@ -3,6 +3,7 @@
 #include <algorithm>
 #include <exception>
 
+#include "gateway/library_faults.h"
 #include "gateway/open_file_registry.h"
 #include "host/qvh.h"
 
@@ -33,6 +34,7 @@ std::vector<ArrayView> viewsOf(const Arguments& arguments) {
 }  // namespace
 
 ScriptedTest::ScriptedTest() : module(watchedEntryPoint) {
+  TOLVEX::ambrix::libraryFaults() = {};
   fake = FakeCdflib();
   fake.answer("handle", {kHandle});
   call("open", {"any.cdf"});

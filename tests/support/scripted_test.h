@@ -17,7 +17,8 @@
 
 namespace ambrix_test {
 
-/// Begins with one open file, `file()`, and no calls. Ends by asking whether anything is left
+/// Begins with one open file, `file()`, no calls, and a library without the faults that only some
+/// versions have. Ends by asking whether anything is left
 /// alive.
 class ScriptedTest : public testing::Test {
  protected:

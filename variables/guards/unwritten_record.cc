@@ -1,4 +1,4 @@
-#include "variables/unwritten_record.h"
+#include "variables/guards/unwritten_record.h"
 
 #include <cdf.h>
 
@@ -6,25 +6,24 @@
 #include <cstring>
 #include <span>
 
-#include "gateway/library.h"
+#include "gateway/library_faults.h"
 #include "gateway/sizes.h"
 #include "variables/datatypes.h"
 
 namespace TOLVEX::ambrix {
 namespace {
 
-void fillWithPadValue(CdfId file, long number, const VariableDescription& variable, long values,
-                      void* buffer, const char* routine) {
+void fillWithPadValue(const VariableOperation& variable, const VariableDescription& description,
+                      long values, void* result) {
   if (values < 1) return;
-  const std::size_t bytes = saturatedProduct({variable.elements, datatypeSize(variable.datatype)});
-  auto* const first = static_cast<char*>(buffer);
-  const long status = CDFlib(SELECT_, CDF_, libraryHandle(file, routine),  //
-                             zVAR_, variableOrAttributeNumber(number),     //
-                             GET_, zVAR_PADVALUE_, buffer, NULL_);
-  checkLibraryStatus(status, routine);
+  const std::size_t bytes =
+      saturatedProduct({description.elements, datatypeSize(description.datatype)});
+  auto* const first = static_cast<char*>(result);
+  const long status = variable.status(GET_, zVAR_PADVALUE_, result);
+  variable.check(status);
   // Of a text that has no pad value in its file the library gives the first character only.
   const bool oneCharacter =
-      status == NO_PADVALUE_SPECIFIED && isCharacterDatatype(variable.datatype);
+      status == NO_PADVALUE_SPECIFIED && isCharacterDatatype(description.datatype);
   if (oneCharacter) std::memset(first, *first, bytes);
   for (long i = 1; i < values; ++i)
     std::memcpy(first + static_cast<std::size_t>(i) * bytes, first, bytes);
@@ -32,41 +31,42 @@ void fillWithPadValue(CdfId file, long number, const VariableDescription& variab
 
 }  // namespace
 
-bool lacksItsRecord(CdfId file, long number, const VariableDescription& variable,
-                    const char* routine) {
-  if (variable.recordVariance != NOVARY) return false;
+bool lacksItsRecord(const VariableOperation& variable, const VariableDescription& description) {
+  if (!libraryFaults().leavesUnwrittenRecords || description.recordVariance != NOVARY) return false;
   constexpr long kVersionThatPads = 3;
   long last = 0;
   long version = kVersionThatPads;
-  callOnVariable(routine, file, number, GET_, zVAR_MAXREC_, &last, CDF_VERSION_, &version);
-  return last < 0 && version < kVersionThatPads;
+  const long status = variable.status(GET_, zVAR_MAXREC_, &last, CDF_VERSION_, &version);
+  return status >= CDF_OK && last < 0 && version < kVersionThatPads;
 }
 
-void fillRecord(CdfId file, long number, const VariableDescription& variable, void* buffer,
-                const char* routine) {
+void fillRecord(const VariableOperation& variable, const VariableDescription& description,
+                void* result) {
   long values = 1;
-  for (std::size_t i = 0; i < variable.sizes().size(); ++i)
-    if (variable.variances()[i] != NOVARY) values = multiplySaturated(values, variable.sizes()[i]);
-  fillWithPadValue(file, number, variable, values, buffer, routine);
-}
-
-void fillValue(CdfId file, long number, const VariableDescription& variable, long record,
-               const DimensionVector& indices, void* buffer, const char* routine) {
-  callOnVariable(routine, file, number, zVAR_RECNUMBER_, libraryNumber(record, kBadNumber),
-                 zVAR_DIMINDICES_, indices.data());
-  fillWithPadValue(file, number, variable, 1, buffer, routine);
-}
-
-void fillHyperslab(CdfId file, long number, const VariableDescription& variable,
-                   const LibraryHyperslab& slab, void* buffer, const char* routine) {
-  selectHyperslab(routine, file, number, slab);
-  for (std::size_t i = 0; i < variable.sizes().size(); ++i) {
-    const long last = slab.start[i] + (slab.count[i] - 1) * slab.interval[i];
-    if (last >= variable.sizes()[i]) raiseLibraryFailure(BAD_DIM_INDEX, routine);
+  for (std::size_t i = 0; i < description.sizes().size(); ++i) {
+    if (description.variances()[i] == NOVARY) continue;
+    values = multiplySaturated(values, description.sizes()[i]);
   }
-  const std::span<const long> counts{slab.count.data(), variable.sizes().size()};
+  fillWithPadValue(variable, description, values, result);
+}
+
+void fillValue(const VariableOperation& variable, const VariableDescription& description,
+               long record, const DimensionVector& indices, void* result) {
+  variable.call(zVAR_RECNUMBER_, libraryNumber(record, kBadNumber),  //
+                zVAR_DIMINDICES_, indices.data());
+  fillWithPadValue(variable, description, 1, result);
+}
+
+void fillHyperslab(const VariableOperation& variable, const VariableDescription& description,
+                   const LibraryHyperslab& slab, void* result) {
+  selectHyperslab(variable, slab);
+  for (std::size_t i = 0; i < description.sizes().size(); ++i) {
+    const long last = slab.start[i] + (slab.count[i] - 1) * slab.interval[i];
+    if (last >= description.sizes()[i]) variable.fail(BAD_DIM_INDEX);
+  }
+  const std::span<const long> counts{slab.count.data(), description.sizes().size()};
   const long values = multiplySaturated(productOf(counts), slab.recordCount);
-  fillWithPadValue(file, number, variable, values, buffer, routine);
+  fillWithPadValue(variable, description, values, result);
 }
 
 }  // namespace TOLVEX::ambrix

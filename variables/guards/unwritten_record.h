@@ -1,25 +1,24 @@
-// Records that do not vary and were never written.
+// Guard: records that do not vary and were never written, in files of the format of version 2.
+//
+// Fault, in 3.6.3: reading such a record, the library fills the result with whatever lies in memory
+// before it. Elsewhere it gives pad values, which take their place here.
 #pragma once
 
-#include "gateway/cdf_id.h"
 #include "variables/hyperslab.h"
-#include "variables/variable_description.h"
 
 namespace TOLVEX::ambrix {
 
-/// Whether it is such a record, in a file of the format of version 2.7. CDF 3.6.3 fills results
-/// with whatever lies in memory before them when it reads one.
-bool lacksItsRecord(CdfId file, long number, const VariableDescription& variable,
-                    const char* routine);
+/// Whether the library has the fault and would read such a record.
+bool lacksItsRecord(const VariableOperation& variable, const VariableDescription& description);
 
-// What the library does elsewhere: fills results with the variable's pad value.
+// What takes the place of reading: the result is filled with the variable's pad value.
 
-void fillRecord(CdfId file, long number, const VariableDescription& variable, void* buffer,
-                const char* routine);
+void fillRecord(const VariableOperation& variable, const VariableDescription& description,
+                void* result);
 /// The library checks the record, the indices and the hyperslab as if it read them.
-void fillValue(CdfId file, long number, const VariableDescription& variable, long record,
-               const DimensionVector& indices, void* buffer, const char* routine);
-void fillHyperslab(CdfId file, long number, const VariableDescription& variable,
-                   const LibraryHyperslab& slab, void* buffer, const char* routine);
+void fillValue(const VariableOperation& variable, const VariableDescription& description,
+               long record, const DimensionVector& indices, void* result);
+void fillHyperslab(const VariableOperation& variable, const VariableDescription& description,
+                   const LibraryHyperslab& slab, void* result);
 
 }  // namespace TOLVEX::ambrix

@@ -1,43 +1,91 @@
-#include "variables/sparse_records.h"
+#include "variables/guards/waiting_records.h"
 
 #include <cdf.h>
 
-#include "gateway/library.h"
+#include <algorithm>
+
 #include "gateway/open_file_registry.h"
+#include "variables/datatypes.h"
 
 namespace TOLVEX::ambrix {
 namespace {
 
-bool isSparse(CdfId file, long variable, const char* routine) {
+// More room than that is not taken for a read: the waiting records are written instead.
+constexpr std::size_t kMostRoom = std::size_t{16} << 20;
+
+constexpr long kNoRecord = -1;
+
+// When the library fails to tell, there is nothing to guard: it will fail to read, too.
+
+bool isSparse(const VariableOperation& variable) {
   long sparseness = NO_SPARSERECORDS;
-  callOnVariable(routine, file, variable, GET_, zVAR_SPARSERECORDS_, &sparseness);
-  return sparseness != NO_SPARSERECORDS;
+  const long status = variable.status(GET_, zVAR_SPARSERECORDS_, &sparseness);
+  return status >= CDF_OK && sparseness != NO_SPARSERECORDS;
 }
 
-bool isCompressed(CdfId file, long variable, const char* routine) {
+bool isCompressed(const VariableOperation& variable) {
   long type = NO_COMPRESSION;
   long parameters[CDF_MAX_PARMS] = {};
   long percent = 0;
-  callOnVariable(routine, file, variable, GET_, zVAR_COMPRESSION_, &type, parameters, &percent);
-  return type != NO_COMPRESSION;
+  const long status = variable.status(GET_, zVAR_COMPRESSION_, &type, parameters, &percent);
+  return status >= CDF_OK && type != NO_COMPRESSION;
 }
 
-/// Nothing waits for a file that the library does not write: it has refused whatever was put.
-bool refusesAllWriting(long status) {
-  return status == READ_ONLY_MODE || status == NO_WRITE_ACCESS;
+bool mayHaveWaitingRecords(const VariableOperation& variable,
+                           const VariableDescription& description, const RecordRange& records) {
+  const bool acceptable = records.first >= 0 && records.count > 0 && records.interval > 0;
+  return description.recordVariance != NOVARY && openFileRegistry().isWritten(variable.file()) &&
+         isSparse(variable) && isCompressed(variable) && acceptable;
+}
+
+/// The last record that is stored or waits.
+long lastRecord(const VariableOperation& variable) {
+  long last = kNoRecord;
+  return variable.status(GET_, zVAR_MAXREC_, &last) >= CDF_OK ? last : kNoRecord;
+}
+
+/// Reads one value of a record of several: that the library does without filling in others.
+bool isMissing(const VariableOperation& variable, const VariableDescription& description,
+               long record) {
+  const DimensionVector origin{};
+  const ScratchBuffer value(
+      saturatedProduct({description.elements, datatypeSize(description.datatype)}));
+  const long status = variable.status(zVAR_RECNUMBER_, record, zVAR_DIMINDICES_, origin.data(),  //
+                                      GET_, zVAR_DATA_, value.data());
+  return status == VIRTUAL_RECORD_DATA;
+}
+
+void writeAllThatWait(const VariableOperation& variable) {
+  // To delete records that no variable can have changes nothing, but begins with writing.
+  constexpr long kNone = kNoSuchNumber - 1;
+  variable.call(DELETE_, zVAR_RECORDS_, kNone, kNone);
 }
 
 }  // namespace
 
-void writeWaitingRecords(CdfId file, long variable, const char* routine) {
-  if (!openFileRegistry().isWritten(file)) return;
-  if (!isSparse(file, variable, routine) || !isCompressed(file, variable, routine)) return;
-  // To delete records that no variable can have changes nothing, but begins with writing.
-  constexpr long kNone = kNoSuchNumber - 1;
-  const long status = CDFlib(SELECT_, CDF_, libraryHandle(file, routine),  //
-                             zVAR_, variableOrAttributeNumber(variable),   //
-                             DELETE_, zVAR_RECORDS_, kNone, kNone, NULL_);
-  if (!refusesAllWriting(status)) checkLibraryStatus(status, routine);
+std::size_t roomForWaitingRecords(const VariableOperation& variable,
+                                  const VariableDescription& description,
+                                  const RecordRange& records) {
+  if (!mayHaveWaitingRecords(variable, description, records)) return 0;
+  const long last = lastRecord(variable);
+  if (records.last() >= last) return 0;
+  const long mostFilled = std::max(records.count, last - records.first);
+  const std::size_t room = saturatedProduct({mostFilled, description.storedBytesPerRecord()});
+  if (room <= kMostRoom) return room;
+  writeAllThatWait(variable);
+  return 0;
+}
+
+void writeWaitingRecords(const VariableOperation& variable, const VariableDescription& description,
+                         const RecordRange& records) {
+  if (!mayHaveWaitingRecords(variable, description, records)) return;
+  const long last = lastRecord(variable);
+  long record = records.first;
+  for (long i = 0; i < records.count && record < last; ++i, record += records.interval) {
+    const bool filledIn =
+        isMissing(variable, description, record) && isMissing(variable, description, record + 1);
+    if (filledIn) return writeAllThatWait(variable);
+  }
 }
 
 }  // namespace TOLVEX::ambrix

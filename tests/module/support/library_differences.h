@@ -18,6 +18,9 @@ class LibraryDifferences {
       text += old_ ? " " : "\\x0";
     return text;
   }
+  /// Whether the fill value of a variable stands in for a record that does not vary and was never
+  /// written, in a file of the format of version 2.
+  [[nodiscard]] bool fillsUnwrittenRecords() const { return !old_; }
   /// Whether an attribute entry may be a text without characters.
   [[nodiscard]] bool hasEmptyTextEntries() const { return !old_; }
 

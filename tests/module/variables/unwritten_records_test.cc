@@ -51,10 +51,35 @@ TEST_F(UnwrittenRecordsTest, FillWhatIsStoredOfDimensionsThatDoNotVary) {
 TEST_F(UnwrittenRecordsTest, OfTextsReadAsWholePadValues) {
   const double v = createVar(
       file_, {.datatype = kCharacters, .sizes = {2}, .elements = 3, .recordsVary = false});
-  const std::string byDefault = does("getVarRecordData", {file_, v, 0});
-  EXPECT_EQ(byDefault, does("hyperGetVarData", {file_, v, 0, 1, 1, 0, 2, 1}));
+  EXPECT_EQ(does("getVarRecordData", {file_, v, 0}),
+            does("hyperGetVarData", {file_, v, 0, 1, 1, 0, 2, 1}));
   results("setVarPadValue", {file_, v, "abc"});
   EXPECT_EQ(does("getVarRecordData", {file_, v, 0}), "char 3x2 'abcabc'");
+}
+
+TEST_F(UnwrittenRecordsTest, ReadAsFillValuesWhereTheLibraryDoesSo) {
+  const double v = createVar(file_, {.datatype = 44, .recordsVary = false});
+  const double text = createVar(
+      file_, {.datatype = kCharacters, .elements = 3, .name = "text", .recordsVary = false});
+  const double attribute = number("createAttr", {file_, "FILLVAL", 2});
+  results("putAttrEntry", {file_, attribute, v, 44, row<float>({-7})});
+  results("putAttrEntry", {file_, attribute, text, kCharacters, "xyz"});
+  const bool filled = library().fillsUnwrittenRecords();
+  EXPECT_EQ(does("getVarData", {file_, v, 0}), filled ? "single 1x1 [-7]" : "single 1x1 [0]");
+  EXPECT_EQ(does("getVarRecordData", {file_, v, 0}), does("getVarData", {file_, v, 0}));
+  EXPECT_EQ(does("hyperGetVarData", {file_, v, 0, 2, 1, {}, {}, {}}),
+            filled ? "single 2x1 [-7 -7]" : "single 2x1 [0 0]");
+  EXPECT_EQ(does("getVarData", {file_, text, 0}), filled ? "char 3x1 'xyz'" : "char 3x1 '   '");
+}
+
+TEST_F(UnwrittenRecordsTest, ReadAsFillValuesAfterTheyWereDeleted) {
+  const double v = createVar(file_, {.datatype = 44, .recordsVary = false});
+  const double attribute = number("createAttr", {file_, "FILLVAL", 2});
+  results("putAttrEntry", {file_, attribute, v, 44, row<float>({-7})});
+  results("putVarRecordData", {file_, v, 0, row<float>({3})});
+  results("deleteVarRecords", {file_, v, 0, 0});
+  const bool filled = library().fillsUnwrittenRecords();
+  EXPECT_EQ(does("getVarData", {file_, v, 0}), filled ? "single 1x1 [-7]" : "single 1x1 [0]");
 }
 
 // What lies so far before a result is no memory of the process.

@@ -13,7 +13,8 @@ struct CommandCase {
   std::string command;
   Arguments arguments;
   /// What a failure of each call of the library is reported as, in order: the routine, or an
-  /// identifier of its own. Commands that look at no status have none.
+  /// identifier of its own. Empty for the question of a guard, without whose answer the command
+  /// goes on. Commands that look at no status have none.
   std::vector<std::string> reported;
   /// The place of an argument that is data and not a number, if any.
   std::size_t dataAt = 99;
@@ -24,6 +25,11 @@ struct CommandCase {
 };
 
 std::vector<CommandCase> commandCases();
+
+/// What the first call reports that is not a guard's.
+inline const std::string& firstReport(const CommandCase& given) {
+  return given.reported[0].empty() ? given.reported[1] : given.reported[0];
+}
 
 /// How the failure reads.
 inline std::string reportOf(const std::string& reported, long status) {

@@ -9,9 +9,9 @@ using Names = std::vector<std::string>;
 Names afterInquiry(const char* routine) {
   return {"CDFinquirezVar", "CDFgetMajority", routine};
 }
-// Where the library would divide by the size of a record, the variable is looked at first.
+// Where the library would divide by the size of a record, a guard looks at the variable first.
 Names guarded(const char* routine) {
-  return {routine, routine};
+  return {"", routine};
 }
 Names afterFormat(const char* routine) {
   return {"CDFgetFormat", routine};

@@ -1,4 +1,5 @@
 // Pad values.
+#include "tests/support/host_texts.h"
 #include "tests/support/scripted_test.h"
 
 namespace ambrix_test {
@@ -75,6 +76,14 @@ TEST_F(PadValuesTest, TextsAreSetAsTheirLowBitsWithAZeroBehindThem) {
   fake.readBytes(4);
   EXPECT_EQ(errorWith(51, 3, Array::text(u"a\u20AC\u00E9")), "no error");
   EXPECT_THAT(fake.bytesRead(), ElementsAre('a', 0xAC, 0xE9, 0));
+}
+
+TEST_F(PadValuesTest, TheHostNarrowsTextsOfEitherKind) {
+  for (const long datatype : {51L, 52L}) {
+    narrowCopiesMade();  // those of the commands' names count, too
+    EXPECT_EQ(errorWith(datatype, 4, "abcd"), "no error");
+    EXPECT_EQ(narrowCopiesMade(), 2U);
+  }
 }
 
 TEST_F(PadValuesTest, OnlyTheNumberOfElementsCountsNotTheShape) {

@@ -1,5 +1,6 @@
 // Records that do not vary and were never written are not read in files that the library would read
 // wrongly.
+#include "gateway/library_faults.h"
 #include "tests/support/scripted_test.h"
 
 namespace ambrix_test {
@@ -10,6 +11,7 @@ using testing::HasSubstr;
 
 class UnwrittenRecordTest : public ScriptedTest {
  protected:
+  UnwrittenRecordTest() { TOLVEX::ambrix::libraryFaults().leavesUnwrittenRecords = true; }
   void describeUnwritten(const Variable& variable) {
     describe(variable);
     fake.answer("zVAR_MAXREC_", {-1});
@@ -45,6 +47,25 @@ TEST_F(UnwrittenRecordTest, WrittenOnesAndThoseOfNewerFilesAreRead) {
   EXPECT_THAT(calls().back(), HasSubstr("CDFgetVarRecordData"));
   fake.answer("CDF_VERSION_", {2});
   fake.answer("zVAR_MAXREC_", {0});
+  result("getVarRecordData", {file(), 3, 0});
+  EXPECT_THAT(calls().back(), HasSubstr("CDFgetVarRecordData"));
+}
+
+TEST_F(UnwrittenRecordTest, ALibraryWithoutTheFaultIsAskedNothingMore) {
+  TOLVEX::ambrix::libraryFaults().leavesUnwrittenRecords = false;
+  describeUnwritten({.datatype = 4, .recordVariance = 0});
+  for (const auto& [command, arguments] : std::vector<std::pair<std::string, Arguments>>{
+           {"getVarData", {file(), 3, 0}},
+           {"getVarRecordData", {file(), 3, 0}},
+           {"hyperGetVarData", {file(), 3, 0, 1, 1, {}, {}, {}}}}) {
+    result(command, arguments);
+    EXPECT_THAT(calls(), ElementsAre(kInquiry, kMajority, testing::_)) << command;
+  }
+}
+
+TEST_F(UnwrittenRecordTest, WithoutAnAnswerTheLibraryReads) {
+  describeUnwritten({.datatype = 4, .recordVariance = 0});
+  fake.endWith(kQuestion, -2013);
   result("getVarRecordData", {file(), 3, 0});
   EXPECT_THAT(calls().back(), HasSubstr("CDFgetVarRecordData"));
 }

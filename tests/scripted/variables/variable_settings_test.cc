@@ -130,7 +130,7 @@ TEST_F(DividingCommandsTest, RecordsOfNoBytesInThirtyTwoBitsAreRefused) {
   fake.answer("CDF_FORMAT_", {1});
   for (const auto& [routine, arguments] : commands) {
     EXPECT_EQ(errorOf(commandOf(routine), arguments), libraryFailure(routine, -2004));
-    EXPECT_THAT(calls(), ElementsAre(kInquiry, "SELECT_ CDF_ 7 | GET_ CDF_FORMAT_")) << routine;
+    EXPECT_THAT(calls(), ElementsAre(kInquiry, kOnVariable + "GET_ CDF_FORMAT_")) << routine;
   }
 }
 

@@ -5,112 +5,192 @@ namespace ambrix_test {
 namespace {
 
 using testing::Contains;
+using testing::ElementsAre;
 using testing::HasSubstr;
 using testing::Not;
 
+constexpr long kVirtualRecord = 1001;
+constexpr long kReadError = -2013;
 constexpr const char* kWrite =
     "SELECT_ CDF_ 7 | zVAR_ 3 | DELETE_ zVAR_RECORDS_ 2147483646 2147483646";
-constexpr const char* kAsk = "SELECT_ CDF_ 7 | zVAR_ 3 | GET_ zVAR_SPARSERECORDS_";
+constexpr const char* kAskSparseness = "SELECT_ CDF_ 7 | zVAR_ 3 | GET_ zVAR_SPARSERECORDS_";
+constexpr const char* kAskCompression = "SELECT_ CDF_ 7 | zVAR_ 3 | GET_ zVAR_COMPRESSION_";
+constexpr const char* kAskLast = "SELECT_ CDF_ 7 | zVAR_ 3 | GET_ zVAR_MAXREC_";
 
+/// Variable 3 has two doubles in each record; records up to 60 were written or wait.
 class WaitingRecordsTest : public ScriptedTest {
  protected:
+  WaitingRecordsTest() {
+    fake.answer("zVAR_SPARSERECORDS_", {1});
+    fake.answer("zVAR_COMPRESSION_", {5, 6, 40});
+    fake.answer("zVAR_MAXREC_", {60});
+  }
   void put() {
     describe({.sizes = {2}});
     call("putVarRecordData", {file(), 3, 9, elements<double>(2)});
     fake.forgetCalls();
   }
-  void answerCompressedSparse() {
-    fake.answer("zVAR_SPARSERECORDS_", {1});
-    fake.answer("zVAR_COMPRESSION_", {5, 6, 40});
+  /// One value of a record of several is missing.
+  void answerMissing(long record) {
+    fake.endWith(
+        "zVAR_RECNUMBER_ " + std::to_string(record) + " | zVAR_DIMINDICES_ [0] | GET_ zVAR_DATA_",
+        kVirtualRecord);
   }
-  const std::vector<std::pair<std::string, Arguments>> readers = {
-      {"getVarData", {file(), 3, 4, 0}},
-      {"getVarRecordData", {file(), 3, 4}},
-      {"hyperGetVarData", {file(), 3, 4, 1, 1, 0, 2, 1}},
-      {"hyperPutVarData", {file(), 3, 4, 1, 1, 0, 1, 1, 8}},
-  };
+  const std::pair<std::string, Arguments> record{"getVarRecordData", {file(), 3, 4}};
+  const std::pair<std::string, Arguments> wholeSlab{"hyperGetVarData",
+                                                    {file(), 3, 4, 1, 1, 0, 2, 1}};
+  const std::pair<std::string, Arguments> value{"getVarData", {file(), 3, 4, 0}};
+  const std::pair<std::string, Arguments> part{"hyperGetVarData", {file(), 3, 4, 1, 1, 0, 1, 1}};
+  const std::pair<std::string, Arguments> partPut{"hyperPutVarData",
+                                                  {file(), 3, 4, 1, 1, 0, 1, 1, 8}};
 };
 
-TEST_F(WaitingRecordsTest, AreWrittenFirst) {
-  answerCompressedSparse();
+// 57 records of 16 bytes: the library may fill in all of them up to record 60.
+TEST_F(WaitingRecordsTest, WholeRecordsAreReadWithRoomForAllUpToThem) {
   put();
-  for (const auto& [command, arguments] : readers) {
+  fake.answerData(std::vector<double>(56 * 2, 7));
+  for (const auto& [command, arguments] : {record, wholeSlab}) {
+    EXPECT_THAT(shown(result(command, arguments)), HasSubstr("[7 7]")) << command;
+    EXPECT_THAT(calls(), ElementsAre(kInquiry, kMajority, kAskSparseness, kAskCompression, kAskLast,
+                                     Not(HasSubstr("DELETE_"))));
+  }
+}
+
+TEST_F(WaitingRecordsTest, TheLastOnesNeedNoRoom) {
+  put();
+  result("getVarRecordData", {file(), 3, 60});
+  result("hyperGetVarData", {file(), 3, 59, 2, 1, 0, 2, 1});
+  EXPECT_THAT(calls(), Not(Contains(HasSubstr("DELETE_"))));
+}
+
+TEST_F(WaitingRecordsTest, WhenThereAreTooManyToMakeRoomForTheyAreWritten) {
+  put();
+  fake.answer("zVAR_MAXREC_", {2000000});
+  for (const auto& [command, arguments] : {record, wholeSlab}) {
+    result(command, arguments);
+    EXPECT_THAT(calls(), Contains(kWrite)) << command;
+  }
+}
+
+TEST_F(WaitingRecordsTest, TheyAreWrittenBeforePartsOfMissingRecordsAreReadOrWritten) {
+  put();
+  answerMissing(4);
+  answerMissing(5);
+  for (const auto& [command, arguments] : {part, partPut}) {
     call(command, arguments);
     EXPECT_THAT(calls(), Contains(kWrite)) << command;
   }
 }
 
-TEST_F(WaitingRecordsTest, EachCommandThatWritesRecordsLetsThemWait) {
-  const std::pair<std::string, Arguments> writers[] = {
-      {"putVarData", {file(), 3, 9, 0, 8}},
-      {"putVarRecordData", {file(), 3, 9, elements<double>(2)}},
-      {"hyperPutVarData", {file(), 3, 9, 1, 1, 0, 2, 1, elements<double>(2)}},
-      {"setVarInitialRecs", {file(), 3, 9}},
-  };
-  describe({.sizes = {2}});
-  answerCompressedSparse();
-  for (const auto& [command, arguments] : writers) {
-    call("close", {file()});
-    call("open", {"any.cdf"});
-    call(command, arguments);
-    fake.forgetCalls();
-    call("getVarData", {file(), 3, 4, 0});
-    EXPECT_THAT(calls(), Contains(kWrite)) << command;
-  }
-}
-
-TEST_F(WaitingRecordsTest, NotForVariablesThatHaveAllRecords) {
+TEST_F(WaitingRecordsTest, NotBeforePartsOfOthers) {
   put();
-  for (const auto& [command, arguments] : readers) {
+  answerMissing(4);  // and 5 is there: the library fills in no more than 4
+  for (const auto& [command, arguments] : {part, partPut}) {
     call(command, arguments);
-    EXPECT_THAT(fake.calls(), Contains(kAsk)) << command;
-    EXPECT_THAT(calls(), Not(Contains(HasSubstr("DELETE_")))) << command;
+    EXPECT_THAT(calls(), Not(Contains(kWrite))) << command;
   }
 }
 
-// There the library counts rightly, and writing early would allocate more records than needed.
-TEST_F(WaitingRecordsTest, NorForSparseVariablesWithoutCompression) {
-  fake.answer("zVAR_SPARSERECORDS_", {1});
+TEST_F(WaitingRecordsTest, OneValueOfSeveralIsReadAsItIs) {
+  put();
+  call(value.first, value.second);
+  EXPECT_THAT(calls(), Not(Contains(kAskSparseness)));
+}
+
+TEST_F(WaitingRecordsTest, VariablesThatHaveAllRecordsAreReadAsTheyAre) {
+  fake.answer("zVAR_SPARSERECORDS_", {0});
+  put();
+  for (const auto& [command, arguments] : {record, wholeSlab, part, partPut}) {
+    call(command, arguments);
+    EXPECT_THAT(calls(), Not(Contains(kAskLast))) << command;
+  }
+}
+
+// There the library counts rightly.
+TEST_F(WaitingRecordsTest, SoAreSparseVariablesWithoutCompression) {
   fake.answer("zVAR_COMPRESSION_", {0, 0, 100});
   put();
-  for (const auto& [command, arguments] : readers) {
+  for (const auto& [command, arguments] : {record, wholeSlab, part, partPut}) {
     call(command, arguments);
-    EXPECT_THAT(calls(), Not(Contains(HasSubstr("DELETE_")))) << command;
+    EXPECT_THAT(calls(), Not(Contains(kAskLast))) << command;
   }
 }
 
-TEST_F(WaitingRecordsTest, NorForFilesThatWereOnlyRead) {
+TEST_F(WaitingRecordsTest, NothingIsAskedOfFilesThatWereOnlyRead) {
   describe({.sizes = {2}});
-  answerCompressedSparse();
-  for (std::size_t i = 0; i < 3; ++i) {
-    call(readers[i].first, readers[i].second);
-    EXPECT_THAT(calls(), Not(Contains(kAsk)));
+  for (const auto& [command, arguments] : {record, wholeSlab, value, part}) {
+    call(command, arguments);
+    EXPECT_THAT(calls(), Not(Contains(kAskSparseness))) << command;
   }
 }
 
-TEST_F(WaitingRecordsTest, NorBeforeWholeRecordsAreWritten) {
-  answerCompressedSparse();
-  put();
-  call("hyperPutVarData", {file(), 3, 4, 1, 1, 0, 2, 1, elements<double>(2)});
-  EXPECT_THAT(calls(), Not(Contains(kAsk)));
+TEST_F(WaitingRecordsTest, WhatTheLibraryRefusedDoesNotCountAsWritten) {
+  describe({.sizes = {2}});
+  const std::pair<std::string, Arguments> writers[] = {
+      {"putVarData", {file(), 3, 9, 0, 1}},
+      {"putVarRecordData", {file(), 3, 9, elements<double>(2)}},
+      {"hyperPutVarData", {file(), 3, 9, 1, 1, 0, 2, 1, elements<double>(2)}},
+      {"setVarInitialRecs", {file(), 3, 9}}};
+  fake.endWith("PUT_", -2070);
+  fake.endWith("CDFputVarRecordData", -2070);
+  for (const auto& [command, arguments] : writers)
+    EXPECT_THAT(errorOf(command, arguments), HasSubstr("-2070")) << command;
+  fake.forgetCalls();
+  call(record.first, record.second);
+  EXPECT_THAT(calls(), Not(Contains(kAskSparseness)));
 }
 
-// What was put there was refused, so nothing waits.
-TEST_F(WaitingRecordsTest, FilesThatAreNotWrittenAreRead) {
-  answerCompressedSparse();
-  put();
-  for (const long refusal : {-2070, -2086}) {  // READ_ONLY_MODE, NO_WRITE_ACCESS
-    fake.endWith("DELETE_", refusal);
-    call("getVarRecordData", {file(), 3, 4});
-    EXPECT_THAT(calls(), Contains(HasSubstr("CDFgetVarRecordData")));
+TEST_F(WaitingRecordsTest, WhatItAcceptedDoes) {
+  const std::pair<std::string, Arguments> writers[] = {
+      {"putVarData", {file(), 3, 9, 0, 1}},
+      {"putVarRecordData", {file(), 3, 9, elements<double>(2)}},
+      {"hyperPutVarData", {file(), 3, 9, 1, 1, 0, 2, 1, elements<double>(2)}},
+      {"setVarInitialRecs", {file(), 3, 9}}};
+  for (const auto& [command, arguments] : writers) {
+    call("open", {"any.cdf"});  // registers the same file anew
+    describe({.sizes = {2}});
+    call(command, arguments);
+    fake.forgetCalls();
+    call(record.first, record.second);
+    EXPECT_THAT(calls(), Contains(kAskSparseness)) << command;
   }
 }
 
-TEST_F(WaitingRecordsTest, AFailureIsThatOfTheReader) {
-  answerCompressedSparse();
+TEST_F(WaitingRecordsTest, SettingsThatWriteNoRecordsDoNot) {
+  describe({.sizes = {2}});
+  call("setVarReservePercent", {file(), 3, 10});
+  call("setVarBlockingFactor", {file(), 3, 10});
+  fake.forgetCalls();
+  call(record.first, record.second);
+  EXPECT_THAT(calls(), Not(Contains(kAskSparseness)));
+}
+
+TEST_F(WaitingRecordsTest, WithoutAnAnswerTheLibraryReads) {
+  for (const char* const question : {kAskSparseness, kAskCompression, kAskLast}) {
+    put();
+    fake.endWith(question, kReadError);
+    call(record.first, record.second);
+    EXPECT_THAT(calls().back(), HasSubstr("CDFgetVarRecordData")) << question;
+    fake.endWith(question, 0);
+  }
+}
+
+TEST_F(WaitingRecordsTest, NothingIsWrittenForHyperslabsThatTheLibraryRefuses) {
   put();
-  fake.endWith("DELETE_", -2013);
-  EXPECT_EQ(errorOf("getVarData", {file(), 3, 4, 0}), libraryFailure("CDFgetzVarData", -2013));
+  fake.answer("zVAR_MAXREC_", {2000000});
+  for (const Arguments& refused :
+       std::vector<Arguments>{{file(), 3, -1, 1, 1, 0, 2, 1}, {file(), 3, 4, 2, 0, 0, 2, 1}}) {
+    call("hyperGetVarData", refused);
+    EXPECT_THAT(calls(), Not(Contains(HasSubstr("DELETE_"))));
+  }
+}
+
+TEST_F(WaitingRecordsTest, AFailureToWriteThemIsThatOfTheReader) {
+  put();
+  fake.answer("zVAR_MAXREC_", {2000000});
+  fake.endWith("DELETE_", kReadError);
+  EXPECT_EQ(errorOf("getVarRecordData", {file(), 3, 4}),
+            libraryFailure("CDFgetzVarRecordData", kReadError));
 }
 
 }  // namespace
