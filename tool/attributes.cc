@@ -7,15 +7,43 @@
 #include <utility>
 
 #include "ambrix/error.h"
+#include "tool/entry_numbers.h"
 #include "tool/facts.h"
 #include "tool/steps.h"
 #include "tool/text.h"
 #include "tool/variable.h"
 
 namespace ambrix::tool {
+namespace {
+
+/// How many numbers without an entry are tried one by one, which takes some 10 us each.
+constexpr std::size_t kMissesAllowed = 10000;
+
+/// The entry of that number; if there is none, why.
+std::optional<EntryHeader> findEntry(CdfFile& file, const Attribute& attribute, double number,
+                                     std::exception_ptr& failure) try {
+  return inquireEntry(file, attribute, number);
+} catch (const Error&) {
+  failure = std::current_exception();
+  return std::nullopt;
+}
+
+/// How many numbers the library may list in its tables.
+constexpr double kNumbersListed = 1 << 20;
+
+}  // namespace
 
 double countAttributes(CdfFile& file) {
   return file.number("getNumgAttributes") + file.number("getNumvAttributes");
+}
+
+void setReadOnly(CdfFile& file) {
+  const double attributes = countAttributes(file);
+  double numbers = 0;
+  for (double number = 0; number < attributes && numbers <= kNumbersListed; ++number)
+    numbers += inquireAttribute(file, number).maxEntry + 1;
+  if (numbers > kNumbersListed) return;
+  file.call("setReadOnlyMode", {constantValue(file.module(), "READONLYON")});
 }
 
 Attribute inquireAttribute(CdfFile& file, double number) {
@@ -50,15 +78,17 @@ void forEachEntry(CdfFile& file, const Attribute& attribute,
   const char* const command = attribute.global ? "getNumAttrgEntries" : "getNumAttrEntries";
   double remaining = file.number(command, {attribute.number});
   std::exception_ptr failure;
-  for (double entry = 0; remaining > 0 && entry <= attribute.maxEntry; ++entry) {
-    std::optional<EntryHeader> header;
-    try {
-      header = inquireEntry(file, attribute, entry);
-    } catch (const Error&) {
-      failure = std::current_exception();  // no entry of that number, as a rule
-    }
+  double number = 0;
+  for (std::size_t misses = 0; misses < kMissesAllowed; ++number) {
+    if (remaining <= 0 || number > attribute.maxEntry) break;
+    const auto header = findEntry(file, attribute, number, failure);
+    if (!header) ++misses;
     if (!header) continue;
     function(*header);
+    --remaining;
+  }
+  for (const double entry : entryNumbersFrom(file, attribute, number, remaining)) {
+    function(inquireEntry(file, attribute, entry));
     --remaining;
   }
   if (remaining > 0 && failure) std::rethrow_exception(failure);

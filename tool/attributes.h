@@ -23,6 +23,11 @@ struct EntryHeader {
 };
 
 double countAttributes(CdfFile& file);
+
+/// Asks the library not to keep the file ready for changes, which makes it much quicker. It then
+/// has a table of all numbers that entries could have: not where that would fill the memory.
+void setReadOnly(CdfFile& file);
+
 Attribute inquireAttribute(CdfFile& file, double number);
 
 EntryHeader inquireEntry(CdfFile& file, const Attribute& attribute, double entry);

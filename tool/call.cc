@@ -10,8 +10,7 @@ namespace {
 /// JSON that stands for an array, and else the text itself; an object is never meant as a text.
 Array readWord(const std::string& word) {
   try {
-    bool numbersInRange = true;
-    return readValue(parseJson(word, numbersInRange));
+    return readValue(parseJson(word));
   } catch (const JsonError& error) {
     if (word.starts_with('{')) throw UsageError(word + ": " + error.what());
     return Array::fromUtf8(word);

@@ -18,7 +18,7 @@ std::string bytesOf(ArrayView characters) {
 }
 
 CdfFile CdfFile::from(Module& module, std::string_view command, std::string_view path) try {
-  return {module, std::move(module.call(command, {Array::fromUtf8(path)}).at(0))};
+  return {module, path, std::move(module.call(command, {Array::fromUtf8(path)}).at(0))};
 } catch (const std::invalid_argument&) {
   throw ToolError("badFileName", "the name of the file is not valid UTF-8");
 }
@@ -42,6 +42,7 @@ CdfFile CdfFile::create(Module& module, std::string_view path, const std::string
 
 CdfFile::CdfFile(CdfFile&& other) noexcept
     : module_(other.module_),
+      path_(std::move(other.path_)),
       id_(std::exchange(other.id_, Array())),
       shownName_(std::move(other.shownName_)) {}
 
@@ -82,10 +83,6 @@ double CdfFile::number(std::string_view command, std::initializer_list<double> a
 
 std::string CdfFile::text(std::string_view command, std::initializer_list<double> arguments) {
   return bytesOf(call(command, arguments).at(0));
-}
-
-void CdfFile::setReadOnly() {
-  call("setReadOnlyMode", {constantValue(*module_, "READONLYON")});
 }
 
 void CdfFile::close() {

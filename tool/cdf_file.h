@@ -35,20 +35,23 @@ class CdfFile {
   double number(std::string_view command, std::initializer_list<double> arguments = {});
   std::string text(std::string_view command, std::initializer_list<double> arguments = {});
 
-  /// Asks the library not to keep the file ready for changes, which makes it much quicker.
-  void setReadOnly();
   void close();
   /// After a command that has closed or deleted the file.
   void forget() noexcept { id_ = Array(); }
+  [[nodiscard]] Module& module() const noexcept { return *module_; }
+  /// The name by which it was opened.
+  [[nodiscard]] const std::string& path() const noexcept { return path_; }
   /// The file as an argument.
   [[nodiscard]] ArrayView id() const noexcept { return id_; }
 
  private:
-  CdfFile(Module& module, Array id) : module_(&module), id_(std::move(id)) {}
+  CdfFile(Module& module, std::string_view path, Array id)
+      : module_(&module), path_(path), id_(std::move(id)) {}
   std::vector<Array> callNamed(std::string_view command, std::span<const ArrayView> arguments);
   static CdfFile from(Module& module, std::string_view command, std::string_view path);
 
   Module* module_;
+  std::string path_;
   Array id_;
   std::string shownName_;  // of a file that was created
 };

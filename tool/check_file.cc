@@ -9,6 +9,8 @@
 #include "tool/check.h"
 #include "tool/facts.h"
 #include "tool/failure.h"
+#include "tool/open_failure.h"
+#include "tool/record_index.h"
 #include "tool/slabs.h"
 #include "tool/steps.h"
 #include "tool/text.h"
@@ -68,15 +70,17 @@ class Examination {
 void Examination::attempt(const std::string& place, const std::function<void()>& read) try {
   read();
 } catch (const Error& error) {
-  tellProblem({place, error.identifier(), error.what()});
+  tellError(place, error);
   recover();
-} catch (const ToolError& error) {
+} catch (const DamagedCounts& error) {
   tellProblem({place, error.identifier(), error.what()});
+} catch (const ToolError& error) {
+  tellUnread({place, error.identifier(), error.what()});
 }
 
 void Examination::open() {
   file_.emplace(CdfFile::open(module_, path_));
-  file_->setReadOnly();
+  setReadOnly(*file_);
 }
 
 /// After some failures the library refuses everything until the file is opened anew.
@@ -98,6 +102,7 @@ void Examination::readVariable(double number) {
 }
 
 void Examination::readValues(const VariableFacts& facts) {
+  requireIndexed(*file_, facts.definition, facts.records);
   requireRoomFor(facts);
   const auto records = static_cast<std::size_t>(std::max(facts.records, 0.0));
   SlabPlan plan(facts.definition, 0, records);
@@ -109,15 +114,14 @@ void Examination::readValues(const VariableFacts& facts) {
 /// of it would take just as long.
 void Examination::requireRoomFor(const VariableFacts& facts) const {
   std::error_code error;
-  const fs::path path = fs::exists(path_, error) ? path_ : path_ + ".cdf";
-  const auto bytes = static_cast<double>(fs::file_size(path, error));
+  const auto bytes = static_cast<double>(fs::file_size(fileOf(path_), error));
   if (error || facts_.format != "SINGLE_FILE") return;
   double claimed = facts.written * static_cast<double>(facts.definition.elements);
   for (std::size_t i = 0; i < facts.definition.sizes.size(); ++i)
     claimed *= facts.definition.varies.at(i) ? static_cast<double>(facts.definition.sizes[i]) : 1;
   // Compressed values may be compressed once more, with the file.
   if (claimed <= bytes * bestGain(facts.compression) * bestGain(facts_.compression)) return;
-  throw ToolError("moreThanTheFile", "the file is too small for the records that it lists");
+  throw DamagedCounts("the file is too small for the records that it lists");
 }
 
 void Examination::readAttribute(double number) {

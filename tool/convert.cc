@@ -111,7 +111,7 @@ std::vector<std::string> listUnsupported(CdfFile& input) {
 
 void runConvert(Module& module, const ConvertOptions& options, const std::string& output) {
   CdfFile input = CdfFile::open(module, options.input);
-  input.setReadOnly();
+  setReadOnly(input);
   reportUnsupported(input, options.skipUnsupported);
   writeCopy(module, options, input, output);
 }

@@ -5,6 +5,7 @@
 
 #include "tool/convert.h"
 #include "tool/progress.h"
+#include "tool/record_index.h"
 #include "tool/slabs.h"
 #include "tool/standard_output.h"
 #include "tool/values.h"
@@ -105,6 +106,7 @@ void writeStored(CdfFile& output, const Variable& variable, const Slab& slab, co
 
 void copyVariable(Conversion& conversion, const Copied& variable, Progress& progress) {
   const std::size_t records = countRecords(conversion.input, variable.source);
+  requireIndexed(conversion.input, variable.source, static_cast<double>(records));
   SparseFilter filter(conversion.input, variable.source, records);
   SlabPlan plan(variable.source, 0, records);
   const bool transposes = conversion.transposes && variable.source.sizes.size() > 1;

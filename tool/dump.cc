@@ -7,8 +7,10 @@
 #include <limits>
 #include <optional>
 
+#include "tool/attributes.h"
 #include "tool/failure.h"
 #include "tool/progress.h"
+#include "tool/record_index.h"
 #include "tool/text.h"
 
 namespace ambrix::tool {
@@ -124,10 +126,11 @@ void requireSupported(const Variable& variable) {
 
 void runDump(Module& module, const DumpOptions& options, StandardOutput& output) {
   CdfFile file = CdfFile::open(module, options.file);
-  file.setReadOnly();
+  setReadOnly(file);
   const Variable variable = inquireVariable(file, findVariable(file, options.variable));
   requireSupported(variable);
   const RecordRange range = parseRange(options.records, countRecords(file, variable));
+  requireIndexed(file, variable, static_cast<double>(range.end));
   const auto format = makeFormat(options, variable, range, output.isTerminal());
   SlabPlan plan(variable, range.first, range.end);
   Progress progress(printable(variable.name), (range.end - range.first) * variable.recordElements(),

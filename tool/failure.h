@@ -46,5 +46,6 @@ class UsageError : public std::runtime_error {
 
 inline constexpr int kExitFailure = 1;
 inline constexpr int kExitUsage = 2;
+inline constexpr int kExitUndecided = 3;  // of a check
 
 }  // namespace ambrix::tool

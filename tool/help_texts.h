@@ -17,7 +17,9 @@ inline constexpr HelpText kToolHelp = {
     "ambrix", "[--version] [--help] COMMAND ...",
     "Shows, converts and edits files in the Common Data Format (CDF)",
     "Failures are told on standard error as \"ambrix: IDENTIFIER: message\".\n"
-    "The exit status is 0, 1 after a failure, or 2 when the arguments are not understood.\n",
+    "The exit status is 0, 1 after a failure, or 2 when the arguments are not understood; check "
+    "has\n"
+    "3, too.\n",
     "  ambrix info data.cdf\n"
     "  ambrix dump data.cdf Epoch --records 0:9\n"
     "  ambrix COMMAND --help\n"};
@@ -50,9 +52,12 @@ inline constexpr HelpText kCheckHelp = {
     "attribute,\n"
     "entry and value is read. What cannot be read is listed, and so is where the library crashed "
     "or got\n"
-    "nowhere, which does no harm here. What is of a datatype that is not supported is said to be "
-    "so; it\n"
-    "is no damage. The exit status is 0 only if all files are sound.\n",
+    "nowhere, which does no harm here. A file is sound, not sound, or undecided: then nothing "
+    "wrong\n"
+    "was found, but something was not read, because memory, time or descriptors ran out or its\n"
+    "datatype is not supported. The exit status is 0 if all files are sound, 1 if one is not, and "
+    "else\n"
+    "3. In JSON, \"sound\" is true, false or null.\n",
     "  ambrix check data.cdf\n"
     "  ambrix check --quiet archive/*.cdf\n"
     "  ambrix check --json data.cdf | jq '.[].problems'\n"};
@@ -87,7 +92,8 @@ inline constexpr HelpText kConvertHelp = {
     "OUT gets the extension .cdf when it has none. An existing file is never overwritten, and\n"
     "nothing is left behind when the conversion fails. Variables and entries of a datatype that "
     "is\n"
-    "not supported are listed, and stop the conversion unless they are to be skipped.\n",
+    "not supported are listed, and stop the conversion unless they are to be skipped. So does a\n"
+    "variable that claims more records than the file has room for.\n",
     "  ambrix convert old.cdf new.cdf --compression gzip:6\n"
     "  ambrix convert rows.cdf columns.cdf --majority column --checksum md5\n"};
 

@@ -1,10 +1,12 @@
 #include "tool/info.h"
 
+#include "tool/attributes.h"
+
 namespace ambrix::tool {
 
 void runInfo(Module& module, const InfoOptions& options, StandardOutput& output) {
   CdfFile file = CdfFile::open(module, options.file);
-  file.setReadOnly();
+  setReadOnly(file);
   const FileFacts facts = readFacts(module, file, options.attributes);
   file.close();
   output.write(options.json ? factsAsJson(facts, options)

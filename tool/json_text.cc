@@ -1,7 +1,5 @@
 #include "tool/json_text.h"
 
-#include <cmath>
-
 #include "adapters/catalogue/unicode.h"
 #include "tool/surrogates.h"
 
@@ -10,22 +8,18 @@ namespace {
 
 constexpr int kMaxDepth = 512;
 
-bool isInRange(const Json& value) {
-  return !value.is_number_float() || std::isfinite(value.get<double>());
-}
-
 }  // namespace
 
-Json parseJson(std::string_view text, bool& numbersInRange) {
+Json parseJson(std::string_view text) {
   if (text.find('\0') != text.npos) throw JsonError("a zero byte is no JSON");
-  numbersInRange = true;
-  const auto check = [&](int depth, Json::parse_event_t, const Json& value) {
+  const auto check = [](int depth, Json::parse_event_t, const Json&) {
     if (depth > kMaxDepth) throw JsonError("nested too deeply");
-    numbersInRange = numbersInRange && isInRange(value);
     return true;
   };
   try {
     return Json::parse(hideSurrogates(text), check);
+  } catch (const Json::out_of_range&) {
+    throw JsonRangeError("a number beyond the range of double");
   } catch (const Json::exception& error) {
     throw JsonError(error.what());
   }
@@ -34,11 +28,6 @@ Json parseJson(std::string_view text, bool& numbersInRange) {
 std::u16string unitsOf(const Json& string) {
   if (!string.is_string()) throw JsonError("not a string");
   return showSurrogates(catalogue::toUtf16(string.get_ref<const std::string&>()).value());
-}
-
-std::string toAscii(const Json& value) {
-  constexpr int kOneLine = -1;
-  return showSurrogates(nlohmann::json(value).dump(kOneLine, ' ', true));
 }
 
 }  // namespace ambrix::tool

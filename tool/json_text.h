@@ -3,20 +3,14 @@
 // UTF-8.
 #pragma once
 
-#include <cstdint>
-#include <map>
 #include <nlohmann/json.hpp>
 #include <stdexcept>
 #include <string>
 #include <string_view>
-#include <vector>
 
 namespace ambrix::tool {
 
-/// Numbers with a wider range than double, so that one beyond it is told apart from what is no
-/// JSON.
-using Json = nlohmann::basic_json<std::map, std::vector, std::string, bool, std::int64_t,
-                                  std::uint64_t, long double>;
+using Json = nlohmann::json;
 
 /// A text that is not JSON, or JSON that is not what was asked for.
 class JsonError : public std::runtime_error {
@@ -24,14 +18,21 @@ class JsonError : public std::runtime_error {
   using std::runtime_error::runtime_error;
 };
 
-/// Parses one JSON value in UTF-8 and tells whether all its numbers are within the range of double.
-/// Throws `JsonError` for anything else and for a value that is nested deeper than 512 levels.
-Json parseJson(std::string_view text, bool& numbersInRange);
+/// JSON, as far as it was read, with a number beyond the range of double.
+class JsonRangeError : public JsonError {
+ public:
+  using JsonError::JsonError;
+};
+
+/// Parses one JSON value in UTF-8. Throws `JsonError` for anything else, for a value that is nested
+/// deeper than 512 levels and for numbers beyond the range of double.
+Json parseJson(std::string_view text);
 
 /// The UTF-16 units of a string. Throws `JsonError` for any other value.
 std::u16string unitsOf(const Json& string);
 
-/// The value as an ASCII text; numbers beyond the range of double become null.
-std::string toAscii(const Json& value);
+/// The text of an object's member, the last of that name, with every digit as it was written, but
+/// in ASCII and without line ends. Empty when there is none, or none that is JSON.
+std::string memberText(std::string_view object, std::string_view name);
 
 }  // namespace ambrix::tool

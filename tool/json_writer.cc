@@ -7,20 +7,14 @@
 
 #include "adapters/catalogue/unicode.h"
 #include "tool/json_value.h"
+#include "tool/surrogates.h"
 #include "tool/text.h"
 
 namespace ambrix::tool {
 namespace {
 
-void appendEscaped(std::string& json, char16_t unit) {
-  constexpr char kDigits[] = "0123456789abcdef";
-  json += "\\u";
-  for (int shift = 12; shift >= 0; shift -= 4)
-    json += kDigits[(unit >> shift) & 0xF];
-}
-
 void appendUnit(std::string& json, char16_t unit) {
-  if (unit < 0x20 || unit > 0x7E) return appendEscaped(json, unit);
+  if (unit < 0x20 || unit > 0x7E) return appendEscape(json, unit);
   if (unit == u'"' || unit == u'\\') json += '\\';
   json += static_cast<char>(unit);
 }

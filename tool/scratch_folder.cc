@@ -30,6 +30,11 @@ ScratchFolder::~ScratchFolder() {
   if (!path_.empty()) fs::remove_all(path_, ignored);
 }
 
+fs::path scratchFolder() {
+  const char* const used = std::getenv(kVariable);
+  return used != nullptr ? fs::path(used) : fs::temp_directory_path();
+}
+
 void ScratchFolder::use() const noexcept {
   if (!path_.empty()) ::setenv(kVariable, path_.c_str(), 1);
 }

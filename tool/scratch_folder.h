@@ -22,4 +22,7 @@ class ScratchFolder {
   std::filesystem::path path_;
 };
 
+/// The folder in use, or that for temporary files.
+std::filesystem::path scratchFolder();
+
 }  // namespace ambrix::tool

@@ -44,12 +44,13 @@ std::string describeOutputs(const std::vector<Array>& outputs) {
 }
 
 /// The parsed line; also its tag, if it has one, even when it turns out to be no good request.
-Json parseLine(std::string_view line, std::string& tag) {
-  bool numbersInRange = true;
-  Json object = parseJson(line, numbersInRange);
-  if (object.is_object() && object.contains("tag")) tag = toAscii(object["tag"]);
-  if (!numbersInRange) throw JsonError("a number beyond the range of double");
+Json parseLine(std::string_view line, std::string& tag) try {
+  Json object = parseJson(line);
+  if (object.is_object() && object.contains("tag")) tag = memberText(line, "tag");
   return object;
+} catch (const JsonRangeError&) {
+  tag = memberText(line, "tag");
+  throw;
 }
 
 /// What the line asks for is done, or not, and told; `called` says whether the module was asked.

@@ -103,9 +103,8 @@ WorkerEnd endOf(int status, const Steps& steps) {
     end.status = WEXITSTATUS(status);
   } else {
     end.signal = WTERMSIG(status);
-    end.kind = isCrash(end.signal)     ? Kind::kCrashed
-               : end.signal == SIGKILL ? Kind::kKilled
-                                       : Kind::kInterrupted;
+    const bool killed = end.signal == SIGKILL || end.signal == SIGXCPU;
+    end.kind = isCrash(end.signal) ? Kind::kCrashed : killed ? Kind::kKilled : Kind::kInterrupted;
   }
   return end;
 }
@@ -164,7 +163,8 @@ std::string describeEnd(const WorkerEnd& end, const Limits& limits) {
     case Kind::kQuit:
       return "the CDF library ended the process" + during;
     case Kind::kKilled:
-      return "the process was killed" + during + ", perhaps for want of memory";
+      return "the process was killed" + during + ", perhaps for want of " +
+             (end.signal == SIGXCPU ? "processor time" : "memory");
     case Kind::kTooSlow:
       return fmt::format("nothing was read for {} seconds{}", limits.seconds, during);
     case Kind::kInterrupted:

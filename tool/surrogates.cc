@@ -22,13 +22,6 @@ bool isSurrogate(unsigned unit) {
   return unit >= kFirstSurrogate && unit < kFirstSurrogate + kSurrogates;
 }
 
-void appendEscape(std::string& json, unsigned unit) {
-  constexpr char kDigits[] = "0123456789abcdef";
-  json += "\\u";
-  for (int shift = 12; shift >= 0; shift -= 4)
-    json += kDigits[(unit >> shift) & 0xF];
-}
-
 void appendHidden(std::string& json, unsigned surrogate) {
   const unsigned index = surrogate - kFirstSurrogate;
   appendEscape(json, kFirstHalf + index / kHalves);
@@ -73,6 +66,13 @@ std::size_t hideFirst(std::string& json, std::string_view text) {
 }
 
 }  // namespace
+
+void appendEscape(std::string& json, unsigned unit) {
+  constexpr char kDigits[] = "0123456789abcdef";
+  json += "\\u";
+  for (int shift = 12; shift >= 0; shift -= 4)
+    json += kDigits[(unit >> shift) & 0xF];
+}
 
 std::string hideSurrogates(std::string_view json) {
   std::string hidden;

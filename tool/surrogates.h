@@ -17,4 +17,7 @@ std::string showSurrogates(std::string_view json);
 /// UTF-16 of a string from a parsed text, with the surrogates back.
 std::u16string showSurrogates(std::u16string_view units);
 
+/// Appends a unit as \uXXXX.
+void appendEscape(std::string& json, unsigned unit);
+
 }  // namespace ambrix::tool

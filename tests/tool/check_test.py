@@ -43,7 +43,8 @@ class SoundTest(CheckCase):
         self.assertEqual(self.check(*files), "ROW_MAJOR.cdf: sound\nCOLUMN_MAJOR.cdf: sound\n")
         self.assertEqual(self.check("--quiet", *files), "")
         self.assertEqual(self.verdicts(*files), [
-            {"file": file, "sound": True, "problems": [], "unsupported": [], "unlisted": 0}
+            {"file": file, "sound": True, "problems": [], "unread": [], "unsupported": [],
+             "unlisted": 0}
             for file in files])
         self.assertEqual(self.verdicts("--quiet", *files), [])
         self.assertEqual(self.check("ROW_MAJOR"), "ROW_MAJOR: sound\n")
@@ -81,15 +82,17 @@ class SoundTest(CheckCase):
         (verdict,) = self.verdicts("parts.cdf", status=1)
         self.assertIn('variable "v"', [problem["place"] for problem in verdict["problems"]])
 
-    def test_what_is_not_supported_is_no_damage(self):
+    def test_what_is_not_supported_is_undecided(self):
         session = self.session()
         (file,) = session.call("create", "new")
         session.call("createVar", file, "fine time", 33, 1, [], True, [])
         session.call("close", file)
-        self.assertEqual(self.check("new.cdf"), "new.cdf: sound\n    not supported, so not read: "
+        self.assertEqual(self.check("new.cdf", status=3),
+                         "new.cdf: undecided\n    not supported, so not read: "
                          'variable "fine time" (cdf_time_tt2000)\n')
-        (verdict,) = self.verdicts("new.cdf")
-        self.assertTrue(verdict["sound"])
+        (verdict,) = self.verdicts("new.cdf", status=3)
+        self.assertIsNone(verdict["sound"])
+        self.assertEqual(verdict["problems"], [])
         self.assertEqual(verdict["unsupported"], ['variable "fine time" (cdf_time_tt2000)'])
 
     def test_files_are_not_changed(self):
@@ -216,8 +219,8 @@ class DamageTest(CheckCase):
         process, worker = self.start_checking("--time-limit", "3")
         os.kill(worker, signal.SIGSTOP)  # as if it did not return
         output, errors = process.communicate()
-        self.assertEqual((process.returncode, errors), (1, b""))
-        self.assertEqual(output.decode(), "busy.cdf: not sound\n    ambrix:timeLimitReached: nothing "
+        self.assertEqual((process.returncode, errors), (3, b""))
+        self.assertEqual(output.decode(), "busy.cdf: undecided\n    ambrix:timeLimitReached: nothing "
                          'was read for 3 seconds while reading variable "v"\n'
                          "example.cdf: sound\n")
 

@@ -3,6 +3,7 @@
 import json
 import math
 import os
+import random
 import struct
 import subprocess
 import tempfile
@@ -74,6 +75,25 @@ class RequestTest(SessionCase):
                 answer = self.session.request({"command": command, "tag": tag})
                 self.assertIn("tag", answer)
                 self.assertEqual(answer["tag"], tag)
+
+    def test_tag_comes_back_as_it_was_sent(self):
+        for tag in ("12345678901234567890123456789012345678901234567890", "0.10", "1E+2", "-0",
+                    '{"z":1,"a":[0.1100230209618294,{}],"m":18446744073709551617,"a":2}',
+                    '"]}\\" ,:{["', "123456789.12345678901234567890"):
+            for line in ('{"command":"getLibraryVersion","outputs":0,"tag":%s}',
+                         ' { "tag" : %s , "command":"nonsense","x":{"tag":1}} ',
+                         '{"tag":0,"command":[1,"],"],"t\\u0061g":%s}',
+                         '{"command":"x","other":1e99999,"tag":%s}'):
+                done, _ = run_session((line % tag).encode())
+                answer = done.stdout.split(b"\n")[0].decode()
+                self.assertTrue(answer.endswith('"tag":' + tag + "}"), (line, tag, answer))
+
+    def test_no_other_member_is_taken_for_the_tag(self):
+        for line in ('[{"tag":1},1e400]', '{"x":{"tag":1}}', '{"x":"\\"tag\\":1,"}',
+                     '{"other":1e400,"tag":01}', '{"other":1e400,"tag":'):
+            _, answers = run_session(line.encode())
+            self.assertEqual(answers[0]["error"]["identifier"], BAD_REQUEST)
+            self.assertNotIn("tag", answers[0], line)
 
     def test_blanks_around_and_inside_a_request_are_fine(self):
         answer = self.session.send_line('\t { "command" : "getLibraryVersion" , "outputs" : 0 } \r')
@@ -206,6 +226,26 @@ class ValueTest(SessionCase):
         result = self.echo(array("single", singles), "CDF_FLOAT").data
         self.assertEqual(struct.pack("6f", *result), struct.pack("6f", *singles))
         self.assertEqual(result, singles)  # as doubles, too
+
+    def assert_exact(self, file, texts, numbers):
+        answer = self.session.send_line(
+            '{"command":"putAttrgEntry","arguments":[%s,0,0,45,[%s]]}'
+            % (json.dumps(file.to_json()), ",".join(texts)))
+        self.assertNotIn("error", answer)
+        (result,) = self.session.call("getAttrgEntry", file, 0, 0)
+        self.assertEqual(struct.pack(f"{len(numbers)}d", *result.data),
+                         struct.pack(f"{len(numbers)}d", *numbers))
+
+    def test_a_million_doubles_bit_for_bit(self):
+        file = self.create()
+        self.session.call("createAttr", file, "a", 1)
+        self.assert_exact(file, ["0.1100230209618294"] * 2, [0.1100230209618294] * 2)
+        source = random.Random(1)
+        for _ in range(20):
+            numbers = struct.unpack("50000d", source.randbytes(8 * 50_000))
+            numbers = [x for x in numbers if math.isfinite(x)]
+            self.assert_exact(file, [repr(x) for x in numbers], numbers)
+            self.assert_exact(file, [f"{x:.17g}" for x in numbers], numbers)
 
     def test_numbers_that_are_not_finite(self):
         values = [math.nan, math.inf, -math.inf]
