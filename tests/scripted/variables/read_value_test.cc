@@ -93,6 +93,11 @@ TEST_F(ReadValueTest, ARecordOfAsManyBytesAsTheLibraryCanCountIsRead) {
   EXPECT_EQ(errorOf("getVarData", {file(), 3, 0, {0, 0}}), libraryFailure("CDFgetzVarData", -2004));
 }
 
+TEST_F(ReadValueTest, DimensionsThatDoNotVaryAddNoBytesToARecord) {
+  describe({.datatype = 4, .sizes = {65536, 65536}, .variances = {-1, 0}});
+  EXPECT_EQ(errorOf("getVarData", {file(), 3, 0, {0, 0}}), "no error");
+}
+
 TEST_F(ReadValueTest, ArgumentsAreConvertedInOrderUnderTheirLabels) {
   EXPECT_EQ(errorOf("getVarData", {file(), "x", "x"}), notScalar("VARNUM"));
   EXPECT_EQ(errorOf("getVarData", {file(), 3, "x"}), notScalar("RECNUM"));
