@@ -2,41 +2,50 @@
 #
 # Includes are written from the repository's root ("gateway/errors.h"), but the root itself is on no
 # layer's include path. Each folder instead has an include root of its own, a folder holding nothing
-# but a link to it, so that including a folder that was not granted fails to compile.
+# but links into it, so that including from a folder that was not granted fails to compile. A room is
+# a folder within another that is a layer of its own.
 
-# ambrix_root(NAME): an INTERFACE target ambrix_root_NAME that grants includes from folder NAME.
+# ambrix_root(NAME [ROOMS room...]): an INTERFACE target that grants includes from folder NAME, its
+# rooms apart.
 function(ambrix_root name)
-  set(root "${CMAKE_BINARY_DIR}/layers/${name}")
-  file(MAKE_DIRECTORY "${root}")
-  file(CREATE_LINK "${PROJECT_SOURCE_DIR}/${name}" "${root}/${name}" SYMBOLIC)
-  add_library(ambrix_root_${name} INTERFACE)
-  target_include_directories(ambrix_root_${name} INTERFACE "${root}")
+  cmake_parse_arguments(PARSE_ARGV 1 arg "" "" "ROOMS")
+  string(REPLACE / _ target "${name}")
+  set(root "${CMAKE_BINARY_DIR}/layers/${target}")
+  file(REMOVE_RECURSE "${root}")
+  file(MAKE_DIRECTORY "${root}/${name}")
+  file(GLOB contents CONFIGURE_DEPENDS RELATIVE "${PROJECT_SOURCE_DIR}/${name}"
+    "${PROJECT_SOURCE_DIR}/${name}/*")
+  list(REMOVE_ITEM contents ${arg_ROOMS} CMakeLists.txt)
+  foreach(content ${contents})
+    file(CREATE_LINK "${PROJECT_SOURCE_DIR}/${name}/${content}" "${root}/${name}/${content}" SYMBOLIC)
+  endforeach()
+  add_library(ambrix_root_${target} INTERFACE)
+  target_include_directories(ambrix_root_${target} INTERFACE "${root}")
 endfunction()
 
-# ambrix_layer(NAME [SEES folder...]): object library ambrix_NAME from the sources of this folder
-# and those in it. It sees itself, the folders named, the CDF header and Boost; it links with nothing.
+# ambrix_layer(NAME [SEES folder...] [ROOMS room...]): object library ambrix_NAME from the sources of
+# this folder and of the folders in it, its rooms apart. It sees itself, the folders named, the CDF
+# header and Boost; it links with nothing.
 function(ambrix_layer name)
-  cmake_parse_arguments(PARSE_ARGV 1 arg "" "" "SEES")
-  ambrix_root(${name})
-  file(GLOB sources CONFIGURE_DEPENDS 
+  cmake_parse_arguments(PARSE_ARGV 1 arg "" "" "SEES;ROOMS")
+  ambrix_root(${name} ROOMS ${arg_ROOMS})
+  string(REPLACE / _ target "${name}")
+  file(GLOB sources CONFIGURE_DEPENDS
     "${CMAKE_CURRENT_SOURCE_DIR}/*.cc" "${CMAKE_CURRENT_SOURCE_DIR}/*/*.cc")
+  foreach(room ${arg_ROOMS})
+    list(FILTER sources EXCLUDE REGEX "/${room}/[^/]*$")
+  endforeach()
   if(NOT sources)
     return()  # a folder of headers only
   endif()
-  add_library(ambrix_${name} OBJECT ${sources})
-  set_target_properties(ambrix_${name} PROPERTIES
+  add_library(ambrix_${target} OBJECT ${sources})
+  set_target_properties(ambrix_${target} PROPERTIES
     LINKER_LANGUAGE CXX
     POSITION_INDEPENDENT_CODE ON
     CXX_VISIBILITY_PRESET hidden
     VISIBILITY_INLINES_HIDDEN ON)
   list(TRANSFORM arg_SEES PREPEND ambrix_root_ OUTPUT_VARIABLE seen)
-  target_link_libraries(ambrix_${name} PRIVATE
-    ambrix_options ambrix_coverage ambrix_root_${name} ${seen} CDF::headers Boost::headers)
-  set_property(GLOBAL APPEND PROPERTY AMBRIX_LAYERS ${name})
-endfunction()
-
-# ambrix_source_sees(SOURCE folder...): grants further folders to one source file only.
-function(ambrix_source_sees source)
-  list(TRANSFORM ARGN PREPEND "${CMAKE_BINARY_DIR}/layers/" OUTPUT_VARIABLE roots)
-  set_property(SOURCE ${source} APPEND PROPERTY INCLUDE_DIRECTORIES ${roots})
+  target_link_libraries(ambrix_${target} PRIVATE
+    ambrix_options ambrix_coverage ambrix_root_${target} ${seen} CDF::headers Boost::headers)
+  set_property(GLOBAL APPEND PROPERTY AMBRIX_LAYERS ${target})
 endfunction()

@@ -35,13 +35,6 @@ std::vector<long> getOptionalIndices(std::int32_t argumentCount, const qvArray* 
   return {};
 }
 
-/// Whether a value is a whole record to the library.
-bool storesOneValue(const VariableDescription& description) {
-  const long valueBytes =
-      multiplySaturated(description.elements, datatypeSize(description.datatype));
-  return description.storedBytesPerRecord() == valueBytes;
-}
-
 void readHyperslab(const VariableOperation& variable, const VariableDescription& description,
                    const LibraryHyperslab& slab, void* result) {
   const auto read = [&](void* values) { moveHyperslab(variable, slab, GET_, values); };
@@ -86,7 +79,7 @@ void getVarData(int, qvArray* outputs[], std::int32_t argumentCount, const qvArr
     if (lacksItsRecord(variable, description)) {
       return fillValue(variable, description, record, libraryIndices, value);
     }
-    if (!storesOneValue(description)) return readValue(value);
+    if (!description.storesOneValue()) return readValue(value);
     readWholeRecords(variable, description, {libraryRecord, 1, 1}, value, readValue);
   });
 }

@@ -28,6 +28,10 @@ bool VariableDescription::allDimensionsVary() const {
   return std::ranges::all_of(variances(), [](long variance) { return variance == VARY; });
 }
 
+bool VariableDescription::storesOneValue() const {
+  return storedBytesPerRecord() == multiplySaturated(elements, datatypeSize(datatype));
+}
+
 long describe(const VariableOperation& variable, VariableDescription& found) {
   const long status =
       variable.status(GET_,                                                               //

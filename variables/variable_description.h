@@ -30,6 +30,8 @@ struct VariableDescription {
   /// value.
   [[nodiscard]] long storedBytesPerRecord() const;
   [[nodiscard]] bool allDimensionsVary() const;
+  /// Whether a value is a whole record to the library.
+  [[nodiscard]] bool storesOneValue() const;
 
  private:
   [[nodiscard]] std::size_t count() const { return static_cast<std::size_t>(dimensions); }

@@ -21,19 +21,22 @@ MAY_SEE = {
     "attributes": {"host", "gateway", "constants", "variables", "attributes"},
     "file": {"host", "gateway", "constants", "file"},
     "epoch": {"host", "gateway", "epoch"},
+    "gateway/entry": {"host", "gateway", "constants", "variables", "attributes", "file", "epoch",
+                      "gateway/entry"},
 }
 
 
 def header_of(folder):
     """A header of the folder, as an include names it."""
-    return min((ROOT / folder).rglob("*.h")).relative_to(ROOT)
+    headers = list((ROOT / folder).glob("*.h")) or (ROOT / folder).rglob("*.h")
+    return min(headers).relative_to(ROOT)
 
 
 def command_of(folder):
-    """How the first source of the folder is compiled, the command table apart."""
+    """How the first source of the folder is compiled."""
     for entry in COMMANDS:
         source = pathlib.Path(entry["file"])
-        if source.parent.name == folder and source.name != "command_table.cc":
+        if source.parent == ROOT / folder:
             arguments = shlex.split(entry["command"])
             return entry["directory"], arguments[:arguments.index("-o")]
     raise LookupError(f"no source of {folder}/ is compiled")

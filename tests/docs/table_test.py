@@ -35,7 +35,7 @@ class TableTest(unittest.TestCase):
         self.assertEqual(table_file.PATH.read_text(), table_file.layout(TABLE) + "\n")
 
     def test_has_each_command_once_with_its_counts(self):
-        text = (ROOT / "gateway" / "command_table.cc").read_text()
+        text = (ROOT / "gateway" / "entry" / "command_table.cc").read_text()
         rows = re.findall(r'\{ ?\d+, "(\w+)", +(\d), (\d), ', text)
         self.assertEqual(len(rows), 91)
         self.assertEqual(sorted((c["name"], *counts(c)) for c in COMMANDS),

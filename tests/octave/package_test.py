@@ -63,7 +63,7 @@ class PackageTest(unittest.TestCase):
         with tarfile.open(self.package) as tar:
             members = {member.name.partition("/")[2]: member for member in tar}
         for name in ("DESCRIPTION", "COPYING", "NEWS", "INDEX", "src/configure", "src/Makefile",
-                     "src/gateway/entry_point.cc", "src/adapters/octave/__ambrix__.cc",
+                     "src/gateway/entry/entry_point.cc", "src/adapters/octave/__ambrix__.cc",
                      "inst/ambrix_read.m", "inst/ambrix_hyperGetVarData.m"):
             self.assertIn(name, members)
         kinds = {pathlib.Path(name).suffix for name, member in members.items() if member.isfile()}

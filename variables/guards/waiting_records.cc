@@ -82,8 +82,10 @@ void writeWaitingRecords(const VariableOperation& variable, const VariableDescri
   const long last = lastRecord(variable);
   long record = records.first;
   for (long i = 0; i < records.count && record < last; ++i, record += records.interval) {
+    // A value that is a whole record cannot be tried.
     const bool filledIn =
-        isMissing(variable, description, record) && isMissing(variable, description, record + 1);
+        description.storesOneValue() ||
+        (isMissing(variable, description, record) && isMissing(variable, description, record + 1));
     if (filledIn) return writeAllThatWait(variable);
   }
 }

@@ -79,6 +79,18 @@ TEST_P(WaitingRecordsTest, RecordsOfOneValueAreReadAlone) {
             "double 2x1 [1 " + filled + "]");
 }
 
+// One value is stored, and repeated along the dimension.
+TEST_P(WaitingRecordsTest, SoAreThoseOfOneStoredValue) {
+  const double same =
+      createVar(file, {.datatype = 22, .sizes = {3}, .name = "same", .variances = {0}});
+  results("setVarSparseRecords", {file, same, GetParam()});
+  results("setVarCompression", {file, same, kGzip, 6});
+  results("hyperPutVarData", {file, same, 2, 1, 1, 0, 1, 1, 1});
+  results("hyperPutVarData", {file, same, 60000, 1, 1, 0, 1, 1, 3});
+  const std::string filled = GetParam() == kPad ? "[-1e+30 -1e+30 -1e+30]" : "[1 1 1]";
+  EXPECT_EQ(does("hyperGetVarData", {file, same, 4, 1, 1, 0, 3, 1}), "double 3x1 " + filled);
+}
+
 TEST_P(WaitingRecordsTest, SoAreThoseFarBeforeThem) {
   results("putVarRecordData", {file, v, 30000000, row<double>({5, 6})});
   EXPECT_EQ(does("getVarRecordData", {file, v, 61000}),

@@ -1,7 +1,7 @@
 // The cases leave no command out.
 #include "tests/scripted/commands/command_cases.h"
 
-#include "gateway/command_table.h"
+#include "gateway/entry/command_table.h"
 
 namespace ambrix_test {
 namespace {

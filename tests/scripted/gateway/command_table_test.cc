@@ -1,5 +1,5 @@
 // The 91 commands, restated.
-#include "gateway/command_table.h"
+#include "gateway/entry/command_table.h"
 
 #include <map>
 #include <set>

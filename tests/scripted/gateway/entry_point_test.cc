@@ -1,7 +1,7 @@
 // How a call enters the module and how errors leave it.
 #include <limits>
 
-#include "gateway/file_lifecycle.h"
+#include "file/file_lifecycle.h"
 #include "host/qvh.h"
 #include "tests/support/scripted_test.h"
 

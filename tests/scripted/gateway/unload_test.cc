@@ -1,7 +1,7 @@
 // What is left open when the module goes.
 #include <stdexcept>
 
-#include "gateway/file_lifecycle.h"
+#include "file/file_lifecycle.h"
 #include "tests/support/scripted_test.h"
 
 namespace ambrix_test {

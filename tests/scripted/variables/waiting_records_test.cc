@@ -82,6 +82,16 @@ TEST_F(WaitingRecordsTest, TheyAreWrittenBeforePartsOfMissingRecordsAreReadOrWri
   }
 }
 
+// Trying one is reading it.
+TEST_F(WaitingRecordsTest, AreWrittenUntriedWhereAValueIsAWholeRecord) {
+  put();
+  describe({.sizes = {2}, .variances = {0}});
+  call("hyperGetVarData", {file(), 3, 4, 1, 1, 0, 2, 1});
+  const auto made = calls();
+  EXPECT_THAT(made, Contains(kWrite));
+  EXPECT_THAT(made, Not(Contains(HasSubstr("zVAR_DATA_"))));
+}
+
 TEST_F(WaitingRecordsTest, NotBeforePartsOfOthers) {
   put();
   answerMissing(4);  // and 5 is there: the library fills in no more than 4

@@ -4,9 +4,9 @@
 #include <string>
 
 #include "gateway/arguments.h"
-#include "gateway/command_table.h"
+#include "gateway/entry/command_table.h"
 #include "gateway/errors.h"
-#include "gateway/file_lifecycle.h"
+#include "file/file_lifecycle.h"
 #include "gateway/raise_error.h"
 #include "host/qvh.h"
 

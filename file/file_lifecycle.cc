@@ -1,4 +1,4 @@
-#include "gateway/file_lifecycle.h"
+#include "file/file_lifecycle.h"
 
 #include <cdf.h>
 

@@ -1,4 +1,5 @@
 // Creating, opening, closing and deleting files.
+#include "host/qvh.h"
 #include "tests/support/scripted_test.h"
 
 namespace ambrix_test {

@@ -1,4 +1,4 @@
-#include "gateway/command_table.h"
+#include "gateway/entry/command_table.h"
 
 #include <iterator>
 #include <string>
@@ -14,7 +14,7 @@
 #include "file/library_modes.h"
 #include "file/read_only_mode.h"
 #include "gateway/errors.h"
-#include "gateway/file_lifecycle.h"
+#include "file/file_lifecycle.h"
 #include "gateway/raise_error.h"
 #include "variables/pad_values.h"
 #include "variables/read_data.h"
