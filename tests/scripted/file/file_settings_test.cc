@@ -111,6 +111,8 @@ TEST_F(FileSettingsTest, InReadOnlyModeAnAttributeIsSelectedIfThereIsOneAndTheLi
     EXPECT_THAT(call("setReadOnlyMode", {file(), -1}), testing::IsEmpty());
     EXPECT_THAT(calls(), ElementsAre("SELECT_ CDF_ 7 | CDF_READONLY_MODE_ -1", select));
   }
+  call("setReadOnlyMode", {file(), 0});
+  EXPECT_THAT(calls(), ElementsAre("SELECT_ CDF_ 7 | CDF_READONLY_MODE_ 0"));
   fake.endWith("CDF_READONLY_MODE_ -1", -2073);
   EXPECT_EQ(errorOf("setReadOnlyMode", {file(), -1}), libraryFailure("CDFsetReadOnlyMode", -2073));
 }
