@@ -3,10 +3,10 @@
 #include <cstdint>
 #include <string>
 
+#include "file/file_lifecycle.h"
 #include "gateway/arguments.h"
 #include "gateway/entry/command_table.h"
 #include "gateway/errors.h"
-#include "file/file_lifecycle.h"
 #include "gateway/raise_error.h"
 #include "host/qvh.h"
 
