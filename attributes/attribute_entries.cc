@@ -7,7 +7,6 @@
 #include "gateway/open_file_registry.h"
 #include "gateway/outputs.h"
 #include "gateway/raise_error.h"
-#include "gateway/scratch.h"
 #include "gateway/value_buffer.h"
 #include "variables/datatypes.h"
 #include "variables/library_data.h"
@@ -51,20 +50,21 @@ const EntryKind& kindForScope(long scope) {
   }
 }
 
-/// What the library reads of a value: of `CDF_CHAR` the host's narrow copy of the text.
+/// What the library reads of a value: of `CDF_CHAR` the host's narrow copy of the text, which is
+/// left to the host if the entry cannot be put.
 class EntryData {
  public:
-  EntryData(const qvArray* value, long datatype) {
-    if (datatype == CDF_CHAR) {
-      text_.reset(qvArrayToString(value));
-    } else {
-      data_.emplace(value);
-    }
+  EntryData(const qvArray* value, long datatype)
+      : text_(datatype == CDF_CHAR ? qvArrayToString(value) : nullptr) {
+    if (text_ == nullptr) data_.emplace(value);
   }
-  [[nodiscard]] void* bytes() const { return data_ ? data_->bytes() : text_.get(); }
+  [[nodiscard]] void* bytes() const { return data_ ? data_->bytes() : text_; }
+  void release() const {
+    if (text_ != nullptr) qvFree(text_);
+  }
 
  private:
-  HostString text_;
+  char* text_;
   std::optional<LibraryData> data_;
 };
 
@@ -116,6 +116,7 @@ void putAttrEntry(int, qvArray*[], std::int32_t, const qvArray* arguments[], con
       CDFputAttrEntry(libraryHandle(at.file, kind.putRoutine), kind.kind, at.attribute, at.entry,
                       datatype, libraryNumber(elements, kBadNumber), data.bytes()),
       kind.putRoutine);
+  data.release();
 }
 
 }  // namespace TOLVEX::ambrix

@@ -15,15 +15,15 @@ bool wraps(long start, long count, long interval) {
 }
 
 template <typename... Items>
-void callOnHyperslab(const VariableOperation& variable, const LibraryHyperslab& slab,
+long callOnHyperslab(const VariableOperation& variable, const LibraryHyperslab& slab,
                      Items... items) {
-  variable.call(zVAR_RECNUMBER_, slab.recordStart,         //
-                zVAR_RECCOUNT_, slab.recordCount,          //
-                zVAR_RECINTERVAL_, slab.recordInterval,    //
-                zVAR_DIMINDICES_, slab.start.data(),       //
-                zVAR_DIMCOUNTS_, slab.count.data(),        //
-                zVAR_DIMINTERVALS_, slab.interval.data(),  //
-                items...);
+  return variable.status(zVAR_RECNUMBER_, slab.recordStart,         //
+                         zVAR_RECCOUNT_, slab.recordCount,          //
+                         zVAR_RECINTERVAL_, slab.recordInterval,    //
+                         zVAR_DIMINDICES_, slab.start.data(),       //
+                         zVAR_DIMCOUNTS_, slab.count.data(),        //
+                         zVAR_DIMINTERVALS_, slab.interval.data(),  //
+                         items...);
 }
 
 }  // namespace
@@ -77,12 +77,12 @@ void readSameRecordWithoutSkipping(const VariableDescription& description, Libra
 }
 
 void selectHyperslab(const VariableOperation& variable, const LibraryHyperslab& slab) {
-  callOnHyperslab(variable, slab);
+  variable.check(callOnHyperslab(variable, slab));
 }
 
-void moveHyperslab(const VariableOperation& variable, const LibraryHyperslab& slab, long operation,
+long moveHyperslab(const VariableOperation& variable, const LibraryHyperslab& slab, long operation,
                    const void* values) {
-  callOnHyperslab(variable, slab, operation, zVAR_HYPERDATA_, values);
+  return callOnHyperslab(variable, slab, operation, zVAR_HYPERDATA_, values);
 }
 
 }  // namespace TOLVEX::ambrix

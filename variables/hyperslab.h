@@ -33,7 +33,10 @@ struct RecordRange {
   long count;
   long interval;
 
-  [[nodiscard]] long last() const { return first + (count - 1) * interval; }
+  /// Of counts or intervals that the library refuses, the first one.
+  [[nodiscard]] long last() const {
+    return count < 1 || interval < 1 ? first : first + (count - 1) * interval;
+  }
 };
 
 /// A hyperslab as the library reads it, in a variable of these dimension sizes. The library
@@ -64,8 +67,8 @@ void readSameRecordWithoutSkipping(const VariableDescription& description, Libra
 /// Selects the variable and the hyperslab.
 void selectHyperslab(const VariableOperation& variable, const LibraryHyperslab& slab);
 
-/// The same, then performs GET_ or PUT_ of `zVAR_HYPERDATA_`.
-void moveHyperslab(const VariableOperation& variable, const LibraryHyperslab& slab, long operation,
+/// The same, then performs GET_ or PUT_ of `zVAR_HYPERDATA_`. Returns the status.
+long moveHyperslab(const VariableOperation& variable, const LibraryHyperslab& slab, long operation,
                    const void* values);
 
 }  // namespace TOLVEX::ambrix

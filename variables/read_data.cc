@@ -37,7 +37,9 @@ std::vector<long> getOptionalIndices(std::int32_t argumentCount, const qvArray* 
 
 void readHyperslab(const VariableOperation& variable, const VariableDescription& description,
                    const LibraryHyperslab& slab, void* result) {
-  const auto read = [&](void* values) { moveHyperslab(variable, slab, GET_, values); };
+  const auto read = [&](void* values) {
+    variable.check(moveHyperslab(variable, slab, GET_, values));
+  };
   if (takesWholeRecords(description, slab)) {
     return readWholeRecords(variable, description, slab.records(), result, read);
   }

@@ -50,12 +50,15 @@ void setVariableNumber(int, qvArray*[], std::int32_t, const qvArray* arguments[]
   const long value = libraryNumber(getLongScalarArg(arguments[2], row.label), kBadNumber);
   const VariableOperation variable(file, number, row.routine);
   if constexpr (row.dividesByRecord) requireDivisibleRecord(variable);
+  long status = CDF_OK;
   if constexpr (row.operation == SELECT_) {
-    variable.call(row.item, value);
+    status = variable.status(row.item, value);
   } else {
-    variable.call(row.operation, row.item, value);
+    status = variable.status(row.operation, row.item, value);
   }
-  if constexpr (row.item == zVAR_INITIALRECS_) openFileRegistry().markWritten(file);
+  const bool writesRecords = row.item == zVAR_INITIALRECS_ && status > CDF_WARN;
+  if (writesRecords) openFileRegistry().markWritten(file);
+  variable.check(status);
 }
 
 // clang-format off

@@ -49,11 +49,17 @@ std::size_t bytesRead(const VariableDescription& description, const LibraryHyper
                            datatypeSize(description.datatype)});
 }
 
+/// What the library has carried out counts as written, also if it has warned of something.
+void finishWriting(const VariableOperation& variable, long status) {
+  if (status > CDF_WARN) openFileRegistry().markWritten(variable.file());
+  variable.check(status);
+}
+
 }  // namespace
 
 // Each writer converts its arguments, inquires the variable and checks the data, in the order in
 // which its errors are promised. Then come the guards, which speak as the library does. The library
-// writes last, and what it has accepted counts as written.
+// writes last.
 
 void putVarData(int, qvArray*[], std::int32_t, const qvArray* arguments[], const CommandEntry*) {
   const CdfId file = getCdfIdArg(arguments[0]);
@@ -79,10 +85,9 @@ void putVarData(int, qvArray*[], std::int32_t, const qvArray* arguments[], const
   // Of a text only the first character is written; records and hyperslabs take whole texts.
   const LibraryData value = LibraryData::firstCharacterOf(data);
   const DimensionVector libraryIndices = libraryVector(indices, kBadNumber);
-  variable.call(zVAR_RECNUMBER_, libraryNumber(record, kBadNumber),  //
-                zVAR_DIMINDICES_, libraryIndices.data(),             //
-                PUT_, zVAR_DATA_, value.bytes());
-  openFileRegistry().markWritten(file);
+  finishWriting(variable, variable.status(zVAR_RECNUMBER_, libraryNumber(record, kBadNumber),  //
+                                          zVAR_DIMINDICES_, libraryIndices.data(),             //
+                                          PUT_, zVAR_DATA_, value.bytes()));
 }
 
 void putVarRecordData(int, qvArray*[], std::int32_t, const qvArray* arguments[],
@@ -105,9 +110,8 @@ void putVarRecordData(int, qvArray*[], std::int32_t, const qvArray* arguments[],
   requireRecordNumber(variable, record);
   requireCountableRecord(variable, description, record);
   const LibraryData bytes(data);
-  variable.check(CDFputVarRecordData(variable.handle(), kZVariables, variable.number(), record,
-                                     bytes.bytes()));
-  openFileRegistry().markWritten(file);
+  finishWriting(variable, CDFputVarRecordData(variable.handle(), kZVariables, variable.number(),
+                                              record, bytes.bytes()));
 }
 
 void hyperPutVarData(int, qvArray*[], std::int32_t, const qvArray* arguments[],
@@ -138,8 +142,7 @@ void hyperPutVarData(int, qvArray*[], std::int32_t, const qvArray* arguments[],
   if (!takesWholeRecords(description, librarySlab)) {
     writeWaitingRecords(variable, description, {librarySlab.recordStart, 1, 1});
   }
-  moveHyperslab(variable, librarySlab, PUT_, values.bytes());
-  openFileRegistry().markWritten(file);
+  finishWriting(variable, moveHyperslab(variable, librarySlab, PUT_, values.bytes()));
 }
 
 void deleteVarRecords(int, qvArray*[], std::int32_t, const qvArray* arguments[],

@@ -10,8 +10,8 @@
 namespace TOLVEX::ambrix {
 namespace {
 
-// More room than that is not taken for a read: the waiting records are written instead.
-constexpr std::size_t kMostRoom = std::size_t{16} << 20;
+// More than that is not filled in for a read: the waiting records are written instead.
+constexpr std::size_t kMostFilled = std::size_t{1} << 20;
 
 constexpr long kNoRecord = -1;
 
@@ -68,10 +68,12 @@ std::size_t roomForWaitingRecords(const VariableOperation& variable,
                                   const RecordRange& records) {
   if (!mayHaveWaitingRecords(variable, description, records)) return 0;
   const long last = lastRecord(variable);
-  if (records.last() >= last) return 0;
-  const long mostFilled = std::max(records.count, last - records.first);
-  const std::size_t room = saturatedProduct({mostFilled, description.storedBytesPerRecord()});
-  if (room <= kMostRoom) return room;
+  const bool oneByOne = records.interval > 1 && records.count > 1;
+  if (records.first >= last || (!oneByOne && records.last() >= last)) return 0;
+  const long filled = std::max(records.count, last - records.first);
+  const long fillings = oneByOne ? records.count : 1;
+  const std::size_t room = saturatedProduct({filled, description.storedBytesPerRecord()});
+  if (saturatedProduct({fillings, static_cast<long>(room)}) <= kMostFilled) return room;
   writeAllThatWait(variable);
   return 0;
 }

@@ -55,9 +55,17 @@ TEST_P(WaitingRecordsTest, ReadingWholeRecordsWritesNothing) {
   const std::string before = told();
   does("getVarRecordData", {file, v, 4});
   does("getVarRecordData", {file, v, 60000});
-  does("hyperGetVarData", {file, v, 3, 4, 2, 0, 2, 1});
+  does("hyperGetVarData", {file, v, 59900, 4, 2, 0, 2, 1});
   does("getVarData", {file, v, 4, 1});
   EXPECT_EQ(told(), before);
+}
+
+// The library reads those one by one.
+TEST_P(WaitingRecordsTest, RecordsApartAreReadAloneAlsoIfTheLastOneWaits) {
+  EXPECT_EQ(does("hyperGetVarData", {file, v, 4, 2, 59996, 0, 2, 1}),
+            "double 2x2 [" + missing.substr(1, missing.size() - 2) + " 3 4]");
+  EXPECT_EQ(does("hyperGetVarData", {file, v, 4, 400, 2, 0, 2, 1}).substr(0, 15),
+            "double 2x400 [" + missing.substr(1, 1));
 }
 
 TEST_P(WaitingRecordsTest, PartsAreReadAloneInReadOnlyModeToo) {

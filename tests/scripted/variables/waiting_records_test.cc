@@ -56,6 +56,23 @@ TEST_F(WaitingRecordsTest, WholeRecordsAreReadWithRoomForAllUpToThem) {
   }
 }
 
+// The library reads them one by one, each with all that it fills in.
+TEST_F(WaitingRecordsTest, RecordsApartNeedRoomAlsoIfTheLastOneIsThere) {
+  put();
+  fake.answerData(std::vector<double>(56 * 2, 7));
+  result("hyperGetVarData", {file(), 3, 4, 2, 56, 0, 2, 1});
+  EXPECT_THAT(calls(), Not(Contains(kWrite)));
+}
+
+TEST_F(WaitingRecordsTest, ForManyApartTheyAreWritten) {
+  put();
+  fake.answer("zVAR_MAXREC_", {10000});
+  result("hyperGetVarData", {file(), 3, 0, 2, 2, 0, 2, 1});
+  EXPECT_THAT(calls(), Not(Contains(kWrite)));
+  result("hyperGetVarData", {file(), 3, 0, 100, 2, 0, 2, 1});
+  EXPECT_THAT(calls(), Contains(kWrite));
+}
+
 TEST_F(WaitingRecordsTest, TheLastOnesNeedNoRoom) {
   put();
   result("getVarRecordData", {file(), 3, 60});
@@ -160,6 +177,25 @@ TEST_F(WaitingRecordsTest, WhatItAcceptedDoes) {
     call("open", {"any.cdf"});  // registers the same file anew
     describe({.sizes = {2}});
     call(command, arguments);
+    fake.forgetCalls();
+    call(record.first, record.second);
+    EXPECT_THAT(calls(), Contains(kAskSparseness)) << command;
+  }
+}
+
+TEST_F(WaitingRecordsTest, SoDoesWhatItDidWithAWarning) {
+  constexpr long kNegativeZero = -1004;
+  const std::pair<std::string, Arguments> writers[] = {
+      {"putVarData", {file(), 3, 9, 0, 1}},
+      {"putVarRecordData", {file(), 3, 9, elements<double>(2)}},
+      {"hyperPutVarData", {file(), 3, 9, 1, 1, 0, 2, 1, elements<double>(2)}},
+      {"setVarInitialRecs", {file(), 3, 9}}};
+  for (const auto& [command, arguments] : writers) {
+    call("open", {"any.cdf"});
+    describe({.sizes = {2}});
+    fake.endWith("PUT_", kNegativeZero);
+    fake.endWith("CDFputVarRecordData", kNegativeZero);
+    EXPECT_THAT(errorOf(command, arguments), HasSubstr("-1004"));
     fake.forgetCalls();
     call(record.first, record.second);
     EXPECT_THAT(calls(), Contains(kAskSparseness)) << command;
