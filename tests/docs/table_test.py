@@ -16,7 +16,7 @@ MODULE = ("gateway", "constants", "file", "attributes", "variables", "epoch")
 
 
 def sources():
-    files = [path for folder in MODULE for path in (ROOT / folder).glob("*.[ch]*")]
+    files = [path for folder in MODULE for path in (ROOT / folder).rglob("*.[ch]*")]
     return "".join(path.read_text() for path in files)
 
 
@@ -40,6 +40,26 @@ class TableTest(unittest.TestCase):
         self.assertEqual(len(rows), 91)
         self.assertEqual(sorted((c["name"], *counts(c)) for c in COMMANDS),
                          sorted((name, int(least), int(most)) for name, least, most in rows))
+
+    def test_each_list_of_commands_in_tests_and_fuzzers_has_them_all(self):
+        names = sorted(command["name"] for command in COMMANDS)
+        for path in ("tests/scripted/gateway/command_table_test.cc",
+                     "tests/scripted/commands/command_cases_table.cc",
+                     "tests/module/gateway/every_command_test.cc", "fuzz/calls/commands.cc"):
+            with self.subTest(path=path):
+                listed = re.findall(r'\{(?:\d+, )?"(\w+)",', (ROOT / path).read_text())
+                self.assertEqual(sorted(set(listed) & set(names)), names)
+
+    def test_each_message_has_a_text_and_its_text_a_test(self):
+        listed = {f"{row['component']}:{row['identifier']}" for row in TABLE["identifiers"]}
+        texts = (ROOT / "adapters/catalogue/message_texts.cc").read_text()
+        worded = set(re.findall(r'\{"(TOLVEX:[\w:]+)",', texts))
+        self.assertEqual({name for name in worded if ":host:" not in name}, listed)
+        tests = (ROOT / "tests/adapters/catalogue_test.cc").read_text()
+        components = dict(re.findall(r'(k\w+) = "(TOLVEX:[\w:]+)"', tests))
+        tried = {f"{components[kind]}:{name}"
+                 for kind, name in re.findall(r'\{\{(k\w+), "(\w+)"', tests)}
+        self.assertEqual(tried, worded)
 
     def test_has_each_identifier_once_with_as_many_values(self):
         text = (ROOT / "gateway" / "errors.h").read_text()
