@@ -106,7 +106,7 @@ std::string verdictsAsJson(const std::vector<Verdict>& verdicts) {
                     {"unsupported", verdict.unsupported},
                     {"unlisted", verdict.unlisted}});
   }
-  return list.dump(2) + '\n';
+  return list.dump(2, ' ', true) + '\n';  // in ASCII, lest a terminal obey it
 }
 
 }  // namespace ambrix::tool

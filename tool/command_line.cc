@@ -27,13 +27,12 @@ void describe(CLI::App& app, const HelpText& help, const std::string& usage) {
   const auto formatter = std::make_shared<HelpFormatter>(usage);
   formatter->column_width(28);
   formatter->label("Positionals", "Arguments");
-  formatter->label("Subcommands", "Commands");
   app.formatter(formatter);
   app.set_help_flag("-h,--help", "Print this help and exit");
 }
 
 CLI::App& addCommand(CLI::App& app, const HelpText& help) {
-  CLI::App& command = *app.add_subcommand(help.name);
+  CLI::App& command = *app.add_subcommand(help.name)->group("Commands");
   describe(command, help, std::string("ambrix ") + help.name + " " + help.synopsis);
   return command;
 }
@@ -67,13 +66,13 @@ void addBytes(CLI::App& command, const char* name, std::size_t& bytes, const cha
 void addLimits(CLI::App& command, Arguments& arguments) {
   command
       .add_option("--time-limit", arguments.limits.seconds,
-                  fmt::format("Give up when nothing was read for so long (default: {}; 0: never)",
+                  fmt::format("Give up when nothing was read for so long (default:\n{}; 0: never)",
                               kTimeLimit))
       ->type_name("SECONDS")
       ->check(requireSeconds);
   addBytes(command, "--memory-limit", arguments.limits.memory,
-           "Give up when reading takes more memory, as in 2GB (default: three\n"
-           "quarters of the machine's; 0: no limit)");
+           "Give up when reading takes more memory, as in 2GB\n"
+           "(default: three quarters of the machine's; 0: none)");
 }
 
 void addInfo(CLI::App& app, Arguments& arguments) {
@@ -91,19 +90,20 @@ void addDump(CLI::App& app, Arguments& arguments) {
       ->required()
       ->type_name("");
   dump.add_option("--records", arguments.dump.records,
-                  "Only records A to B; one may be left out, and A alone is one record")
+                  "Only records A to B; one may be left out, and A\nalone is one record")
       ->type_name("A:B");
   dump.add_option("--format", arguments.dump.format,
-                  "table, csv or json; by default what OUT ends with, or a table")
+                  "table, csv or json (default: what OUT ends with, or\na table)")
       ->type_name("FORMAT")
       ->transform(CLI::IsMember({"table", "csv", "json"}));
   dump.add_option("--output", arguments.dump.output,
-                  "Write to a new file, which appears when it is complete")
+                  "Write to a new file, which appears when complete")
       ->type_name("OUT")
       ->check(requireName);
   dump.add_flag("--defuse-formulas", arguments.dump.defuseFormulas,
-                "In CSV, put an apostrophe before texts that a spreadsheet would\n"
-                "take for formulas: that begin with = + - @ tab or carriage return");
+                "In CSV, put an apostrophe before texts that begin\n"
+                "with = + - @ tab or carriage return, which a\n"
+                "spreadsheet would take for formulas");
   addLimits(dump, arguments);
 }
 
@@ -125,9 +125,9 @@ void addConvert(CLI::App& app, Arguments& arguments) {
       ->check(requireName);
   convert
       .add_option("--compression", options.compression,
-                  "Compress the file as a whole: none, rle, huff, ahuff or gzip, which may\n"
-                  "have a level from 1 to 9 (6 if left out); variables keep their own\n"
-                  "compression")
+                  "Compress the file as a whole: none, rle, huff, ahuff\n"
+                  "or gzip, which may have a level from 1 to 9\n"
+                  "(default: 6); variables keep their own compression")
       ->type_name("TYPE[:LEVEL]");
   convert.add_option("--majority", options.majority, "row or column")
       ->type_name("MAJORITY")
@@ -136,14 +136,14 @@ void addConvert(CLI::App& app, Arguments& arguments) {
       ->type_name("CHECKSUM")
       ->transform(CLI::IsMember({"md5", "none"}));
   convert.add_flag("--skip-unsupported", options.skipUnsupported,
-                   "Leave out what the module does not support, and list it");
+                   "Leave out what is not supported, and list it");
   addLimits(convert, arguments);
 }
 
 void addCall(CLI::App& app, Arguments& arguments) {
   CLI::App& call = addCommand(app, kCallHelp);
   call.add_option("--file", arguments.call.file,
-                  "Open this file, pass it as the first argument, and close it afterwards")
+                  "Open this file, pass it as the first argument, and\nclose it afterwards")
       ->type_name("FILE");
   call.prefix_command();  // what follows may begin with a minus sign
   call.callback([&call, &arguments] { arguments.call.words = call.remaining(); });
@@ -152,9 +152,9 @@ void addCall(CLI::App& app, Arguments& arguments) {
 void addSession(CLI::App& app, Arguments& arguments) {
   CLI::App& session = addCommand(app, kSessionHelp);
   addBytes(session, "--max-array-bytes", arguments.session.arrayBytes,
-           "The most bytes one array or scratch buffer may take (default: 4 GiB)");
+           "The most bytes one array or scratch buffer may take\n(default: 4 GiB)");
   addBytes(session, "--max-line-bytes", arguments.session.lineBytes,
-           "The most bytes a request line may have (default: 256 MiB)");
+           "The most bytes of a request line (default: 256 MiB)");
 }
 
 }  // namespace
@@ -162,8 +162,7 @@ void addSession(CLI::App& app, Arguments& arguments) {
 std::unique_ptr<CLI::App> makeParser(Arguments& arguments) {
   auto app = std::make_unique<CLI::App>("", "ambrix");
   describe(*app, kToolHelp, std::string("ambrix ") + kToolHelp.synopsis);
-  app->add_flag("--version", arguments.version,
-                "Print the versions of ambrix and of the CDF library and exit");
+  app->add_flag("--version", arguments.version, "Print the versions of ambrix and the CDF library");
   app->add_flag("--man", arguments.manual)->group("");
   addInfo(*app, arguments);
   addDump(*app, arguments);

@@ -12,6 +12,7 @@
 #include "tool/failure.h"
 #include "tool/open_failure.h"
 #include "tool/output_file.h"
+#include "tool/scarcity.h"
 #include "tool/supervision.h"
 #include "tool/warnings.h"
 
@@ -42,11 +43,21 @@ void readNamed(const std::string& file, const std::function<void()>& read) try {
                   "there is not enough memory; --memory-limit may allow more");
 }
 
+/// A worker that crashed for want of something says nothing of its file.
+void requirePlenty(const WorkerEnd& end, const std::string& file) {
+  Verdict told;
+  takeFindings(end.told, told);
+  if (end.kind == WorkerEnd::Kind::kDone || told.unread.empty()) return;
+  const Problem& want = told.unread.front();
+  throw FileError(file, want.identifier, want.message);
+}
+
 /// Reads the file in a worker, which writes to the output as this process would.
 int readInWorker(const Context& context, const std::string& file,
                  const std::function<void(Module&)>& read) {
   const Limits& limits = context.arguments.limits;
   const auto work = [&] {
+    tellScarcityInCrashes();
     Module module;
     module.setWarningHandler(printWarning);
     setByteLimit(kSessionArrayBytes);
@@ -55,6 +66,7 @@ int readInWorker(const Context& context, const std::string& file,
     return EXIT_SUCCESS;
   };
   const WorkerEnd end = supervise(limits, [&] { return exitStatusOf(context.parser, work); });
+  requirePlenty(end, file);
   return statusOf(end, limits, file);
 }
 

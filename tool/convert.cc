@@ -1,7 +1,11 @@
 #include "tool/convert.h"
 
+#include <fmt/format.h>
+
+#include <cstdint>
 #include <cstdio>
 #include <filesystem>
+#include <system_error>
 
 #include "tool/attributes.h"
 #include "tool/failure.h"
@@ -52,34 +56,54 @@ std::string counted(std::size_t count, const char* thing) {
   return std::to_string(count) + ' ' + thing + (count == 1 ? "" : "s");
 }
 
-/// Tells on one line what of the input the module cannot carry over as it is.
-void reportChanges(const Conversion& conversion) {
-  std::string text;
-  const auto header = readFileHeader(fileOf(conversion.options.input));
-  if (header && header->rVariables > 0) {
-    text = counted(header->rVariables, "rVariable") +
-           " became zVariables, without dimensions that do not vary";
-  }
-  if (conversion.cutTexts > 0) {
-    text += (text.empty() ? "" : "; ") + counted(conversion.cutTexts, "text") +
-            " of attributes ended at a zero byte, and what followed is zeros now";
-  }
-  if (text.empty()) return;
+std::string describeVariables(const fs::path& input) {
+  const auto header = readFileHeader(input);
+  if (!header || header->rVariables == 0) return "";
+  return counted(header->rVariables, "rVariable") + " became " +
+         (header->rVariables == 1 ? "a zVariable" : "zVariables") +
+         ", without dimensions that do not vary";
+}
+
+std::string describeTexts(const Conversion& conversion) {
+  if (conversion.cutTexts == 0) return "";
+  return counted(conversion.cutTexts, "text") +
+         " of attributes ended at a zero byte, and what followed is zeros now";
+}
+
+/// Growth that nobody asked for: the library reserves room anew, which shows in small files.
+std::string describeGrowth(const Conversion& conversion, const fs::path& input,
+                           const fs::path& output) {
+  if (!conversion.options.compression.empty()) return "";
+  std::error_code error;
+  const std::uintmax_t before = fs::file_size(input, error);
+  const std::uintmax_t after = error ? 0 : fs::file_size(output, error);
+  if (error || conversion.input.text("getFormat") != "SINGLE_FILE") return "";
+  if (after / 3 * 2 <= before) return "";
+  return fmt::format("{} bytes became {}, with the room that the library reserves", before, after);
+}
+
+/// Tells on one line what of the input was not carried over as it is.
+void reportChanges(const Conversion& conversion, const fs::path& output) {
+  const fs::path input = fileOf(conversion.options.input);
+  std::vector<std::string> changes = {describeVariables(input), describeTexts(conversion),
+                                      describeGrowth(conversion, input, output)};
+  std::erase(changes, "");
+  if (changes.empty()) return;
   std::fprintf(stderr, "ambrix: changed in %s: %s\n", printable(conversion.options.output).c_str(),
-               text.c_str());
+               fmt::format("{}", fmt::join(changes, "; ")).c_str());
 }
 
 void writeCopy(Module& module, const ConvertOptions& options, CdfFile& input,
                const std::string& name) {
   CdfFile output = CdfFile::create(module, name, options.output);
-  Conversion conversion{module, options, input, output, false, {}, 0};
+  Conversion conversion{module, options, input, output, findHiddenTexts(fileOf(options.input))};
   copySettings(conversion);
   createVariables(conversion);
   copyAttributes(conversion);
   copyData(conversion);
   const Pause pause;  // compressing a large file takes its time
   output.close();
-  reportChanges(conversion);
+  reportChanges(conversion, name);
 }
 
 }  // namespace

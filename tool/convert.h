@@ -1,11 +1,15 @@
 // `ambrix convert`: a copy of a file with other settings.
 #pragma once
 
+#include <cstddef>
 #include <filesystem>
+#include <optional>
+#include <set>
 #include <string>
 #include <vector>
 
 #include "tool/cdf_file.h"
+#include "tool/hidden_texts.h"
 #include "tool/variable.h"
 
 namespace ambrix::tool {
@@ -37,9 +41,10 @@ struct Conversion {
   const ConvertOptions& options;
   CdfFile& input;
   CdfFile& output;
-  bool transposes = false;        // the files differ in majority
-  std::vector<Copied> variables;  // those that are copied
-  std::size_t cutTexts = 0;       // texts of attributes that the module has ended at a zero byte
+  std::optional<std::set<EntryNumbers>> hiddenTexts;  // of the input, if they can be known
+  bool transposes = false;                            // the files differ in majority
+  std::vector<Copied> variables = {};                 // those that are copied
+  std::size_t cutTexts = 0;  // texts of attributes that have lost what was behind a zero byte
 };
 
 /// What the module cannot carry over, one line each.

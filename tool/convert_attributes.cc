@@ -1,5 +1,6 @@
 // Attributes and their entries.
 #include <algorithm>
+#include <cstdint>
 #include <utility>
 
 #include "tool/attributes.h"
@@ -33,12 +34,20 @@ Array completeText(Array value, std::size_t elements) {
   return Array::text(units);
 }
 
+/// Whether anything but zeros was behind the end of a text that came back short.
+bool hasLostText(const Conversion& conversion, double attribute, double entry) {
+  if (!conversion.hiddenTexts) return true;  // it may have
+  return conversion.hiddenTexts->contains(
+      {static_cast<std::uint64_t>(attribute), static_cast<std::uint64_t>(entry)});
+}
+
 void copyEntry(Conversion& conversion, const Attribute& attribute, const EntryHeader& entry) {
   const auto elements = static_cast<std::size_t>(entry.elements);
   Array given = readEntry(conversion.input, attribute, entry.number);
   const std::size_t length = given.elementCount();
   const Array value = completeText(std::move(given), elements);
-  if (value.elementCount() > length) ++conversion.cutTexts;
+  const bool isShort = value.elementCount() > length;
+  if (isShort && hasLostText(conversion, attribute.number, entry.number)) ++conversion.cutTexts;
   const Array number = Array::scalar(attribute.number);
   const Array target = Array::scalar(targetEntry(conversion, attribute, entry.number));
   const Array datatype = Array::scalar(datatypeCode(conversion.module, entry.datatype));

@@ -4,47 +4,18 @@
 #include <fstream>
 #include <string_view>
 
+#include "tool/record_fields.h"
+
 namespace ambrix::tool {
 namespace {
 
 using Kind = FileHeader::Kind;
 
 constexpr std::size_t kMagicBytes = 8;
-
-/// Numbers of a record, one after the other; beyond its end they are 0.
-class Fields {
- public:
-  explicit Fields(std::string_view bytes) : bytes_(bytes) {}
-
-  std::uint64_t next(std::size_t width) {
-    std::uint64_t number = 0;
-    for (; width > 0; --width)
-      number = number << 8U | (place_ < bytes_.size() ? octet(place_++) : 0U);
-    return number;
-  }
-  std::uint32_t word() { return static_cast<std::uint32_t>(next(4)); }
-  void skip(std::size_t bytes) { place_ += bytes; }
-
- private:
-  [[nodiscard]] std::uint64_t octet(std::size_t i) const {
-    return static_cast<unsigned char>(bytes_[i]);
-  }
-
-  std::string_view bytes_;
-  std::size_t place_ = 0;
-};
-
-std::string readBytes(std::istream& file, std::uint64_t offset) {
-  std::string bytes(128, '\0');
-  file.clear();
-  file.seekg(static_cast<std::streamoff>(offset));
-  file.read(bytes.data(), static_cast<std::streamsize>(bytes.size()));
-  bytes.resize(static_cast<std::size_t>(file.gcount()));
-  return bytes;
-}
+constexpr std::size_t kHeaderBytes = 128;
 
 Kind kindOf(std::string_view bytes) {
-  Fields fields(bytes);
+  RecordFields fields{std::string(bytes)};
   const std::uint32_t first = fields.word();
   const std::uint32_t second = fields.word();
   constexpr std::uint32_t kCompressed = 0xCCCC0001;
@@ -62,18 +33,19 @@ Kind kindOf(std::string_view bytes) {
 
 /// The record that a file begins with, and the one that it leads to. Offsets and sizes have eight
 /// bytes from version 3 on, and four before.
-void readRecords(std::istream& file, std::string_view begin, FileHeader& header) {
-  const std::size_t wide = Fields(begin).word() == 0xCDF30001 ? 8 : 4;
-  Fields first(begin);
+void readRecords(std::istream& file, const std::string& begin, FileHeader& header) {
+  const std::size_t wide = RecordFields(begin).word() == 0xCDF30001 ? 8 : 4;
+  RecordFields first(begin);
   first.skip(kMagicBytes + wide + 4);  // the magic numbers, then the record's size and type
   const std::uint64_t second = first.next(wide);
+  header.offsetBytes = wide;
   header.version[0] = first.word();
   header.version[1] = first.word();
   first.skip(16);
   header.version[2] = first.word();
-  const std::string bytes = readBytes(file, second);
-  Fields global(bytes);
-  global.skip(wide + 4 + 3 * wide);
+  RecordFields global(readBytes(file, second, kHeaderBytes));
+  global.skip(wide + 4 + 2 * wide);
+  header.firstAttribute = global.next(wide);
   header.end = global.next(wide);
   header.rVariables = global.word();
   global.skip(16 + wide + 4);
@@ -84,7 +56,7 @@ void readRecords(std::istream& file, std::string_view begin, FileHeader& header)
 
 std::optional<FileHeader> readFileHeader(const std::string& path) {
   std::ifstream file(path, std::ios::binary);
-  const std::string begin = readBytes(file, 0);
+  const std::string begin = readBytes(file, 0, kHeaderBytes);
   if (begin.size() < kMagicBytes) return std::nullopt;
   FileHeader header;
   header.kind = kindOf(begin);

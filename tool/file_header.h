@@ -3,6 +3,7 @@
 #pragma once
 
 #include <array>
+#include <cstddef>
 #include <cstdint>
 #include <optional>
 #include <string>
@@ -15,6 +16,8 @@ struct FileHeader {
   // Of files that are not compressed as a whole.
   std::array<std::uint32_t, 3> version{};
   std::uint64_t end = 0;              // where the file should end
+  std::size_t offsetBytes = 0;        // of the numbers that say where a record is
+  std::uint64_t firstAttribute = 0;   // where its record is, or 0
   std::uint32_t rVariables = 0;       // how many there are
   std::uint32_t leapSecondTable = 0;  // YYYYMMDD of the last leap second known to its writer, or 0
 };

@@ -86,7 +86,7 @@ std::string factsAsJson(const FileFacts& facts, const InfoOptions& options) {
   if (options.attributes) object["attributes"] = OrderedJson::array();
   for (const AttributeFacts& attribute : facts.attributes)
     object["attributes"].push_back(attributeAsJson(attribute));
-  return object.dump(2) + '\n';
+  return object.dump(2, ' ', true) + '\n';  // in ASCII, lest a terminal obey it
 }
 
 }  // namespace ambrix::tool

@@ -2,6 +2,7 @@
 
 #include <fmt/format.h>
 
+#include <boost/algorithm/string/replace.hpp>
 #include <string_view>
 
 #include "ambrix_version.h"
@@ -27,6 +28,11 @@ std::string escaped(std::string_view text) {
   return result;
 }
 
+/// Details, in which the points of a list begin lines.
+std::string details(const HelpText& help) {
+  return boost::replace_all_copy(escaped(help.details), "\n\\- ", "\n.br\n\\- ");
+}
+
 std::string examples(const HelpText& help) {
   return fmt::format(".PP\n.nf\n.RS\n{}.RE\n.fi\n", escaped(help.examples));
 }
@@ -48,8 +54,7 @@ std::string arguments(const CLI::App& app) {
 std::string commandSection(const CLI::App& parser, const HelpText& help) {
   const CLI::App* const command = parser.get_subcommand(help.name);
   return fmt::format(".SS ambrix {} {}\n{}.\n.PP\n{}{}{}", help.name, escaped(help.synopsis),
-                     escaped(help.brief), escaped(help.details), arguments(*command),
-                     examples(help));
+                     escaped(help.brief), details(help), arguments(*command), examples(help));
 }
 
 }  // namespace

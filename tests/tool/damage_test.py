@@ -135,13 +135,16 @@ class UndecidedTest(DamageCase):
         super().setUp()
         write_example(self.session(), "good", "ROW_MAJOR")
 
-    def assert_never_wrong(self, kind, limits):
+    def checks_within(self, kind, limits):
+        for limit in limits:
+            yield limit, subprocess.run(
+                [TOOL, "check", "--json", "good.cdf"], cwd=self.folder, capture_output=True,
+                preexec_fn=lambda: resource.setrlimit(kind, (limit, limit)))
+
+    def assert_never_wrong(self, checks):
         """With less and less of something a sound file becomes undecided, never anything else."""
         statuses = set()
-        for limit in limits:
-            done = subprocess.run([TOOL, "check", "--json", "good.cdf"], cwd=self.folder,
-                                  capture_output=True, preexec_fn=lambda: resource.setrlimit(
-                                      kind, (limit, limit)))
+        for limit, done in checks:
             if not done.stdout:  # the tool itself could not be loaded
                 continue
             (verdict,) = json.loads(done.stdout)
@@ -152,12 +155,24 @@ class UndecidedTest(DamageCase):
         self.assertEqual(statuses, {0, 3})
 
     def test_too_few_descriptors(self):
-        self.assert_never_wrong(resource.RLIMIT_NOFILE, range(3, 12))
+        self.assert_never_wrong(self.checks_within(resource.RLIMIT_NOFILE, range(3, 12)))
 
     def test_too_little_memory(self):
+        self.skip_with_sanitizer()
+        self.assert_never_wrong(
+            self.checks_within(resource.RLIMIT_AS, range(8 << 20, 34 << 20, 1 << 20)))
+
+    def skip_with_sanitizer(self):
         if "libasan" in subprocess.run(["ldd", TOOL], capture_output=True, text=True).stdout:
             self.skipTest("the sanitizer needs more memory than there would be")
-        self.assert_never_wrong(resource.RLIMIT_AS, range(8 << 20, 34 << 20, 1 << 20))
+
+    def test_a_worker_with_too_little_memory(self):
+        self.skip_with_sanitizer()
+        limits = (1, *range(4 << 20, 48 << 20, 1 << 20), 256 << 20)
+        self.assert_never_wrong(
+            (limit, subprocess.run([TOOL, "check", "--json", "good.cdf", "--memory-limit",
+                                    str(limit)], cwd=self.folder, capture_output=True))
+            for limit in limits)
 
     def write_axis(self):
         session = self.session()

@@ -39,7 +39,7 @@ class HelpTest(ToolCase):
     def test_help_fits_a_terminal(self):
         for command in ("", *COMMANDS):
             for line in self.output(*command.split(), "--help").splitlines():
-                self.assertLessEqual(len(line), 100, line)
+                self.assertLessEqual(len(line), 80, line)
 
     def test_library_settings_of_the_environment_do_not_count(self):
         environment = dict(os.environ, CDF_VALIDATE="no")

@@ -8,6 +8,8 @@ import unittest
 from tool.example_file import DATATYPES, write_example
 from tool.support import TOOL, ToolCase, sample
 
+NOBODY = 65534
+
 
 class InfoTest(ToolCase):
     def setUp(self):
@@ -104,7 +106,6 @@ class InfoTest(ToolCase):
         os.mkdir(self.path("folder"))
         with open(self.path("example.cdf"), "rb") as file:
             sound = file.read()
-        leap = int.from_bytes(sound[20:28], "big") + 76  # in the record of the file's own facts
         for name, content, cause in (
                 ("missing", None, "there is no such file"), ("folder", None, "it is a folder"),
                 ("pipe", None, "it is a device or a pipe"), ("empty", b"", "it is empty"),
@@ -125,9 +126,60 @@ class InfoTest(ToolCase):
                             ("call", "--file", name, "inquire")):
                 message = self.assert_fails("TOLVEX:ambrix:cdflib:fileOpenError", *command)
                 self.assertTrue(message.startswith(f"{shown}: {cause}"), message)
-        self.assertEqual(sound[leap:leap + 4], (20170101).to_bytes(4, "big"))
         self.assert_misused("info", "example.cdf", "more")
         self.assert_misused("info", "example.cdf", "--nonsense")
+
+    def test_times_by_another_table_of_leap_seconds(self):
+        with open(self.path("example.cdf"), "rb") as file:
+            content = bytearray(file.read())
+        leap = int.from_bytes(content[20:28], "big") + 76  # in the record of the file's own facts
+        datatype = content.index(b"CDF_EPOCH\0") - 84 + 20  # in the variable's, before its name
+        self.assertEqual(content[leap:leap + 4], (20170101).to_bytes(4, "big"))
+        self.assertEqual(content[datatype:datatype + 4], (31).to_bytes(4, "big"))
+        content[datatype:datatype + 4] = (33).to_bytes(4, "big")  # CDF_TIME_TT2000
+        content[leap:leap + 4] = (20991231).to_bytes(4, "big")
+        with open(self.path("times.cdf"), "wb") as file:
+            file.write(content)
+        message = self.assert_fails("TOLVEX:ambrix:cdflib:fileOpenError", "info", "times.cdf")
+        self.assertEqual(message, "times.cdf: it has times by a table of leap seconds of 20991231, "
+                         "and that of the CDF library is outdated; name a newer one in the "
+                         "environment variable CDF_LEAPSECONDSTABLE")
+
+    def test_files_that_may_not_be_read(self):
+        os.chmod(self.path("example.cdf"), 0)
+        for folder in (self.folder, os.environ["TMPDIR"]):
+            os.chmod(folder, 0o777)
+        options = {}
+        if os.geteuid() == 0:
+            options = {"user": NOBODY, "group": NOBODY, "extra_groups": []}
+            try:
+                self.run_tool("--version", **options)
+            except (PermissionError, AssertionError):
+                self.skipTest("only this user may run the tool here")
+        for command in (("info", "example.cdf"), ("dump", "example.cdf", "v"),
+                        ("convert", "example.cdf", "out.cdf"),
+                        ("call", "--file", "example.cdf", "inquire")):
+            done = self.run_tool(*command, status=1, **options)
+            self.assertEqual(done.stderr.decode(),
+                             "ambrix: TOLVEX:ambrix:cdflib:fileOpenError: example.cdf: "
+                             "it cannot be read: Permission denied\n")
+        done = self.run_tool("check", "example.cdf", status=3, **options)
+        self.assertIn(b"example.cdf: undecided\n    ambrix:unreadable: Permission denied\n",
+                      done.stdout)
+
+    def test_json_is_ascii(self):
+        session = self.session()
+        (file,) = session.call("open", "example.cdf")
+        text = "\u009b\u202e\x1b\x7f"
+        session.call("putAttrEntry", file, 1, 0, 51,
+                     "".join(chr(byte) for byte in text.encode("utf-8")))
+        session.call("close", file)
+        printed = self.output("info", "--attributes", "--json", "example.cdf")
+        self.assertTrue(printed.isascii() and "\x7f" not in printed)
+        self.assertEqual(json.loads(printed)["attributes"][1]["entries"][0]["values"], [text])
+        printed = self.run_tool("check", "--json", "\u202e", status=1).stdout.decode()
+        self.assertTrue(printed.isascii())
+        self.assertEqual(json.loads(printed)[0]["file"], "\u202e")
 
     def test_a_reader_that_goes_away_is_no_failure(self):
         done = subprocess.run(f"'{TOOL}' info --attributes example.cdf | head -n 1; "
