@@ -36,6 +36,11 @@ class WaitingRecordsTest : public ScriptedTest {
         "zVAR_RECNUMBER_ " + std::to_string(record) + " | zVAR_DIMINDICES_ [0] | GET_ zVAR_DATA_",
         kVirtualRecord);
   }
+  const std::pair<std::string, Arguments> writers[4] = {
+      {"putVarData", {file(), 3, 9, 0, 1}},
+      {"putVarRecordData", {file(), 3, 9, elements<double>(2)}},
+      {"hyperPutVarData", {file(), 3, 9, 1, 1, 0, 2, 1, elements<double>(2)}},
+      {"setVarInitialRecs", {file(), 3, 9}}};
   const std::pair<std::string, Arguments> record{"getVarRecordData", {file(), 3, 4}};
   const std::pair<std::string, Arguments> wholeSlab{"hyperGetVarData",
                                                     {file(), 3, 4, 1, 1, 0, 2, 1}};
@@ -153,11 +158,6 @@ TEST_F(WaitingRecordsTest, NothingIsAskedOfFilesThatWereOnlyRead) {
 
 TEST_F(WaitingRecordsTest, WhatTheLibraryRefusedDoesNotCountAsWritten) {
   describe({.sizes = {2}});
-  const std::pair<std::string, Arguments> writers[] = {
-      {"putVarData", {file(), 3, 9, 0, 1}},
-      {"putVarRecordData", {file(), 3, 9, elements<double>(2)}},
-      {"hyperPutVarData", {file(), 3, 9, 1, 1, 0, 2, 1, elements<double>(2)}},
-      {"setVarInitialRecs", {file(), 3, 9}}};
   fake.endWith("PUT_", -2070);
   fake.endWith("CDFputVarRecordData", -2070);
   for (const auto& [command, arguments] : writers)
@@ -168,11 +168,6 @@ TEST_F(WaitingRecordsTest, WhatTheLibraryRefusedDoesNotCountAsWritten) {
 }
 
 TEST_F(WaitingRecordsTest, WhatItAcceptedDoes) {
-  const std::pair<std::string, Arguments> writers[] = {
-      {"putVarData", {file(), 3, 9, 0, 1}},
-      {"putVarRecordData", {file(), 3, 9, elements<double>(2)}},
-      {"hyperPutVarData", {file(), 3, 9, 1, 1, 0, 2, 1, elements<double>(2)}},
-      {"setVarInitialRecs", {file(), 3, 9}}};
   for (const auto& [command, arguments] : writers) {
     call("open", {"any.cdf"});  // registers the same file anew
     describe({.sizes = {2}});
@@ -185,11 +180,6 @@ TEST_F(WaitingRecordsTest, WhatItAcceptedDoes) {
 
 TEST_F(WaitingRecordsTest, SoDoesWhatItDidWithAWarning) {
   constexpr long kNegativeZero = -1004;
-  const std::pair<std::string, Arguments> writers[] = {
-      {"putVarData", {file(), 3, 9, 0, 1}},
-      {"putVarRecordData", {file(), 3, 9, elements<double>(2)}},
-      {"hyperPutVarData", {file(), 3, 9, 1, 1, 0, 2, 1, elements<double>(2)}},
-      {"setVarInitialRecs", {file(), 3, 9}}};
   for (const auto& [command, arguments] : writers) {
     call("open", {"any.cdf"});
     describe({.sizes = {2}});
