@@ -1,5 +1,7 @@
 #include "gateway/entry/command_table.h"
 
+#include <algorithm>
+#include <array>
 #include <iterator>
 #include <string>
 
@@ -123,6 +125,13 @@ constexpr CommandEntry CommandTable[] = {
 // clang-format on
 static_assert(std::size(CommandTable) == 91);
 
+/// The names with their lengths, so that most rows differ at a glance.
+constexpr auto kNames = [] {
+  std::array<std::string_view, std::size(CommandTable)> names;
+  std::ranges::transform(CommandTable, names.begin(), &CommandEntry::name);
+  return names;
+}();
+
 }  // namespace
 
 std::span<const CommandEntry> commandTable() {
@@ -130,14 +139,13 @@ std::span<const CommandEntry> commandTable() {
 }
 
 const CommandEntry& lookupCommand(std::string_view name, std::int32_t argumentCount) {
-  for (const CommandEntry& entry : CommandTable) {
-    if (name != entry.name) continue;
-    const bool suits =
-        argumentCount >= entry.minimumArguments && argumentCount <= entry.maximumArguments;
-    if (!suits) raiseError(validate::wrongNumberOfInputs());
-    return entry;
-  }
-  raiseError(cdflib::invalidOperation(std::string(name)));
+  const auto found = std::ranges::find(kNames, name);
+  if (found == kNames.end()) raiseError(cdflib::invalidOperation(std::string(name)));
+  const CommandEntry& entry = CommandTable[found - kNames.begin()];
+  const bool suits =
+      argumentCount >= entry.minimumArguments && argumentCount <= entry.maximumArguments;
+  if (!suits) raiseError(validate::wrongNumberOfInputs());
+  return entry;
 }
 
 }  // namespace TOLVEX::ambrix
