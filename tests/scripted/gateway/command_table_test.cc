@@ -63,7 +63,7 @@ TEST_F(CommandTableTest, RowsIdsNamesAndCountsAreAsDocumentedInOrder) {
   const auto table = TOLVEX::ambrix::commandTable();
   ASSERT_EQ(table.size(), std::size(kRows));
   for (std::size_t i = 0; i < table.size(); ++i) {
-    EXPECT_EQ(table[i].name, kRows[i].name);
+    EXPECT_STREQ(table[i].name, kRows[i].name);
     EXPECT_EQ(table[i].id, kRows[i].id) << kRows[i].name;
     EXPECT_EQ(table[i].minimumArguments, kRows[i].minimum) << kRows[i].name;
     EXPECT_EQ(table[i].maximumArguments, kRows[i].maximum) << kRows[i].name;
