@@ -32,7 +32,13 @@ class ChangesTest(ConvertCase):
             file.seek(0)
             file.write(content)
 
+    def skip_where_texts_are_blanked(self):
+        version = [part.value for part in self.session().call("getLibraryVersion")]
+        if version < [3, 9]:
+            self.skipTest("the library reads blanks for a zero byte and what follows it")
+
     def test_texts_that_lose_something(self):
+        self.skip_where_texts_are_blanked()
         for version2 in (False, True):
             self.write_texts("ab\0cd", "whole", "zeros\0\0\0", version2=version2)
             self.assertEqual(self.changes("text.cdf", "out.cdf"), [self.CUT])
@@ -50,6 +56,7 @@ class ChangesTest(ConvertCase):
             self.clear()
 
     def test_texts_of_compressed_files_may_have_lost_something(self):
+        self.skip_where_texts_are_blanked()
         self.write_texts("ab", "whole")
         self.assertEqual(self.changes("text.cdf", "small.cdf", "--compression", "gzip"), [])
         self.assertEqual(self.changes("small.cdf", "out.cdf"), [])

@@ -30,6 +30,10 @@ class ToolCase(unittest.TestCase):
         environment.start()
         self.addCleanup(environment.stop)
 
+    def skip_with_sanitizer(self):
+        if "libasan" in subprocess.run(["ldd", TOOL], capture_output=True, text=True).stdout:
+            self.skipTest("the sanitizer needs memory and descriptors of its own")
+
     def new_folder(self):
         folder = tempfile.TemporaryDirectory(ignore_cleanup_errors=True)
         self.addCleanup(folder.cleanup)
