@@ -20,6 +20,12 @@ def sample(name):
     return path
 
 
+def has_sanitizer():
+    """Whether the tool is built with the address sanitizer, which keeps memory that was freed."""
+    linked = subprocess.run(["ldd", TOOL], capture_output=True, text=True, check=True).stdout
+    return "libasan" in linked
+
+
 class ToolCase(unittest.TestCase):
     """Runs the tool in a folder of its own."""
 
@@ -31,7 +37,7 @@ class ToolCase(unittest.TestCase):
         self.addCleanup(environment.stop)
 
     def skip_with_sanitizer(self):
-        if "libasan" in subprocess.run(["ldd", TOOL], capture_output=True, text=True).stdout:
+        if has_sanitizer():
             self.skipTest("the sanitizer needs memory and descriptors of its own")
 
     def new_folder(self):
