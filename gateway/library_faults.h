@@ -27,8 +27,10 @@ struct LibraryFaults {
 };
 
 constexpr LibraryFaults faultsOf(const LibraryVersion& library) {
-  return {.leavesUnwrittenRecords =
-              library<kNewestTried, .freesSelectedAttributeTwice = library> kOldestTried};
+  LibraryFaults faults;
+  faults.leavesUnwrittenRecords = library < kNewestTried;
+  faults.freesSelectedAttributeTwice = library > kOldestTried;
+  return faults;
 }
 
 /// Those of the running library, which is asked for its version once. Tests change them.

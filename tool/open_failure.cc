@@ -14,6 +14,9 @@
 namespace ambrix::tool {
 namespace {
 
+constexpr const char* kDamagedOrUnknown =
+    "it is damaged, or of a kind that this version of the CDF library does not take";
+
 namespace fs = std::filesystem;
 
 constexpr std::size_t kLongestPath = 512;  // that the library takes
@@ -58,7 +61,7 @@ std::string explainCdf(Module& module, const FileHeader& header, std::uint64_t b
   }
   const std::uint32_t table = header.leapSecondTable;
   if (table != 0 && table != kLeapSecondTable) return explainLeapSeconds(table);
-  return "it is damaged, or of a kind that this version of the CDF library does not take";
+  return kDamagedOrUnknown;
 }
 
 std::string explainContent(Module& module, const FileHeader& header, std::uint64_t bytes) {
@@ -67,7 +70,7 @@ std::string explainContent(Module& module, const FileHeader& header, std::uint64
     case Kind::kCdf:
       return explainCdf(module, header, bytes);
     case Kind::kCompressedCdf:
-      return "it is damaged, or of a kind that this version of the CDF library does not take";
+      return kDamagedOrUnknown;
     case Kind::kCdfOfVersion1:
       return "it was written by version 1 of the CDF library, whose files cannot be read any more";
     case Kind::kLaterCdf:

@@ -1,7 +1,7 @@
 // Guard: records that do not vary and were never written, in files of the format of version 2.
 //
 // Fault, in 3.6.3: reading such a record, the library fills the result with whatever lies in memory
-// before it. Elsewhere it gives pad values, which take their place here.
+// before it. In files of the newer format it gives pad values, which take their place here.
 #pragma once
 
 #include "variables/hyperslab.h"
