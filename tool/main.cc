@@ -10,11 +10,11 @@
 
 #include "ambrix/embedded.h"
 #include "ambrix_version.h"
-#include "tool/commands.h"
-#include "tool/exit_status.h"
-#include "tool/failure.h"
-#include "tool/man_page.h"
-#include "tool/text.h"
+#include "tool/content/failure.h"
+#include "tool/output/text.h"
+#include "tool/program/commands.h"
+#include "tool/program/exit_status.h"
+#include "tool/program/man_page.h"
 
 namespace ambrix::tool {
 namespace {

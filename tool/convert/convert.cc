@@ -1,0 +1,143 @@
+#include "tool/convert/convert.h"
+
+#include <fmt/format.h>
+
+#include <cstdint>
+#include <cstdio>
+#include <filesystem>
+#include <system_error>
+
+#include "tool/content/attributes.h"
+#include "tool/content/failure.h"
+#include "tool/format/file_header.h"
+#include "tool/format/open_failure.h"
+#include "tool/output/output_file.h"
+#include "tool/output/text.h"
+#include "tool/supervision/steps.h"
+
+namespace ambrix::tool {
+namespace {
+
+namespace fs = std::filesystem;
+
+std::vector<std::string> unsupportedEntries(CdfFile& input, const Attribute& attribute) {
+  std::vector<std::string> lines;
+  forEachEntry(input, attribute, [&](const EntryHeader& entry) {
+    if (entry.supported) return;
+    lines.push_back("entry " + std::to_string(static_cast<long>(entry.number)) +
+                    " of attribute \"" + printable(attribute.name) + "\" (" + entry.datatype + ")");
+  });
+  return lines;
+}
+
+void reportUnsupported(CdfFile& input, bool skip) {
+  const std::vector<std::string> lines = listUnsupported(input);
+  for (const std::string& line : lines)
+    std::fprintf(stderr, "ambrix: %s: %s\n", skip ? "skipped" : "not supported", line.c_str());
+  if (lines.empty() || skip) return;
+  throw ToolError("unsupportedContent",
+                  "not everything can be carried over; nothing was written"
+                  " (--skip-unsupported leaves it out)");
+}
+
+/// A folder or a device is no name for a file, and neither is one with an extension behind it.
+void requireFileName(const fs::path& wanted) {
+  std::error_code error;
+  const fs::file_status status = fs::status(wanted, error);
+  if (wanted.filename().empty() || fs::is_directory(status)) {
+    throw ToolError("noFileName", wanted.string() + " is a folder; name the file to write in it");
+  }
+  if (fs::exists(status) && !fs::is_regular_file(status)) {
+    throw ToolError("noFileName", wanted.string() + " is a device or a pipe, and no file");
+  }
+}
+
+std::string counted(std::size_t count, const char* thing) {
+  return std::to_string(count) + ' ' + thing + (count == 1 ? "" : "s");
+}
+
+std::string describeVariables(const fs::path& input) {
+  const auto header = readFileHeader(input);
+  if (!header || header->rVariables == 0) return "";
+  return counted(header->rVariables, "rVariable") + " became " +
+         (header->rVariables == 1 ? "a zVariable" : "zVariables") +
+         ", without dimensions that do not vary";
+}
+
+std::string describeTexts(const Conversion& conversion) {
+  if (conversion.cutTexts == 0) return "";
+  return counted(conversion.cutTexts, "text") +
+         " of attributes ended at a zero byte, and what followed is zeros now";
+}
+
+/// Growth that nobody asked for: the library reserves room anew, which shows in small files.
+std::string describeGrowth(const Conversion& conversion, const fs::path& input,
+                           const fs::path& output) {
+  if (!conversion.options.compression.empty()) return "";
+  std::error_code error;
+  const std::uintmax_t before = fs::file_size(input, error);
+  const std::uintmax_t after = error ? 0 : fs::file_size(output, error);
+  if (error || conversion.input.text("getFormat") != "SINGLE_FILE") return "";
+  if (after / 3 * 2 <= before) return "";
+  return fmt::format("{} bytes became {}, with the room that the library reserves", before, after);
+}
+
+/// Tells on one line what of the input was not carried over as it is.
+void reportChanges(const Conversion& conversion, const fs::path& output) {
+  const fs::path input = fileOf(conversion.options.input);
+  std::vector<std::string> changes = {describeVariables(input), describeTexts(conversion),
+                                      describeGrowth(conversion, input, output)};
+  std::erase(changes, "");
+  if (changes.empty()) return;
+  std::fprintf(stderr, "ambrix: changed in %s: %s\n", printable(conversion.options.output).c_str(),
+               fmt::format("{}", fmt::join(changes, "; ")).c_str());
+}
+
+void writeCopy(Module& module, const ConvertOptions& options, CdfFile& input,
+               const std::string& name) {
+  CdfFile output = CdfFile::create(module, name, options.output);
+  Conversion conversion{module, options, input, output, findHiddenTexts(fileOf(options.input))};
+  copySettings(conversion);
+  createVariables(conversion);
+  copyAttributes(conversion);
+  copyData(conversion);
+  const Pause pause;  // compressing a large file takes its time
+  output.close();
+  reportChanges(conversion, name);
+}
+
+}  // namespace
+
+fs::path chooseOutput(const std::string& wanted) {
+  requireFileName(wanted);
+  const fs::path path = withCdfExtension(wanted);
+  if (path != wanted) {
+    std::fprintf(stderr, "ambrix: the file will be %s\n", printable(path.string()).c_str());
+  }
+  return path;
+}
+
+std::vector<std::string> listUnsupported(CdfFile& input) {
+  std::vector<std::string> lines;
+  const double variables = countVariables(input);
+  for (double number = 0; number < variables; ++number) {
+    const Variable variable = inquireVariable(input, number);
+    if (variable.supported) continue;
+    lines.push_back("variable \"" + printable(variable.name) + "\" (" + variable.datatype + ")");
+  }
+  const double attributes = countAttributes(input);
+  for (double number = 0; number < attributes; ++number) {
+    const auto more = unsupportedEntries(input, inquireAttribute(input, number));
+    lines.insert(lines.end(), more.begin(), more.end());
+  }
+  return lines;
+}
+
+void runConvert(Module& module, const ConvertOptions& options, const std::string& output) {
+  CdfFile input = CdfFile::open(module, options.input);
+  setReadOnly(input);
+  reportUnsupported(input, options.skipUnsupported);
+  writeCopy(module, options, input, output);
+}
+
+}  // namespace ambrix::tool
