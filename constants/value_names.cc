@@ -31,6 +31,14 @@ const ValueNameTable BackwardFileModeNames =
 const ValueNameTable SparseRecordsNames = map_list_of<std::int64_t, std::string>  //
     (0, "NO_SPARSERECORDS")(1, "PAD_SPARSERECORDS")(2, "PREV_SPARSERECORDS");
 
+const ValueNameTable ScopeNames =
+    map_list_of<std::int64_t, std::string>(1, "GLOBAL_SCOPE")(2, "VARIABLE_SCOPE");
+
+// There is no type 4.
+const ValueNameTable CompressionNames = map_list_of<std::int64_t, std::string>  //
+    (0, "NO_COMPRESSION")(1, "RLE_COMPRESSION")(2, "HUFF_COMPRESSION")          //
+    (3, "AHUFF_COMPRESSION")(5, "GZIP_COMPRESSION");
+
 const std::string& lookupValueName(const ValueNameTable& table, std::int64_t value,
                                    const char* kindName) {
   const auto found = table.find(value);

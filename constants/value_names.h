@@ -17,6 +17,8 @@ extern const ValueNameTable MajorityNames;
 extern const ValueNameTable ValidateModeNames;
 extern const ValueNameTable BackwardFileModeNames;
 extern const ValueNameTable SparseRecordsNames;
+extern const ValueNameTable ScopeNames;
+extern const ValueNameTable CompressionNames;
 
 /// The name of the value; raises `unrecognizedValue` with the value and `kindName` if it has none.
 const std::string& lookupValueName(const ValueNameTable& table, std::int64_t value,

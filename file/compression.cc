@@ -2,7 +2,10 @@
 
 #include <cdf.h>
 
+#include <string>
+
 #include "constants/checked_values.h"
+#include "constants/value_names.h"
 #include "gateway/arguments.h"
 #include "gateway/errors.h"
 #include "gateway/library.h"
@@ -19,30 +22,14 @@ struct Compression {
   long percentage = 0;
 };
 
-const char* typeName(long type) {
-  switch (type) {
-    case RLE_COMPRESSION:
-      return "RLE_COMPRESSION";
-    case HUFF_COMPRESSION:
-      return "HUFF_COMPRESSION";
-    case AHUFF_COMPRESSION:
-      return "AHUFF_COMPRESSION";
-    case GZIP_COMPRESSION:
-      return "GZIP_COMPRESSION";
-    default:
-      return "NO_COMPRESSION";
-  }
+const std::string& typeName(const Compression& compression) {
+  return lookupValueName(CompressionNames, compression.type, "COMPRESSION");
 }
 
-const char* shortTypeName(long type) {
-  switch (type) {
-    case RLE_COMPRESSION:
-      return "RLE";
-    case HUFF_COMPRESSION:
-      return "HUFF";
-    default:
-      return "AHUFF";
-  }
+/// "RLE", "HUFF" or "AHUFF".
+std::string shortTypeName(const Compression& compression) {
+  const std::string& name = typeName(compression);
+  return name.substr(0, name.find('_'));
 }
 
 qvArray* emptyDouble() {
@@ -69,7 +56,7 @@ qvArray* variableParameter(const Compression& compression) {
   if (compression.type == NO_COMPRESSION) return emptyDouble();
   if (compression.type == GZIP_COMPRESSION) return makeDoubleScalar(parameter);
   if (parameter != 0) {
-    qvWarningMsgId(cdflib::invalidCompressionParameter(parameter, shortTypeName(compression.type)));
+    qvWarningMsgId(cdflib::invalidCompressionParameter(parameter, shortTypeName(compression)));
     return makeDoubleScalar(parameter);
   }
   return qvCreateString(compression.type == RLE_COMPRESSION ? "RLE_OF_ZEROs"
@@ -89,8 +76,8 @@ void getCompression(int, qvArray* outputs[], std::int32_t, const qvArray* argume
   Compression found;
   callOnFile("CDFgetCompression", file, GET_,  //
              CDF_COMPRESSION_, &found.type, found.parameters, &found.percentage);
-  checkCompressionType(found.type);
-  setOutputs(outputs, {qvCreateString(typeName(found.type)), fileParameter(found),
+  const std::string& name = typeName(found);
+  setOutputs(outputs, {qvCreateString(name.c_str()), fileParameter(found),
                        makeDoubleScalar(found.percentage)});
 }
 
@@ -101,8 +88,8 @@ void getVarCompression(int, qvArray* outputs[], std::int32_t, const qvArray* arg
   Compression found;
   VariableOperation(file, number, "CDFgetzVarCompression")
       .call(GET_, zVAR_COMPRESSION_, &found.type, found.parameters, &found.percentage);
-  checkCompressionType(found.type);
-  setOutputs(outputs, {qvCreateString(typeName(found.type)), variableParameter(found),
+  const std::string& name = typeName(found);
+  setOutputs(outputs, {qvCreateString(name.c_str()), variableParameter(found),
                        makeDoubleScalar(found.percentage)});
 }
 

@@ -4,15 +4,12 @@
 
 #include <algorithm>
 #include <boost/assign/list_of.hpp>
-#include <map>
 #include <string>
 
 #include "constants/value_names.h"
-#include "gateway/errors.h"
 #include "gateway/library.h"
 #include "gateway/open_file_registry.h"
 #include "gateway/outputs.h"
-#include "gateway/raise_error.h"
 
 namespace TOLVEX::ambrix {
 namespace {
@@ -22,31 +19,25 @@ constexpr int kNameLength = std::max(CDF_PATHNAME_LEN, 512);
 constexpr int kCopyrightLength = std::max(CDF_COPYRIGHT_LEN, 256);
 
 // The spellings are the module's own; 10 and the numbers above 16 have no name here.
-const std::map<double, std::string>& encodingNames() {
-  static const std::map<double, std::string> EncodingNames =
-      boost::assign::map_list_of<double, std::string>  //
-      (1, "NETWORK_ENCODING")                          //
-      (2, "SUN_ENCODING")                              //
-      (3, "VAX_ENCODING")                              //
-      (4, "DECSTATION_ENCODING")                       //
-      (5, "SGI_ENCODING")                              //
-      (6, "IBMPC_ENCODING")                            //
-      (7, "IBMRS_ENCODING")                            //
-      (8, "HOST_ENCODING")                             //
-      (9, "MAC_ENCODING")                              //
-      (11, "HP_ENCODING")                              //
-      (12, "NEXT_ENCODING")                            //
-      (13, "ALPHAOSF1_ENCODING")                       //
-      (14, "ALPHAMVSD_ENCODING")                       //
-      (15, "ALPHAMVSG_ENCODING")                       //
+const ValueNameTable& encodingNames() {
+  static const ValueNameTable EncodingNames =
+      boost::assign::map_list_of<std::int64_t, std::string>  //
+      (1, "NETWORK_ENCODING")                                //
+      (2, "SUN_ENCODING")                                    //
+      (3, "VAX_ENCODING")                                    //
+      (4, "DECSTATION_ENCODING")                             //
+      (5, "SGI_ENCODING")                                    //
+      (6, "IBMPC_ENCODING")                                  //
+      (7, "IBMRS_ENCODING")                                  //
+      (8, "HOST_ENCODING")                                   //
+      (9, "MAC_ENCODING")                                    //
+      (11, "HP_ENCODING")                                    //
+      (12, "NEXT_ENCODING")                                  //
+      (13, "ALPHAOSF1_ENCODING")                             //
+      (14, "ALPHAMVSD_ENCODING")                             //
+      (15, "ALPHAMVSG_ENCODING")                             //
       (16, "ALPHAMVSI_ENCODING");
   return EncodingNames;
-}
-
-const std::string& encodingName(long encoding) {
-  const auto found = encodingNames().find(static_cast<double>(encoding));
-  if (found == encodingNames().end()) raiseError(cdflib::unrecognizedValue(encoding, "ENCODING"));
-  return found->second;
 }
 
 }  // namespace
@@ -65,7 +56,7 @@ void inquireFile(int, qvArray* outputs[], std::int32_t, const qvArray* arguments
              zVARs_MAXREC_, &maxRecord,                              //
              CDF_NUMzVARS_, &variables,                              //
              CDF_NUMATTRS_, &attributes);
-  const std::string& encodingText = encodingName(encoding);
+  const std::string& encodingText = lookupValueName(encodingNames(), encoding, "ENCODING");
   const std::string& majorityText = lookupValueName(MajorityNames, majority, "MAJORITY");
   setOutputs(outputs, {qvCreateString(encodingText.c_str()), qvCreateString(majorityText.c_str()),
                        makeDoubleScalar(maxRecord), makeDoubleScalar(variables),

@@ -1,41 +1,19 @@
 #include "gateway/value_buffer.h"
 
-#include <cdf.h>
-
 #include <cstddef>
 #include <new>
 
+#include "gateway/datatype_table.h"
 #include "gateway/sizes.h"
 
 namespace TOLVEX::ambrix {
 namespace {
 
-std::size_t bytesForValues(long datatype, long count) {
-  switch (datatype) {
-    case CDF_INT1:
-    case CDF_UINT1:
-    case CDF_BYTE:
-      return saturatedProduct({count});
-    case CDF_INT2:
-    case CDF_UINT2:
-      return saturatedProduct({2, count});
-    case CDF_INT4:
-    case CDF_UINT4:
-    case CDF_REAL4:
-    case CDF_FLOAT:
-      return saturatedProduct({4, count});
-    case CDF_REAL8:
-    case CDF_EPOCH:
-    case CDF_DOUBLE:
-      return saturatedProduct({8, count});
-    case CDF_EPOCH16:
-      return saturatedProduct({16, count});
-    case CDF_CHAR:
-    case CDF_UCHAR:
-      return saturatedProduct({count}) + 1;
-    default:
-      return 0;
-  }
+std::size_t bytesForValues(long code, long count) {
+  const Datatype* datatype = findDatatype(code);
+  if (datatype == nullptr) return 0;
+  const std::size_t terminator = isCharacterDatatype(code) ? 1 : 0;
+  return saturatedProduct({datatype->size, count}) + terminator;
 }
 
 }  // namespace

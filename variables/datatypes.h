@@ -1,10 +1,11 @@
-// The fifteen CDF datatypes that the module supports: host class, size and name of each. Every
-// other code, also those that the library knows (8, 33), is an unrecognised value.
+// The operations over the table of datatypes. A code that is not supported is an unrecognised
+// value.
 #pragma once
 
 #include <cstddef>
 #include <string>
 
+#include "gateway/datatype_table.h"
 #include "gateway/value_buffer.h"
 #include "host/qv.h"
 
@@ -21,8 +22,6 @@ long datatypeSize(long code);
 
 /// Bytes of a numeric host array that carries values of the datatype.
 std::size_t bytesOfArray(const qvArray* array, long code);
-
-bool isCharacterDatatype(long code);
 
 /// Upper-case name, for error messages. Raises like `validateDatatype`.
 std::string datatypeName(long code);

@@ -22,6 +22,12 @@ TEST_F(ValueNamesTest, EachTableHasItsRowsAndNoOther) {
   EXPECT_EQ(SparseRecordsNames,
             (ValueNameTable{
                 {0, "NO_SPARSERECORDS"}, {1, "PAD_SPARSERECORDS"}, {2, "PREV_SPARSERECORDS"}}));
+  EXPECT_EQ(ScopeNames, (ValueNameTable{{1, "GLOBAL_SCOPE"}, {2, "VARIABLE_SCOPE"}}));
+  EXPECT_EQ(CompressionNames, (ValueNameTable{{0, "NO_COMPRESSION"},
+                                              {1, "RLE_COMPRESSION"},
+                                              {2, "HUFF_COMPRESSION"},
+                                              {3, "AHUFF_COMPRESSION"},
+                                              {5, "GZIP_COMPRESSION"}}));
 }
 
 TEST_F(ValueNamesTest, ALookUpGivesTheNameOrTellsValueAndKind) {
