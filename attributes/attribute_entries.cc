@@ -2,22 +2,22 @@
 
 #include <optional>
 
-#include "attributes/attribute_calls.h"
+#include "attributes/attribute_arguments.h"
 #include "gateway/errors.h"
 #include "gateway/open_file_registry.h"
 #include "gateway/outputs.h"
 #include "gateway/raise_error.h"
 #include "gateway/value_buffer.h"
+#include "variables/bytes_to_write.h"
 #include "variables/datatypes.h"
-#include "variables/library_data.h"
 
 namespace TOLVEX::ambrix {
 namespace {
 
 struct EntryAddress {
   CdfId file;
-  long attribute;
-  long entry;
+  long attributeNumber;
+  long entryNumber;
 };
 
 EntryAddress getEntryAddressArgs(const qvArray* arguments[], const char* attributeLabel) {
@@ -33,9 +33,10 @@ struct EntryDescription {
 
 EntryDescription inquire(const EntryKind& kind, const EntryAddress& at) {
   EntryDescription found;
-  checkLibraryStatus(CDFinquireAttrEntry(libraryHandle(at.file, kind.inquireRoutine), kind.kind,
-                                         at.attribute, at.entry, &found.datatype, &found.elements),
-                     kind.inquireRoutine);
+  checkLibraryStatus(
+      CDFinquireAttrEntry(libraryHandle(at.file, kind.inquireRoutine), kind.kind,
+                          at.attributeNumber, at.entryNumber, &found.datatype, &found.elements),
+      kind.inquireRoutine);
   return found;
 }
 
@@ -65,36 +66,37 @@ class EntryData {
 
  private:
   char* text_;
-  std::optional<LibraryData> data_;
+  std::optional<BytesToWrite> data_;
 };
 
 }  // namespace
 
 void getEntry(const EntryKind& kind, qvArray* outputs[], const qvArray* arguments[]) {
   const EntryAddress at = getEntryAddressArgs(arguments, "ATTRNUM");
-  const EntryDescription entry = inquire(kind, at);
-  validateDatatype(entry.datatype);  // before the library is given a buffer for its values
-  if (entry.elements < 0) raiseLibraryFailure(BAD_NUM_ELEMS, kind.getRoutine);
+  const EntryDescription description = inquire(kind, at);
+  validateDatatype(description.datatype);  // before the library is given a buffer for its values
+  if (description.elements < 0) raiseLibraryFailure(BAD_NUM_ELEMS, kind.getRoutine);
   ValueBuffer buffer;
-  resizeValueBuffer(buffer, entry.datatype, entry.elements);
+  resizeValueBuffer(buffer, description.datatype, description.elements);
   unsigned char nothing = 0;
   checkLibraryStatus(
-      CDFgetAttrEntry(libraryHandle(at.file, kind.getRoutine), kind.kind, at.attribute, at.entry,
-                      buffer.empty() ? &nothing : buffer.data()),
+      CDFgetAttrEntry(libraryHandle(at.file, kind.getRoutine), kind.kind, at.attributeNumber,
+                      at.entryNumber, buffer.empty() ? &nothing : buffer.data()),
       kind.getRoutine);
-  outputs[0] = createArrayFromBuffer(buffer, entry.datatype);
+  outputs[0] = createArrayFromBuffer(buffer, description.datatype);
 }
 
 void inquireEntry(const EntryKind& kind, qvArray* outputs[], const qvArray* arguments[]) {
   const EntryAddress at = getEntryAddressArgs(arguments, "ATTRNUM");
-  const EntryDescription entry = inquire(kind, at);
-  setOutputs(outputs, {datatypeNameArray(entry.datatype), makeDoubleScalar(entry.elements)});
+  const EntryDescription description = inquire(kind, at);
+  setOutputs(outputs,
+             {datatypeNameArray(description.datatype), makeDoubleScalar(description.elements)});
 }
 
 void deleteEntry(const EntryKind& kind, const qvArray* arguments[]) {
   const EntryAddress at = getEntryAddressArgs(arguments, kind.deleteLabel);
   checkLibraryStatus(CDFdeleteAttrEntry(libraryHandle(at.file, kind.deleteRoutine), kind.kind,
-                                        at.attribute, at.entry),
+                                        at.attributeNumber, at.entryNumber),
                      kind.deleteRoutine);
 }
 
@@ -110,11 +112,11 @@ void putAttrEntry(int, qvArray*[], std::int32_t, const qvArray* arguments[], con
   if (datatype == CDF_EPOCH16) elements /= 2;  // each value is a pair of doubles
   const EntryData data(value, datatype);
   long scope = 0;
-  callOnFile("CDFgetAttrScope", at.file, ATTR_, at.attribute, GET_, ATTR_SCOPE_, &scope);
+  callOnFile("CDFgetAttrScope", at.file, ATTR_, at.attributeNumber, GET_, ATTR_SCOPE_, &scope);
   const EntryKind& kind = kindForScope(scope);
   checkLibraryStatus(
-      CDFputAttrEntry(libraryHandle(at.file, kind.putRoutine), kind.kind, at.attribute, at.entry,
-                      datatype, libraryNumber(elements, kBadNumber), data.bytes()),
+      CDFputAttrEntry(libraryHandle(at.file, kind.putRoutine), kind.kind, at.attributeNumber,
+                      at.entryNumber, datatype, libraryNumber(elements, kBadNumber), data.bytes()),
       kind.putRoutine);
   data.release();
 }

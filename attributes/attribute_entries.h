@@ -5,7 +5,7 @@
 
 #include <cstdint>
 
-#include "attributes/attribute_calls.h"
+#include "attributes/attribute_arguments.h"
 #include "gateway/command.h"
 
 namespace TOLVEX::ambrix {
@@ -20,8 +20,8 @@ struct EntryKind {
   const char* deleteLabel;
 };
 
-// "deleteAttrEntry" labels the attribute "ATTNUM", one letter short: users know it under that
-// label.
+// "deleteAttrEntry" names its argument "ATTNUM", not "ATTRNUM". The label is a value of the
+// argument's error: changed, it would change the messages.
 // clang-format off
 inline constexpr EntryKind kGEntry{kGlobalEntry,  "CDFinquireAttrgEntry", "CDFgetAttrgEntry", "CDFputAttrgEntry", "CDFdeleteAttrgEntry", "ATTRNUM"};
 inline constexpr EntryKind kZEntry{kVariableEntry, "CDFinquireAttrzEntry", "CDFgetAttrzEntry", "CDFputAttrzEntry", "CDFdeleteAttrzEntry", "ATTNUM"};

@@ -21,7 +21,7 @@ const ValueNameTable ReadOnlyModeNames =
 const ValueNameTable MajorityNames =
     map_list_of<std::int64_t, std::string>(1, "ROW_MAJOR")(2, "COLUMN_MAJOR");
 
-// 1 is on here, although users set the mode with -1: the library answers 1.
+// The mode is set with VALIDATEFILEon, -1, but CDFgetValidate answers 1.
 const ValueNameTable ValidateModeNames =
     map_list_of<std::int64_t, std::string>(0, "VALIDATEFILEoff")(1, "VALIDATEFILEon");
 

@@ -43,8 +43,9 @@ std::span<const double> componentsOf(const qvArray* times) {
   return {doublesOf(times), qvGetNumberOfElements(times)};
 }
 
-/// A component out of range, wherever it is, is told before an illegal time: users see them all
-/// converted before any is computed with. `later` are those that are not converted yet.
+/// Reports an illegal time, unless a component is out of range in this or a later time: all
+/// components are converted before the first time is computed. `later` are the components that are
+/// not converted yet.
 void requireLegal(double epoch, std::span<const double> later) {
   if (epoch != ILLEGAL_EPOCH_VALUE) return;
   requireInRange(later);

@@ -8,7 +8,7 @@
 #include "constants/value_names.h"
 #include "gateway/arguments.h"
 #include "gateway/errors.h"
-#include "gateway/library.h"
+#include "gateway/library_calls.h"
 #include "gateway/open_file_registry.h"
 #include "gateway/outputs.h"
 #include "gateway/raise_error.h"
@@ -50,7 +50,8 @@ qvArray* fileParameter(const Compression& compression) {
   }
 }
 
-// Unlike the file's, a variable's parameter is looked at, and "RLE_OF_ZEROs" ends in a small s.
+// Results differ from those of a file: the parameter is checked, and "RLE_OF_ZEROs" ends in a small
+// s. Programs can compare these texts.
 qvArray* variableParameter(const Compression& compression) {
   const long parameter = compression.parameters[0];
   if (compression.type == NO_COMPRESSION) return emptyDouble();
@@ -84,9 +85,9 @@ void getCompression(int, qvArray* outputs[], std::int32_t, const qvArray* argume
 void getVarCompression(int, qvArray* outputs[], std::int32_t, const qvArray* arguments[],
                        const CommandEntry*) {
   const CdfId file = getCdfIdArg(arguments[0]);
-  const long number = getLongScalarArg(arguments[1], "VARNUM");
+  const long variableNumber = getLongScalarArg(arguments[1], "VARNUM");
   Compression found;
-  VariableOperation(file, number, "CDFgetzVarCompression")
+  VariableOperation(file, variableNumber, "CDFgetzVarCompression")
       .call(GET_, zVAR_COMPRESSION_, &found.type, found.parameters, &found.percentage);
   const std::string& name = typeName(found);
   setOutputs(outputs, {qvCreateString(name.c_str()), variableParameter(found),
@@ -111,11 +112,12 @@ void setCompression(int, qvArray*[], std::int32_t argumentCount, const qvArray* 
   callOnFile("CDFsetCompression", file, PUT_, CDF_COMPRESSION_, type, parameters);
 }
 
-// A gzip level goes to the library as it is: only "setCompression" checks it.
+// The library refuses a gzip level outside 1 to 9 (BAD_COMPRESSION_PARM). It would do so for
+// "setCompression", too, which checks first and so has an error of its own.
 void setVarCompression(int, qvArray*[], std::int32_t argumentCount, const qvArray* arguments[],
                        const CommandEntry*) {
   const CdfId file = getCdfIdArg(arguments[0]);
-  const long number = getLongScalarArg(arguments[1], "VARNUM");
+  const long variableNumber = getLongScalarArg(arguments[1], "VARNUM");
   const long type = getLongScalarArg(arguments[2], "CTYPE");
   checkCompressionType(type);
   long parameters[CDF_MAX_PARMS] = {};
@@ -124,7 +126,7 @@ void setVarCompression(int, qvArray*[], std::int32_t argumentCount, const qvArra
   } else if (type == GZIP_COMPRESSION) {
     raiseError(cdflib::unspecifiedGzipCompressionLevel());
   }
-  VariableOperation(file, number, "CDFsetzVarCompression")
+  VariableOperation(file, variableNumber, "CDFsetzVarCompression")
       .call(PUT_, zVAR_COMPRESSION_, type, parameters);
 }
 

@@ -1,5 +1,7 @@
-// Compression of a whole file and of one variable. The two getters and the two setters differ in
-// what they check and in one spelling; users know each as it is, so they stay apart.
+// Compression of a whole file and of one variable. The getters differ in the names that they
+// return, the setters in the error for a bad gzip level: `invalidCompressionParameter` for a file,
+// the library's own `libraryFailure` for a variable. One handler for both would change results or
+// errors.
 #pragma once
 
 #include <cstdint>
@@ -25,7 +27,8 @@ void setCompression(int, qvArray*[], std::int32_t argumentCount, const qvArray* 
 void getVarCompression(int, qvArray* outputs[], std::int32_t, const qvArray* arguments[],
                        const CommandEntry*);
 
-/// "setVarCompression" (identifier, variable, type, [parameter]). A gzip level is not checked.
+/// "setVarCompression" (identifier, variable, type, [parameter]). The library checks the gzip
+/// level.
 void setVarCompression(int, qvArray*[], std::int32_t argumentCount, const qvArray* arguments[],
                        const CommandEntry*);
 

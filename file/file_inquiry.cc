@@ -7,7 +7,7 @@
 #include <string>
 
 #include "constants/value_names.h"
-#include "gateway/library.h"
+#include "gateway/library_calls.h"
 #include "gateway/open_file_registry.h"
 #include "gateway/outputs.h"
 

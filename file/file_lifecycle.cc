@@ -7,7 +7,7 @@
 
 #include "gateway/arguments.h"
 #include "gateway/errors.h"
-#include "gateway/library.h"
+#include "gateway/library_calls.h"
 #include "gateway/open_file_registry.h"
 #include "gateway/raise_error.h"
 

@@ -8,7 +8,7 @@
 #include "constants/value_names.h"
 #include "gateway/arguments.h"
 #include "gateway/families.h"
-#include "gateway/library.h"
+#include "gateway/library_calls.h"
 #include "gateway/open_file_registry.h"
 
 namespace TOLVEX::ambrix {
@@ -44,7 +44,8 @@ struct FileSetting {
 
 /// A command (identifier, number) without a result.
 template <const FileSetting& row>
-void setFileNumber(int, qvArray*[], std::int32_t, const qvArray* arguments[], const CommandEntry*) {
+void setFileSetting(int, qvArray*[], std::int32_t, const qvArray* arguments[],
+                    const CommandEntry*) {
   const CdfId file = getCdfIdArg(arguments[0]);
   const long value = libraryNumber(getLongScalarArg(arguments[1], row.label), kBadNumber);
   if constexpr (row.operation == SELECT_) {
@@ -60,11 +61,12 @@ inline constexpr NamedSetting kGetChecksum     {GET_,     CDF_CHECKSUM_,      "C
 inline constexpr NamedSetting kGetMajority     {GET_,     CDF_MAJORITY_,      "CDFgetMajority",     &MajorityNames,     "MAJORITY"};
 inline constexpr NamedSetting kGetReadOnlyMode {CONFIRM_, CDF_READONLY_MODE_, "CDFgetReadOnlyMode", &ReadOnlyModeNames, "READONLY MODE"};
 
-inline constexpr FileNumber kGetCacheSize            {CONFIRM_, CDF_CACHESIZE_,      "CDFgetCacheSize"};
-inline constexpr FileNumber kGetStageCacheSize       {CONFIRM_, STAGE_CACHESIZE_,    "CDFgetStageCacheSize"};
-inline constexpr FileNumber kGetCompressionCacheSize {CONFIRM_, COMPRESS_CACHESIZE_, "CDFgetCompressionCacheSize"};
+inline constexpr FileProperty kGetCacheSize            {CONFIRM_, CDF_CACHESIZE_,      "CDFgetCacheSize"};
+inline constexpr FileProperty kGetStageCacheSize       {CONFIRM_, STAGE_CACHESIZE_,    "CDFgetStageCacheSize"};
+inline constexpr FileProperty kGetCompressionCacheSize {CONFIRM_, COMPRESS_CACHESIZE_, "CDFgetCompressionCacheSize"};
 
-// "setFormat" labels its argument like a cache size: users know it under that label.
+// The label of "setFormat" is that of the cache sizes. It is a value of the argument's error: changed,
+// it would change the messages.
 inline constexpr FileSetting kSetFormat               {PUT_,    CDF_FORMAT_,         "CDFsetFormat",               "NUMBUFFERS"};
 inline constexpr FileSetting kSetChecksum             {PUT_,    CDF_CHECKSUM_,       "CDFsetChecksum",             "MODE"};
 inline constexpr FileSetting kSetMajority             {PUT_,    CDF_MAJORITY_,       "CDFsetMajority",             "MAJORITY"};

@@ -3,7 +3,7 @@
 #include <cdf.h>
 
 #include "gateway/arguments.h"
-#include "gateway/library.h"
+#include "gateway/library_calls.h"
 #include "gateway/library_faults.h"
 #include "gateway/open_file_registry.h"
 

@@ -35,7 +35,8 @@ struct badDimSpec : Error {
       : Error("badDimSpec", dimensions, std::move(variable)) {}
 };
 
-// The same two values as badDimSpec in the opposite order: catalogues of hosts rely on it.
+// The same two values as badDimSpec in the opposite order: a catalogue's text takes values by their
+// position.
 struct badDimensionExtent : Error {
   badDimensionExtent(std::string variable, std::int64_t dimensions)
       : Error("badDimensionExtent", std::move(variable), dimensions) {}

@@ -4,7 +4,7 @@
 #include <cstddef>
 
 #include "gateway/errors.h"
-#include "gateway/library.h"
+#include "gateway/library_calls.h"
 #include "gateway/raise_error.h"
 #include "variables/datatypes.h"
 
@@ -12,13 +12,13 @@ namespace TOLVEX::ambrix {
 namespace {
 
 // The elements of one value are contiguous to the library: they come first and never move.
-bool appendLeading(HostDimensions& dimensions, const VariableDescription& variable) {
-  if (variable.datatype == CDF_EPOCH16) {
+bool appendLeading(HostDimensions& dimensions, const VariableDescription& description) {
+  if (description.datatype == CDF_EPOCH16) {
     dimensions.append(2);
     return true;
   }
-  if (isCharacterDatatype(variable.datatype)) {
-    dimensions.append(variable.elements);
+  if (isCharacterDatatype(description.datatype)) {
+    dimensions.append(description.elements);
     return true;
   }
   return false;
@@ -31,35 +31,35 @@ void HostDimensions::reverse(std::size_t first, std::size_t last) {
   std::reverse(begin + first, begin + last);
 }
 
-HostDimensions valueDimensions(const VariableDescription& variable) {
+HostDimensions valueDimensions(const VariableDescription& description) {
   HostDimensions dimensions;
-  if (!appendLeading(dimensions, variable)) dimensions.append(1);
+  if (!appendLeading(dimensions, description)) dimensions.append(1);
   dimensions.append(1);
   return dimensions;
 }
 
-HostDimensions recordDimensions(const VariableDescription& variable, bool rowMajor) {
+HostDimensions recordDimensions(const VariableDescription& description, bool rowMajor) {
   HostDimensions dimensions;
-  const bool scalar = variable.dimensions == 0;
-  const bool text = isCharacterDatatype(variable.datatype);
-  if (variable.datatype == CDF_EPOCH16 || (text && variable.elements != 1)) {
-    appendLeading(dimensions, variable);
+  const bool scalar = description.dimensions == 0;
+  const bool text = isCharacterDatatype(description.datatype);
+  if (description.datatype == CDF_EPOCH16 || (text && description.elements != 1)) {
+    appendLeading(dimensions, description);
   } else if (scalar) {
-    dimensions.append(variable.elements);
+    dimensions.append(description.elements);
   }
   const std::size_t leading = scalar ? 0 : dimensions.count();
-  for (const long size : variable.sizes())
+  for (const long size : description.sizes())
     dimensions.append(size);
   if (rowMajor && !scalar) dimensions.reverse(leading, dimensions.count());
   return dimensions;
 }
 
-HostDimensions hyperslabDimensions(const VariableDescription& variable,
+HostDimensions hyperslabDimensions(const VariableDescription& description,
                                    std::span<const long> counts, long records) {
   HostDimensions dimensions;
-  appendLeading(dimensions, variable);
+  appendLeading(dimensions, description);
   for (std::size_t i = 0; i < counts.size(); ++i) {
-    if (variable.sizes()[i] < counts[i]) raiseError(cdflib::dimSizeTooLarge());
+    if (description.sizes()[i] < counts[i]) raiseError(cdflib::dimSizeTooLarge());
     dimensions.append(counts[i]);
   }
   dimensions.append(records);

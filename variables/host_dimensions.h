@@ -27,15 +27,15 @@ class HostDimensions {
 };
 
 /// One value: a column of 2 doubles for `CDF_EPOCH16`, of its characters for text, else 1-by-1.
-HostDimensions valueDimensions(const VariableDescription& variable);
+HostDimensions valueDimensions(const VariableDescription& description);
 
 /// One record: the leading dimension, if any, and all dimension sizes in the host's order.
-HostDimensions recordDimensions(const VariableDescription& variable, bool rowMajor);
+HostDimensions recordDimensions(const VariableDescription& description, bool rowMajor);
 
 /// A hyperslab: the leading dimension, if any, the counts (given in the library's order) in the
 /// host's order, and the number of records. Raises `dimSizeTooLarge` if a count exceeds its
 /// dimension.
-HostDimensions hyperslabDimensions(const VariableDescription& variable,
+HostDimensions hyperslabDimensions(const VariableDescription& description,
                                    std::span<const long> counts, long records);
 /// Puts the counts of a hyperslab of a row-major file into the host's order.
 void reverseCounts(HostDimensions& dimensions, std::size_t counts);

@@ -4,7 +4,7 @@
 #include <span>
 #include <vector>
 
-#include "gateway/library.h"
+#include "gateway/library_calls.h"
 #include "host/qv.h"
 #include "variables/host_dimensions.h"
 #include "variables/variable_description.h"

@@ -4,13 +4,13 @@
 
 #include "gateway/arguments.h"
 #include "gateway/errors.h"
-#include "gateway/library.h"
+#include "gateway/library_calls.h"
 #include "gateway/open_file_registry.h"
 #include "gateway/raise_error.h"
 #include "gateway/scratch.h"
+#include "variables/bytes_to_write.h"
 #include "variables/datatypes.h"
 #include "variables/host_dimensions.h"
-#include "variables/library_data.h"
 #include "variables/read_values.h"
 #include "variables/variable_description.h"
 
@@ -31,9 +31,9 @@ long putPadValue(const VariableOperation& variable, const qvArray* value) {
 void getVarPadValue(int, qvArray* outputs[], std::int32_t, const qvArray* arguments[],
                     const CommandEntry*) {
   const CdfId file = getCdfIdArg(arguments[0]);
-  const long number = getLongScalarArg(arguments[1], "VARNUM");
-  const VariableDescription description = inquireVariable(file, number);
-  const VariableOperation variable(file, number, "CDFgetzVarPadValue");
+  const long variableNumber = getLongScalarArg(arguments[1], "VARNUM");
+  const VariableDescription description = inquireVariable(file, variableNumber);
+  const VariableOperation variable(file, variableNumber, "CDFgetzVarPadValue");
   const HostDimensions dimensions = valueDimensions(description);
   validateDatatype(description.datatype);
   requireElements(variable, description);
@@ -49,10 +49,10 @@ void getVarPadValue(int, qvArray* outputs[], std::int32_t, const qvArray* argume
 void setVarPadValue(int, qvArray*[], std::int32_t, const qvArray* arguments[],
                     const CommandEntry*) {
   const CdfId file = getCdfIdArg(arguments[0]);
-  const long number = getLongScalarArg(arguments[1], "VARNUM");
+  const long variableNumber = getLongScalarArg(arguments[1], "VARNUM");
   const qvArray* value = arguments[2];
-  const VariableDescription description = inquireVariable(file, number);
-  const VariableOperation variable(file, number, "CDFsetzVarPadValue");
+  const VariableDescription description = inquireVariable(file, variableNumber);
+  const VariableOperation variable(file, variableNumber, "CDFsetzVarPadValue");
   requireClassOfDatatype(value, description.datatype);
   const long expected = elementsPerValue(description);
   if (!hasElements(value, expected)) {

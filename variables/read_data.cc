@@ -49,24 +49,26 @@ void readHyperslab(const VariableOperation& variable, const VariableDescription&
 
 }  // namespace
 
-// Each reader converts its arguments, inquires the variable and shapes the result, in the order in
-// which its errors are promised. Then come the guards, which speak as the library does: those that
-// need no result before it is made, the others when it is, so that a size that cannot be had is
-// told first. The library reads last.
+// The readers and writers check a record in one order: its size (`requireUsableRecord`), the room
+// for its values (`requireRoom`), then its number. A writer's room is that of its argument. A
+// reader's room is that of its result, so a reader checks the number after `readValues` has made
+// the result, and the host's error for a result that is too large comes first.
 
 void getVarData(int, qvArray* outputs[], std::int32_t argumentCount, const qvArray* arguments[],
                 const CommandEntry*) {
+  // 1. Arguments: in this order. The indices come after the inquiry, which says if they are needed.
   const CdfId file = getCdfIdArg(arguments[0]);
-  const long number = getLongScalarArg(arguments[1], "VARNUM");
+  const long variableNumber = getLongScalarArg(arguments[1], "VARNUM");
   const long record = getLongScalarArg(arguments[2], "RECNUM");
-  const VariableDescription description = inquireVariable(file, number);
+  const VariableDescription description = inquireVariable(file, variableNumber);
   std::vector<long> indices = getOptionalIndices(argumentCount, arguments, description);
   requireOnePerDimension(indices, description);
   if (isRowMajor(file)) std::ranges::reverse(indices);
   const HostDimensions dimensions = valueDimensions(description);
   validateDatatype(description.datatype);
 
-  const VariableOperation variable(file, number, "CDFgetzVarData");
+  // 2. Request: the size of a record is checked before it is multiplied or reserved.
+  const VariableOperation variable(file, variableNumber, "CDFgetzVarData");
   requireUsableRecord(variable, description);
   const ReadRequest request{1, description.elementsPerRecord(), true};
   const DimensionVector libraryIndices = libraryVector(indices, kBadNumber);
@@ -76,9 +78,11 @@ void getVarData(int, qvArray* outputs[], std::int32_t argumentCount, const qvArr
                   zVAR_DIMINDICES_, libraryIndices.data(),  //
                   GET_, zVAR_DATA_, value);
   };
+  // 3. Result: made first, then the record is checked, then filled or read. A value that is a whole
+  // record takes the path of whole records, which has their guard.
   outputs[0] = readValues(variable, description, dimensions, request, [&](void* value) {
     requireCountableRecord(variable, description, record);
-    if (lacksItsRecord(variable, description)) {
+    if (mustFillUnwrittenRecord(variable, description)) {
       return fillValue(variable, description, record, libraryIndices, value);
     }
     if (!description.storesOneValue()) return readValue(value);
@@ -88,14 +92,16 @@ void getVarData(int, qvArray* outputs[], std::int32_t argumentCount, const qvArr
 
 void getVarRecordData(int, qvArray* outputs[], std::int32_t, const qvArray* arguments[],
                       const CommandEntry*) {
+  // 1. Arguments: in this order. The datatype is checked before the majority is asked for.
   const CdfId file = getCdfIdArg(arguments[0]);
-  const long number = getLongScalarArg(arguments[1], "VARNUM");
+  const long variableNumber = getLongScalarArg(arguments[1], "VARNUM");
   const long record = getLongScalarArg(arguments[2], "RECNUM");
-  const VariableDescription description = inquireVariable(file, number);
+  const VariableDescription description = inquireVariable(file, variableNumber);
   validateDatatype(description.datatype);
   const HostDimensions dimensions = recordDimensions(description, isRowMajor(file));
 
-  const VariableOperation variable(file, number, "CDFgetzVarRecordData");
+  // 2. Request: the size of a record is checked before it is multiplied or reserved.
+  const VariableOperation variable(file, variableNumber, "CDFgetzVarRecordData");
   requireUsableRecord(variable, description);
   const ReadRequest request{description.valuesPerRecord(), description.elementsPerRecord(),
                             description.allDimensionsVary()};
@@ -103,20 +109,23 @@ void getVarRecordData(int, qvArray* outputs[], std::int32_t, const qvArray* argu
     variable.check(
         CDFgetVarRecordData(variable.handle(), kZVariables, variable.number(), record, values));
   };
+  // 3. Result: made first, then the record is checked, then filled or read.
   outputs[0] = readValues(variable, description, dimensions, request, [&](void* values) {
     requireRecordNumber(variable, record);
     requireCountableRecord(variable, description, record);
-    if (lacksItsRecord(variable, description)) return fillRecord(variable, description, values);
+    if (mustFillUnwrittenRecord(variable, description))
+      return fillRecord(variable, description, values);
     readWholeRecords(variable, description, {record, 1, 1}, values, readRecord);
   });
 }
 
 void hyperGetVarData(int, qvArray* outputs[], std::int32_t, const qvArray* arguments[],
                      const CommandEntry*) {
+  // 1. Arguments: in this order. Counts are compared with the sizes before the datatype is checked.
   const CdfId file = getCdfIdArg(arguments[0]);
-  const long number = getLongScalarArg(arguments[1], "VARNUM");
-  Hyperslab slab = getHyperslabArgs(arguments + 2, "DIMSTRIDe");  // unlike that of the writer
-  const VariableDescription description = inquireVariable(file, number);
+  const long variableNumber = getLongScalarArg(arguments[1], "VARNUM");
+  Hyperslab slab = getHyperslabArgs(arguments + 2, "DIMSTRIDe");  // the writer: "DIMSTRIDE"
+  const VariableDescription description = inquireVariable(file, variableNumber);
   requireOnePerDimension(slab.start, description);
   requireOnePerDimension(slab.count, description);
   requireOnePerDimension(slab.interval, description);
@@ -126,16 +135,18 @@ void hyperGetVarData(int, qvArray* outputs[], std::int32_t, const qvArray* argum
   validateDatatype(description.datatype);
   if (rowMajor) reverseCounts(dimensions, slab.count.size());
 
-  const VariableOperation variable(file, number, "CDFhyperGetzVarData");
+  // 2. Request: the size of a record is checked before it is multiplied or reserved.
+  const VariableOperation variable(file, variableNumber, "CDFhyperGetzVarData");
   requireUsableRecord(variable, description);
   const long values = multiplySaturated(productOf(slab.count), slab.recordCount);
   const long bufferBytes = multiplySaturated(description.elementsPerRecord(), slab.recordCount);
   const ReadRequest request{values, bufferBytes, true};
   LibraryHyperslab librarySlab(slab, description.sizes());
   readSameRecordWithoutSkipping(description, librarySlab);
+  // 3. Result: made first, then the last record is checked, then filled or read.
   outputs[0] = readValues(variable, description, dimensions, request, [&](void* result) {
     requireCountableRecord(variable, description, librarySlab.lastRecord());
-    if (lacksItsRecord(variable, description)) {
+    if (mustFillUnwrittenRecord(variable, description)) {
       return fillHyperslab(variable, description, librarySlab, result);
     }
     readHyperslab(variable, description, librarySlab, result);

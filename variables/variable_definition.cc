@@ -7,7 +7,7 @@
 
 #include "gateway/arguments.h"
 #include "gateway/errors.h"
-#include "gateway/library.h"
+#include "gateway/library_calls.h"
 #include "gateway/open_file_registry.h"
 #include "gateway/outputs.h"
 #include "gateway/raise_error.h"
@@ -55,7 +55,7 @@ NewVariable getNewVariableArgs(const qvArray* arguments[]) {
         cdflib::mismatchedVarianceSize(std::ssize(wanted.variances), std::ssize(wanted.sizes)));
   }
   if (recordVariance.empty()) raiseError(cdflib::mismatchedVarianceSize(0, 1));
-  wanted.recordVariance = recordVariance.front();  // further ones do not count
+  wanted.recordVariance = recordVariance.front();  // the library takes one; others are ignored
   return wanted;
 }
 
@@ -71,12 +71,12 @@ void createVar(int, qvArray* outputs[], std::int32_t, const qvArray* arguments[]
   }
   DimensionVector sizes = libraryVector(wanted.sizes, kBadNumber);
   DimensionVector variances = libraryVector(wanted.variances, kBadNumber);
-  long number = 0;
+  long variableNumber = 0;
   callOnFile("CDFcreatezVar", file, CREATE_, zVAR_, wanted.name.c_str(),
              libraryNumber(wanted.datatype, kBadNumber), libraryNumber(wanted.elements, kBadNumber),
              static_cast<long>(wanted.sizes.size()), sizes.data(), wanted.recordVariance,
-             variances.data(), &number);
-  outputs[0] = makeDoubleScalar(number);
+             variances.data(), &variableNumber);
+  outputs[0] = makeDoubleScalar(variableNumber);
 }
 
 void inquireVar(int, qvArray* outputs[], std::int32_t, const qvArray* arguments[],
@@ -99,44 +99,46 @@ void inquireVar(int, qvArray* outputs[], std::int32_t, const qvArray* arguments[
               makeSizes(sizes), makeLogicals({recordVaries}), makeLogicals(dimensionVaries)});
 }
 
-// Labels the variable's number "CDFID": users know it under that label.
+// The label of the variable's number is "CDFID": it is a value of the argument's error, and changed
+// it would change the messages.
 void closeVar(int, qvArray*[], std::int32_t, const qvArray* arguments[], const CommandEntry*) {
   const CdfId file = getCdfIdArg(arguments[0]);
-  const long number = getLongScalarArg(arguments[1], "CDFID");
-  VariableOperation(file, number, "CDFclosezVar").call(CLOSE_, zVAR_);
+  const long variableNumber = getLongScalarArg(arguments[1], "CDFID");
+  VariableOperation(file, variableNumber, "CDFclosezVar").call(CLOSE_, zVAR_);
 }
 
 void deleteVar(int, qvArray*[], std::int32_t, const qvArray* arguments[], const CommandEntry*) {
   const CdfId file = getCdfIdArg(arguments[0]);
-  const long number = getLongScalarArg(arguments[1], "VARNUM");
-  VariableOperation(file, number, "CDFdeletezVar").call(DELETE_, zVAR_);
+  const long variableNumber = getLongScalarArg(arguments[1], "VARNUM");
+  VariableOperation(file, variableNumber, "CDFdeletezVar").call(DELETE_, zVAR_);
 }
 
 void renameVar(int, qvArray*[], std::int32_t, const qvArray* arguments[], const CommandEntry*) {
   const CdfId file = getCdfIdArg(arguments[0]);
-  const long number = getLongScalarArg(arguments[1], "VARNUM");
+  const long variableNumber = getLongScalarArg(arguments[1], "VARNUM");
   const std::string name = getStringArg(arguments[2]);
-  VariableOperation(file, number, "CDFrenamezVar").call(PUT_, zVAR_NAME_, name.c_str());
+  VariableOperation(file, variableNumber, "CDFrenamezVar").call(PUT_, zVAR_NAME_, name.c_str());
 }
 
 void getVarName(int, qvArray* outputs[], std::int32_t, const qvArray* arguments[],
                 const CommandEntry*) {
   const CdfId file = getCdfIdArg(arguments[0]);
-  const long number = getLongScalarArg(arguments[1], "VARNUM");
+  const long variableNumber = getLongScalarArg(arguments[1], "VARNUM");
   char name[CDF_VAR_NAME_LEN256 + 1] = {};
-  VariableOperation(file, number, "CDFgetzVarName").call(GET_, zVAR_NAME_, name);
+  VariableOperation(file, variableNumber, "CDFgetzVarName").call(GET_, zVAR_NAME_, name);
   outputs[0] = qvCreateString(name);
 }
 
-// Reports a failure as "CDFclosezVar": users know it under that name.
+// A failure is reported as one of "CDFclosezVar", though the routine is CDFgetVarNum. The name is a
+// value of `libraryFailure`: changed, it would change the messages.
 void getVarNum(int, qvArray* outputs[], std::int32_t, const qvArray* arguments[],
                const CommandEntry*) {
   const char* routine = "CDFclosezVar";
   const CdfId file = getCdfIdArg(arguments[0]);
   std::string name = getStringArg(arguments[1]);
-  const long number = CDFgetVarNum(libraryHandle(file, routine), name.data());
-  checkLibraryStatus(number, routine);
-  outputs[0] = makeDoubleScalar(number);
+  const long variableNumber = CDFgetVarNum(libraryHandle(file, routine), name.data());
+  checkLibraryStatus(variableNumber, routine);
+  outputs[0] = makeDoubleScalar(variableNumber);
 }
 
 }  // namespace TOLVEX::ambrix

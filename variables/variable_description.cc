@@ -45,8 +45,8 @@ long describe(const VariableOperation& variable, VariableDescription& found) {
   return status;
 }
 
-VariableDescription inquireVariable(CdfId file, long number) {
-  const VariableOperation inquiry(file, number, "CDFinquirezVar");
+VariableDescription inquireVariable(CdfId file, long variableNumber) {
+  const VariableOperation inquiry(file, variableNumber, "CDFinquirezVar");
   VariableDescription found;
   inquiry.check(describe(inquiry, found));
   return found;

@@ -5,7 +5,7 @@
 
 #include <span>
 
-#include "gateway/library.h"
+#include "gateway/library_calls.h"
 
 namespace TOLVEX::ambrix {
 
@@ -38,7 +38,7 @@ struct VariableDescription {
 };
 
 /// Raises `libraryFailure` ("CDFinquirezVar").
-VariableDescription inquireVariable(CdfId file, long number);
+VariableDescription inquireVariable(CdfId file, long variableNumber);
 
 /// The same within another operation, for guards. Returns the status of the inquiry.
 long describe(const VariableOperation& variable, VariableDescription& found);

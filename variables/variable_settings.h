@@ -11,20 +11,20 @@
 namespace TOLVEX::ambrix {
 
 /// A number that the library holds for a variable.
-struct VariableNumber {
+struct VariableProperty {
   long operation;
   long item;
   const char* routine;
   bool dividesByRecord;  // the library divides by the bytes of a record on the way
 };
 
-/// A command (identifier, variable) that returns a `VariableNumber` as a double scalar.
-template <const VariableNumber& row>
-void getVariableNumber(int, qvArray* outputs[], std::int32_t, const qvArray* arguments[],
-                       const CommandEntry*) {
+/// A command (identifier, variable) that returns a `VariableProperty` as a double scalar.
+template <const VariableProperty& row>
+void getVariableProperty(int, qvArray* outputs[], std::int32_t, const qvArray* arguments[],
+                         const CommandEntry*) {
   const CdfId file = getCdfIdArg(arguments[0]);
-  const long number = getLongScalarArg(arguments[1], "VARNUM");
-  const VariableOperation variable(file, number, row.routine);
+  const long variableNumber = getLongScalarArg(arguments[1], "VARNUM");
+  const VariableOperation variable(file, variableNumber, row.routine);
   if constexpr (row.dividesByRecord) requireDivisibleRecord(variable);
   long value = 0;
   variable.call(row.operation, row.item, &value);
@@ -43,12 +43,12 @@ struct VariableSetting {
 
 /// A command (identifier, variable, number) without a result.
 template <const VariableSetting& row>
-void setVariableNumber(int, qvArray*[], std::int32_t, const qvArray* arguments[],
-                       const CommandEntry*) {
+void setVariableSetting(int, qvArray*[], std::int32_t, const qvArray* arguments[],
+                        const CommandEntry*) {
   const CdfId file = getCdfIdArg(arguments[0]);
-  const long number = getLongScalarArg(arguments[1], "VARNUM");
+  const long variableNumber = getLongScalarArg(arguments[1], "VARNUM");
   const long value = libraryNumber(getLongScalarArg(arguments[2], row.label), kBadNumber);
-  const VariableOperation variable(file, number, row.routine);
+  const VariableOperation variable(file, variableNumber, row.routine);
   if constexpr (row.dividesByRecord) requireDivisibleRecord(variable);
   long status = CDF_OK;
   if constexpr (row.operation == SELECT_) {
@@ -62,14 +62,14 @@ void setVariableNumber(int, qvArray*[], std::int32_t, const qvArray* arguments[]
 }
 
 // clang-format off
-inline constexpr VariableNumber kGetVarAllocRecords     {GET_,     zVAR_NUMallocRECS_,    "CDFgetzVarAllocRecords",     false};
-inline constexpr VariableNumber kGetVarBlockingFactor   {GET_,     zVAR_BLOCKINGFACTOR_,  "CDFgetzVarBlockingFactor",   false};
-inline constexpr VariableNumber kGetVarMaxAllocRecNum   {GET_,     zVAR_MAXallocREC_,     "CDFgetzVarMaxAllocRecNum",   false};
-inline constexpr VariableNumber kGetVarMaxWrittenRecNum {GET_,     zVAR_MAXREC_,          "CDFgetzVarMaxWrittenRecNum", false};
-inline constexpr VariableNumber kGetVarNumRecsWritten   {GET_,     zVAR_NUMRECS_,         "CDFgetzVarNumRecsWritten",   false};
-inline constexpr VariableNumber kGetVarReservePercent   {CONFIRM_, zVAR_RESERVEPERCENT_,  "CDFgetzVarReservePercent",   true};
+inline constexpr VariableProperty kGetVarAllocRecords     {GET_,     zVAR_NUMallocRECS_,    "CDFgetzVarAllocRecords",     false};
+inline constexpr VariableProperty kGetVarBlockingFactor   {GET_,     zVAR_BLOCKINGFACTOR_,  "CDFgetzVarBlockingFactor",   false};
+inline constexpr VariableProperty kGetVarMaxAllocRecNum   {GET_,     zVAR_MAXallocREC_,     "CDFgetzVarMaxAllocRecNum",   false};
+inline constexpr VariableProperty kGetVarMaxWrittenRecNum {GET_,     zVAR_MAXREC_,          "CDFgetzVarMaxWrittenRecNum", false};
+inline constexpr VariableProperty kGetVarNumRecsWritten   {GET_,     zVAR_NUMRECS_,         "CDFgetzVarNumRecsWritten",   false};
+inline constexpr VariableProperty kGetVarReservePercent   {CONFIRM_, zVAR_RESERVEPERCENT_,  "CDFgetzVarReservePercent",   true};
 
-inline constexpr FileNumber kGetVarsMaxWrittenRecNum    {GET_,     zVARs_MAXREC_,         "CDFgetzVarsMaxWrittenRecNum"};
+inline constexpr FileProperty kGetVarsMaxWrittenRecNum    {GET_,     zVARs_MAXREC_,         "CDFgetzVarsMaxWrittenRecNum"};
 
 inline constexpr VariableSetting kSetVarBlockingFactor {PUT_,    zVAR_BLOCKINGFACTOR_, "CDFsetzVarBlockingFactor", "BLOCKINGFACTOR", true};
 inline constexpr VariableSetting kSetVarInitialRecs    {PUT_,    zVAR_INITIALRECS_,    "CDFsetzVarInitialRecs",    "NUMRECS",        true};

@@ -22,15 +22,19 @@ std::vector<long> getVarianceArg(const qvArray* argument) {
   const auto* doubles = static_cast<const double*>(qvGetReadOnlyData(argument));
   for (std::size_t i = 0; i < variances.size(); ++i) {
     variances[i] = truncateToLong(doubles[i]);
-    varies(variances[i]);
+    validateVariance(variances[i]);
   }
   return variances;
 }
 
-bool varies(long variance) {
+void validateVariance(long variance) {
   if (variance != VARY && variance != NOVARY) {
     raiseError(cdflib::unrecognizedValue(variance, "VARIANCE"));
   }
+}
+
+bool varies(long variance) {
+  validateVariance(variance);
   return variance == VARY;
 }
 

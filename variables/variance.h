@@ -12,7 +12,10 @@ namespace TOLVEX::ambrix {
 /// nor 0 after truncation.
 std::vector<long> getVarianceArg(const qvArray* argument);
 
-/// True for VARY, false for NOVARY; raises `unrecognizedValue` (value, "VARIANCE") else.
+/// Raises `unrecognizedValue` (value, "VARIANCE") unless the value is VARY or NOVARY.
+void validateVariance(long variance);
+
+/// True for VARY, false for NOVARY. Raises like `validateVariance`.
 bool varies(long variance);
 
 }  // namespace TOLVEX::ambrix

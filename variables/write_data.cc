@@ -11,12 +11,12 @@
 #include "gateway/open_file_registry.h"
 #include "gateway/raise_error.h"
 #include "gateway/sizes.h"
+#include "variables/bytes_to_write.h"
 #include "variables/datatypes.h"
 #include "variables/guards/record_limits.h"
 #include "variables/guards/waiting_records.h"
 #include "variables/host_dimensions.h"
 #include "variables/hyperslab.h"
-#include "variables/library_data.h"
 #include "variables/variable_description.h"
 
 namespace TOLVEX::ambrix {
@@ -57,17 +57,17 @@ void finishWriting(const VariableOperation& variable, long status) {
 
 }  // namespace
 
-// Each writer converts its arguments, inquires the variable and checks the data, in the order in
-// which its errors are promised. Then come the guards, which speak as the library does. The library
-// writes last.
+// The checks of a record come in the order of the readers (variables/read_data.cc): size, room,
+// number.
 
 void putVarData(int, qvArray*[], std::int32_t, const qvArray* arguments[], const CommandEntry*) {
+  // 1. Arguments: in this order. The number of elements is checked before the class.
   const CdfId file = getCdfIdArg(arguments[0]);
-  const long number = getLongScalarArg(arguments[1], "VARNUM");
+  const long variableNumber = getLongScalarArg(arguments[1], "VARNUM");
   const long record = getLongScalarArg(arguments[2], "RECNUM");
   std::vector<long> indices = getLongVectorArg(arguments[3], "INDICES");
   const qvArray* data = arguments[4];
-  const VariableDescription description = inquireVariable(file, number);
+  const VariableDescription description = inquireVariable(file, variableNumber);
   if (isRowMajor(file)) std::ranges::reverse(indices);
   if (indices.size() != description.sizes().size()) {
     raiseError(cdflib::badDimensionExtent(description.name, description.dimensions));
@@ -78,12 +78,14 @@ void putVarData(int, qvArray*[], std::int32_t, const qvArray* arguments[], const
   }
   requireClassOfDatatype(data, description.datatype);
 
-  const VariableOperation variable(file, number, "CDFputzVarData");
+  // 2. Record: its size, the room for a value, its number.
+  const VariableOperation variable(file, variableNumber, "CDFputzVarData");
   requireUsableRecord(variable, description);
   requireRoom(variable, description, 1, bytesOfArray(data, description.datatype));
   requireCountableRecord(variable, description, record);
-  // Of a text only the first character is written; records and hyperslabs take whole texts.
-  const LibraryData value = LibraryData::firstCharacterOf(data);
+  // 3. Writing. Of a text only the first character is written: records and hyperslabs are for whole
+  // texts.
+  const BytesToWrite value = BytesToWrite::firstCharacterOf(data);
   const DimensionVector libraryIndices = libraryVector(indices, kBadNumber);
   finishWriting(variable, variable.status(zVAR_RECNUMBER_, libraryNumber(record, kBadNumber),  //
                                           zVAR_DIMINDICES_, libraryIndices.data(),             //
@@ -92,35 +94,39 @@ void putVarData(int, qvArray*[], std::int32_t, const qvArray* arguments[], const
 
 void putVarRecordData(int, qvArray*[], std::int32_t, const qvArray* arguments[],
                       const CommandEntry*) {
+  // 1. Arguments: in this order. The number of elements is checked before the class.
   const CdfId file = getCdfIdArg(arguments[0]);
-  const long number = getLongScalarArg(arguments[1], "VARNUM");
+  const long variableNumber = getLongScalarArg(arguments[1], "VARNUM");
   const long record = getLongScalarArg(arguments[2], "RECNUM");
   const qvArray* data = arguments[3];
-  const VariableDescription description = inquireVariable(file, number);
-  const long values = description.valuesPerRecord();
-  const long expected = multiplySaturated(values, elementsPerValue(description));
+  const VariableDescription description = inquireVariable(file, variableNumber);
+  const long valueCount = description.valuesPerRecord();
+  const long expected = multiplySaturated(valueCount, elementsPerValue(description));
   if (!hasElements(data, expected)) {
     raiseError(cdflib::wrongNumberOfPutVarRecordDataElements(description.name, expected));
   }
   requireClassOfDatatype(data, description.datatype);
 
-  const VariableOperation variable(file, number, "CDFputzVarRecordData");
+  // 2. Record: its size, the room for its values, its number.
+  const VariableOperation variable(file, variableNumber, "CDFputzVarRecordData");
   requireUsableRecord(variable, description);
-  requireRoom(variable, description, values, bytesOfArray(data, description.datatype));
+  requireRoom(variable, description, valueCount, bytesOfArray(data, description.datatype));
   requireRecordNumber(variable, record);
   requireCountableRecord(variable, description, record);
-  const LibraryData bytes(data);
+  // 3. Writing.
+  const BytesToWrite values(data);
   finishWriting(variable, CDFputVarRecordData(variable.handle(), kZVariables, variable.number(),
-                                              record, bytes.bytes()));
+                                              record, values.bytes()));
 }
 
 void hyperPutVarData(int, qvArray*[], std::int32_t, const qvArray* arguments[],
                      const CommandEntry*) {
+  // 1. Arguments: in this order. The number of elements is checked before the class.
   const CdfId file = getCdfIdArg(arguments[0]);
-  const long number = getLongScalarArg(arguments[1], "VARNUM");
+  const long variableNumber = getLongScalarArg(arguments[1], "VARNUM");
   Hyperslab slab = getHyperslabArgs(arguments + 2, "DIMSTRIDE");
   const qvArray* data = arguments[8];
-  const VariableDescription description = inquireVariable(file, number);
+  const VariableDescription description = inquireVariable(file, variableNumber);
   if (isRowMajor(file)) slab.reverseDimensions();
   const long expected = hyperslabElements(description, slab);
   if (!hasElements(data, expected)) {
@@ -129,7 +135,8 @@ void hyperPutVarData(int, qvArray*[], std::int32_t, const qvArray* arguments[],
   }
   requireClassOfDatatype(data, description.datatype);
 
-  const VariableOperation variable(file, number, "CDFhyperPutzVarData");
+  // 2. Records: their size, the room for the values, the last number.
+  const VariableOperation variable(file, variableNumber, "CDFhyperPutzVarData");
   requireUsableRecord(variable, description);
   const LibraryHyperslab librarySlab(slab, description.sizes());
   // More counts than dimensions can make the expected number smaller than what the library reads.
@@ -137,8 +144,9 @@ void hyperPutVarData(int, qvArray*[], std::int32_t, const qvArray* arguments[],
     variable.fail(BAD_DIM_COUNT);
   }
   requireCountableRecord(variable, description, librarySlab.lastRecord());
-  const LibraryData values(data);
-  // Parts of records are put into what the library reads first, and that writes what waits.
+  // 3. Writing. To write a part of a record the library reads the record first, so it is guarded as
+  // reading is.
+  const BytesToWrite values(data);
   if (!takesWholeRecords(description, librarySlab)) {
     writeWaitingRecords(variable, description, {librarySlab.recordStart, 1, 1});
   }
@@ -148,10 +156,10 @@ void hyperPutVarData(int, qvArray*[], std::int32_t, const qvArray* arguments[],
 void deleteVarRecords(int, qvArray*[], std::int32_t, const qvArray* arguments[],
                       const CommandEntry*) {
   const CdfId file = getCdfIdArg(arguments[0]);
-  const long number = getLongScalarArg(arguments[1], "VARNUM");
+  const long variableNumber = getLongScalarArg(arguments[1], "VARNUM");
   const long first = libraryNumber(getLongScalarArg(arguments[2], "STARTREC"), kBadNumber);
   const long last = libraryNumber(getLongScalarArg(arguments[3], "ENDREC"), kBadNumber);
-  const VariableOperation variable(file, number, "CDFdeletezVarRecords");
+  const VariableOperation variable(file, variableNumber, "CDFdeletezVarRecords");
   requireDivisibleRecord(variable);
   variable.call(DELETE_, zVAR_RECORDS_, first, last);
 }

@@ -10,7 +10,7 @@
 
 #include "adapters/embedded/call_frame.h"
 #include "adapters/embedded/host_errors.h"
-#include "adapters/embedded/loaded_library.h"
+#include "adapters/embedded/loaded_module.h"
 
 namespace ambrix {
 namespace {
@@ -67,7 +67,7 @@ std::vector<Array> takeResults(const CallFrame& frame, const Slots& slots, std::
 
 struct Module::State {
   ModuleRecord record;
-  std::optional<LoadedLibrary> library;
+  std::optional<LoadedModule> library;
   EntryPoint entryPoint = nullptr;  // null when unloaded
   LiveCounts leaks;
 

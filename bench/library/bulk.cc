@@ -5,7 +5,7 @@
 #include <numeric>
 #include <vector>
 
-#include "bench/library/calls.h"
+#include "bench/library/plain_calls.h"
 
 namespace ambrix_bench {
 namespace {

@@ -4,7 +4,7 @@
 #include <filesystem>
 #include <vector>
 
-#include "bench/library/calls.h"
+#include "bench/library/plain_calls.h"
 
 namespace ambrix_bench {
 namespace {

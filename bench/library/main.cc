@@ -1,5 +1,5 @@
 // The bare calls of the CDF library that each command stands for.
-#include "bench/library/calls.h"
+#include "bench/library/plain_calls.h"
 
 int main(int argumentCount, char** arguments) {
   using namespace ambrix_bench;

@@ -2,7 +2,7 @@
 #include <algorithm>
 #include <vector>
 
-#include "bench/library/calls.h"
+#include "bench/library/plain_calls.h"
 
 namespace ambrix_bench {
 

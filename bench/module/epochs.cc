@@ -1,5 +1,5 @@
 // Times converted by the million.
-#include "bench/module/commands.h"
+#include "bench/module/module_calls.h"
 
 namespace ambrix_bench {
 namespace {

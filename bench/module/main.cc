@@ -1,5 +1,5 @@
 // The workloads through the module.
-#include "bench/module/commands.h"
+#include "bench/module/module_calls.h"
 
 int main(int argumentCount, char** arguments) {
   using namespace ambrix_bench;

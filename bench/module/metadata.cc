@@ -1,5 +1,5 @@
 // What there is to know of many variables.
-#include "bench/module/commands.h"
+#include "bench/module/module_calls.h"
 
 namespace ambrix_bench {
 namespace {

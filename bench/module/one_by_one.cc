@@ -1,7 +1,7 @@
 // Small things many times: values, and calls that touch no file.
 #include <cstdint>
 
-#include "bench/module/commands.h"
+#include "bench/module/module_calls.h"
 #include "variables/characters.h"
 
 namespace ambrix_bench {

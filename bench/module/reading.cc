@@ -1,5 +1,5 @@
 // Much data in one call, to be read.
-#include "bench/module/commands.h"
+#include "bench/module/module_calls.h"
 
 namespace ambrix_bench {
 namespace {

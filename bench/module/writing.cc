@@ -2,7 +2,7 @@
 #include <filesystem>
 #include <numeric>
 
-#include "bench/module/commands.h"
+#include "bench/module/module_calls.h"
 
 namespace ambrix_bench {
 namespace {

@@ -4,7 +4,7 @@
 #include <vector>
 
 #include "fuzz/calls/choices.h"
-#include "fuzz/calls/commands.h"
+#include "fuzz/calls/command_signatures.h"
 #include "fuzz/calls/values.h"
 #include "fuzz/calls/world.h"
 

@@ -7,7 +7,7 @@
 #include <string_view>
 #include <vector>
 
-#include "fuzz/calls/commands.h"
+#include "fuzz/calls/command_signatures.h"
 #include "fuzz/calls/world.h"
 
 namespace ambrix_fuzz {

@@ -19,7 +19,7 @@
 
 #include "fuzz/calls/call_log.h"
 #include "fuzz/calls/checks.h"
-#include "fuzz/calls/commands.h"
+#include "fuzz/calls/command_signatures.h"
 #include "fuzz/calls/sequence.h"
 
 namespace ambrix_fuzz {

@@ -37,7 +37,7 @@ TEST(BlameTest, SourcesMayBeRelativeToTheBuild) {
       "    #0 0x7f02 in CDFlib ../cdf/cdf-3.6.3-source/src/lib/cdflib.c:1\n";
   const std::string module =
       "    #1 0x7f03 in TOLVEX::ambrix::f() ../../variables/read_data.cc:50\n";
-  const std::string header = "    #1 0x7f03 in g() layers/gateway/gateway/library.h:54\n";
+  const std::string header = "    #1 0x7f03 in g() layers/gateway/gateway/library_calls.h:54\n";
   EXPECT_FALSE(blameOf("ERROR\n" + library + module).ours);
   EXPECT_TRUE(blameOf("ERROR\n" + kSystem + module + library).ours);
   EXPECT_TRUE(blameOf("ERROR\n" + kSystem + header + library).ours);

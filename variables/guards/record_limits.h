@@ -5,7 +5,7 @@
 
 #include <cstddef>
 
-#include "gateway/library.h"
+#include "gateway/library_calls.h"
 #include "variables/variable_description.h"
 
 namespace TOLVEX::ambrix {

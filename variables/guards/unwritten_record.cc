@@ -31,7 +31,8 @@ void fillWithPadValue(const VariableOperation& variable, const VariableDescripti
 
 }  // namespace
 
-bool lacksItsRecord(const VariableOperation& variable, const VariableDescription& description) {
+bool mustFillUnwrittenRecord(const VariableOperation& variable,
+                             const VariableDescription& description) {
   if (!libraryFaults().leavesUnwrittenRecords || description.recordVariance != NOVARY) return false;
   constexpr long kVersionThatPads = 3;
   long last = 0;

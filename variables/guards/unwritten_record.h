@@ -1,17 +1,19 @@
-// Guard: records that do not vary and were never written, in files of the format of version 2.
+// Guard: an unwritten record of a variable whose records do not vary, in a file of the version 2
+// format.
 //
-// Fault, in 3.6.3: reading such a record, the library fills the result with whatever lies in memory
-// before it. In files of the newer format it gives pad values, which take their place here.
+// Fault of 3.6.3, not of 3.9.1: the library fills the result with the memory before it. In files of
+// the version 3 format it returns pad values. These functions return the same pad values.
 #pragma once
 
 #include "variables/hyperslab.h"
 
 namespace TOLVEX::ambrix {
 
-/// Whether the library has the fault and would read such a record.
-bool lacksItsRecord(const VariableOperation& variable, const VariableDescription& description);
+/// True if the library has the fault and the record is such a record.
+bool mustFillUnwrittenRecord(const VariableOperation& variable,
+                             const VariableDescription& description);
 
-// What takes the place of reading: the result is filled with the variable's pad value.
+// Called in place of reading: they fill the result with the variable's pad value.
 
 void fillRecord(const VariableOperation& variable, const VariableDescription& description,
                 void* result);

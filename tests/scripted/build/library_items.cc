@@ -1,5 +1,5 @@
 // Compiles unless MISTAKE says which wrong type the call gets: 1 an int, 0 an unsigned long.
-#include "gateway/library.h"
+#include "gateway/library_calls.h"
 
 namespace TOLVEX::ambrix {
 

@@ -1,7 +1,7 @@
 // Every error class: its component, its identifier, and the kinds and order of its values.
 #include "gateway/errors.h"
 
-#include "gateway/library.h"
+#include "gateway/library_calls.h"
 #include "tests/support/scripted_test.h"
 
 namespace ambrix_test {

@@ -2,7 +2,7 @@
 #pragma once
 
 #include "gateway/arguments.h"
-#include "gateway/library.h"
+#include "gateway/library_calls.h"
 
 namespace TOLVEX::ambrix {
 

@@ -10,7 +10,7 @@
 namespace TOLVEX::ambrix {
 
 /// Host elements of one value: 2 doubles of an epoch16, the characters of a text, else 1.
-long elementsPerValue(const VariableDescription& variable);
+long elementsPerValue(const VariableDescription& description);
 
 bool hasElements(const qvArray* data, long expected);
 
@@ -20,11 +20,11 @@ void requireClassOfDatatype(const qvArray* data, long datatype);
 
 /// A host array's data as they are, or its characters narrowed to bytes with a zero byte behind
 /// them.
-class LibraryData {
+class BytesToWrite {
  public:
-  explicit LibraryData(const qvArray* data);
+  explicit BytesToWrite(const qvArray* data);
   /// Of a text the first character only, followed by zeros up to its length.
-  static LibraryData firstCharacterOf(const qvArray* data);
+  static BytesToWrite firstCharacterOf(const qvArray* data);
 
   /// Never null, so that the library can be handed an empty value.
   [[nodiscard]] void* bytes() const;

@@ -1,4 +1,4 @@
-#include "bench/module/commands.h"
+#include "bench/module/module_calls.h"
 
 #include <utility>
 

@@ -99,7 +99,4 @@ class VariableOperation {
 /// `ROW_MAJOR` files hold their last dimension fastest, the host its first.
 bool isRowMajor(CdfId file);
 
-/// Whether variables have no files of their own.
-bool isSingleFile(CdfId file, const char* routine);
-
 }  // namespace TOLVEX::ambrix

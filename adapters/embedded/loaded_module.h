@@ -9,10 +9,10 @@
 namespace ambrix {
 
 /// A module that is loaded as long as this lives, built for this release of the host.
-class LoadedLibrary {
+class LoadedModule {
  public:
   /// Throws `LoadError`.
-  explicit LoadedLibrary(const std::filesystem::path& path);
+  explicit LoadedModule(const std::filesystem::path& path);
 
   [[nodiscard]] decltype(&qvhFunction) entryPoint() const noexcept { return entryPoint_; }
 

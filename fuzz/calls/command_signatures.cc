@@ -1,4 +1,4 @@
-#include "fuzz/calls/commands.h"
+#include "fuzz/calls/command_signatures.h"
 
 #include <algorithm>
 #include <iterator>

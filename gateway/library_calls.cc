@@ -1,4 +1,4 @@
-#include "gateway/library.h"
+#include "gateway/library_calls.h"
 
 #include <bit>
 #include <cstddef>
@@ -37,12 +37,6 @@ bool isRowMajor(CdfId file) {
   long majority = 0;
   callOnFile("CDFgetMajority", file, GET_, CDF_MAJORITY_, &majority);
   return majority == ROW_MAJOR;
-}
-
-bool isSingleFile(CdfId file, const char* routine) {
-  long format = 0;
-  callOnFile(routine, file, GET_, CDF_FORMAT_, &format);
-  return format == SINGLE_FILE;
 }
 
 }  // namespace TOLVEX::ambrix

@@ -1,4 +1,4 @@
-#include "bench/library/calls.h"
+#include "bench/library/plain_calls.h"
 
 #include <algorithm>
 #include <filesystem>

@@ -1,4 +1,4 @@
-#include "variables/library_data.h"
+#include "variables/bytes_to_write.h"
 
 #include <cdf.h>
 
@@ -12,9 +12,9 @@
 
 namespace TOLVEX::ambrix {
 
-long elementsPerValue(const VariableDescription& variable) {
-  if (variable.datatype == CDF_EPOCH16) return 2;
-  return isCharacterDatatype(variable.datatype) ? variable.elements : 1;
+long elementsPerValue(const VariableDescription& description) {
+  if (description.datatype == CDF_EPOCH16) return 2;
+  return isCharacterDatatype(description.datatype) ? description.elements : 1;
 }
 
 bool hasElements(const qvArray* data, long expected) {
@@ -26,21 +26,21 @@ void requireClassOfDatatype(const qvArray* data, long datatype) {
   raiseError(cdflib::datatypeMismatch(qvGetClassName(data), datatypeName(datatype)));
 }
 
-LibraryData::LibraryData(const qvArray* data) : numbers_(qvGetReadOnlyData(data)) {
+BytesToWrite::BytesToWrite(const qvArray* data) : numbers_(qvGetReadOnlyData(data)) {
   if (qvGetClassID(data) != qvCHAR_CLASS) return;
   const std::size_t count = qvGetNumberOfElements(data);
   characters_.emplace(count);
   narrowCharacters(qvGetReadOnlyChars(data), count, characters_->data());
 }
 
-LibraryData LibraryData::firstCharacterOf(const qvArray* data) {
-  LibraryData first(data);
+BytesToWrite BytesToWrite::firstCharacterOf(const qvArray* data) {
+  BytesToWrite first(data);
   const std::size_t count = qvGetNumberOfElements(data);
   if (first.characters_ && count > 1) std::memset(first.characters_->data() + 1, 0, count - 1);
   return first;
 }
 
-void* LibraryData::bytes() const {
+void* BytesToWrite::bytes() const {
   static char nothing = '\0';
   if (characters_) return characters_->data();
   return numbers_ == nullptr ? &nothing : const_cast<void*>(numbers_);

@@ -1,4 +1,4 @@
-#include "adapters/embedded/loaded_library.h"
+#include "adapters/embedded/loaded_module.h"
 
 #include <dlfcn.h>
 
@@ -73,7 +73,7 @@ Function* find(void* handle, const char* name, const std::filesystem::path& path
 
 }  // namespace
 
-LoadedLibrary::LoadedLibrary(const std::filesystem::path& path) : handle_(open(path)) {
+LoadedModule::LoadedModule(const std::filesystem::path& path) : handle_(open(path)) {
   entryPoint_ = find<decltype(qvhFunction)>(handle_.get(), "qvhFunction", path);
   auto* const askVersion =
       find<decltype(qvhfilerequiredapiversion)>(handle_.get(), "qvhfilerequiredapiversion", path);
@@ -85,7 +85,7 @@ LoadedLibrary::LoadedLibrary(const std::filesystem::path& path) : handle_(open(p
                  versionText(qvhReleaseCode, qvhApiVersion) + '.');
 }
 
-void LoadedLibrary::Close::operator()(void* handle) const noexcept {
+void LoadedModule::Close::operator()(void* handle) const noexcept {
   {
     const std::scoped_lock lock(loadedModules().mutex);
     loadedModules().handles.erase(handle);
