@@ -27,21 +27,21 @@ bool isWant(const Error& error) {
          });
 }
 
-void tellCause(const Problem& problem, bool want) {
+void reportCause(const Problem& problem, bool want) {
   const Scarcity* const scarcity = findScarcity();
-  if (scarcity != nullptr) tellUnread(problemOf(*scarcity));
-  if (scarcity != nullptr || want) return tellUnread(problem);
-  tellProblem(problem);
+  if (scarcity != nullptr) reportUnread(problemOf(*scarcity));
+  if (scarcity != nullptr || want) return reportUnread(problem);
+  reportProblem(problem);
 }
 
 }  // namespace
 
-void tellError(const std::string& place, const Error& error) {
-  tellCause({place, error.identifier(), error.what()}, isWant(error));
+void reportError(const std::string& place, const Error& error) {
+  reportCause({place, error.identifier(), error.what()}, isWant(error));
 }
 
-void tellRefusal(const OpenError& error) {
-  tellCause({"", error.identifier(), error.what()}, false);
+void reportRefusal(const OpenError& error) {
+  reportCause({"", error.identifier(), error.what()}, false);
 }
 
 }  // namespace ambrix::tool

@@ -36,26 +36,26 @@ int unreadable(const std::string& path) {
 
 /// The work of a child. Only what it tells counts; what it cannot tell is a failure of its own.
 int examine(const std::string& path) try {
-  tellScarcityInCrashes();
+  reportScarcityInCrashes();
   Module module;
   module.setWarningHandler([](const MessageId&) {});
   setByteLimit(kSessionArrayBytes);
   examineFile(module, path);
   return EXIT_SUCCESS;
 } catch (const Error& error) {
-  tellError("", error);
+  reportError("", error);
   return EXIT_SUCCESS;
 } catch (const OpenError& error) {
-  tellRefusal(error);
+  reportRefusal(error);
   return EXIT_SUCCESS;
 } catch (const ToolError& error) {
-  tellUnread({"", error.identifier(), error.what()});
+  reportUnread({"", error.identifier(), error.what()});
   return EXIT_SUCCESS;
 } catch (const LoadError& error) {
-  tellUnread({"", "ambrix:moduleNotLoaded", error.what()});
+  reportUnread({"", "ambrix:moduleNotLoaded", error.what()});
   return EXIT_SUCCESS;
 } catch (const std::exception& error) {
-  tellUnread({"", "ambrix:failure", error.what()});
+  reportUnread({"", "ambrix:failure", error.what()});
   return EXIT_SUCCESS;
 }
 
@@ -75,8 +75,8 @@ Verdict check(const std::string& path, const Limits& limits) try {
     return verdict;
   }
   const WorkerEnd end = supervise(limits, [&] { return examine(path); });
-  takeFindings(end.told, verdict);
-  verdict.unlisted = end.untold;
+  takeFindings(end.reports, verdict);
+  verdict.unlisted = end.unreported;
   if (end.kind != WorkerEnd::Kind::kDone) {
     auto& list = tellsOfDamage(end, verdict) ? verdict.problems : verdict.unread;
     list.push_back({"", "ambrix:" + identifierOf(end), describeEnd(end, limits)});

@@ -44,18 +44,18 @@ struct Verdict {
 /// is known not to be. It does not depend on whether anybody reads the output.
 int runCheck(const CheckOptions& options, const Limits& limits, StandardOutput& output);
 
-/// Reads all that is in a file and tells its watcher what it finds.
+/// Reads everything in a file and reports its findings to the watcher.
 void examineFile(Module& module, const std::string& path);
 
-/// Findings as the lines that a worker leaves, and back.
-void tellProblem(const Problem& problem);
-void tellUnread(const Problem& problem);
+/// Findings as the lines of a report, and back.
+void reportProblem(const Problem& problem);
+void reportUnread(const Problem& problem);
 std::string unreadFinding(const Problem& problem);
-/// Tells of an error at a place: whether the file is to blame, or want of something.
-void tellError(const std::string& place, const Error& error);
-void tellRefusal(const OpenError& error);
-void tellUnsupported(const std::string& what);
-void takeFindings(std::string_view told, Verdict& verdict);
+/// Reports an error at a place, with its cause: the file, or a lack of memory or space.
+void reportError(const std::string& place, const Error& error);
+void reportRefusal(const OpenError& error);
+void reportUnsupported(const std::string& what);
+void takeFindings(std::string_view reports, Verdict& verdict);
 
 std::string verdictAsText(const Verdict& verdict);
 std::string verdictsAsJson(const std::vector<Verdict>& verdicts);

@@ -70,12 +70,12 @@ class Examination {
 void Examination::attempt(const std::string& place, const std::function<void()>& read) try {
   read();
 } catch (const Error& error) {
-  tellError(place, error);
+  reportError(place, error);
   recover();
 } catch (const DamagedCounts& error) {
-  tellProblem({place, error.identifier(), error.what()});
+  reportProblem({place, error.identifier(), error.what()});
 } catch (const ToolError& error) {
-  tellUnread({place, error.identifier(), error.what()});
+  reportUnread({place, error.identifier(), error.what()});
 }
 
 void Examination::open() {
@@ -97,7 +97,7 @@ void Examination::readVariable(double number) {
     place = quoted("variable", file_->text("getVarName", {number}));
     const VariableFacts facts = readVariableFacts(module_, *file_, number);
     if (facts.definition.supported) return readValues(facts);
-    tellUnsupported(place + " (" + facts.definition.datatype + ")");
+    reportUnsupported(place + " (" + facts.definition.datatype + ")");
   });
 }
 
@@ -130,8 +130,8 @@ void Examination::readAttribute(double number) {
     place = quoted("attribute", inquireAttribute(*file_, number).name);
     for (const EntryFacts& entry : readAttributeFacts(module_, *file_, number).entries) {
       if (entry.supported) continue;
-      tellUnsupported("entry " + std::to_string(static_cast<long>(entry.number)) + " of " + place +
-                      " (" + entry.datatype + ")");
+      reportUnsupported("entry " + std::to_string(static_cast<long>(entry.number)) + " of " +
+                        place + " (" + entry.datatype + ")");
     }
   });
 }

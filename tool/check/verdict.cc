@@ -55,8 +55,8 @@ Soundness Verdict::soundness() const {
   return unread.empty() && unsupported.empty() ? Soundness::kSound : Soundness::kUndecided;
 }
 
-void tellProblem(const Problem& problem) {
-  tell(problemAsJson(problem).dump());
+void reportProblem(const Problem& problem) {
+  report(problemAsJson(problem).dump());
 }
 
 std::string unreadFinding(const Problem& problem) {
@@ -65,16 +65,16 @@ std::string unreadFinding(const Problem& problem) {
   return finding.dump();
 }
 
-void tellUnread(const Problem& problem) {
-  tell(unreadFinding(problem), kRoomToTell / 2);  // problems always find room
+void reportUnread(const Problem& problem) {
+  report(unreadFinding(problem), kRoomForReports / 2);  // problems always find room
 }
 
-void tellUnsupported(const std::string& what) {
-  tell(OrderedJson(toUtf8(what)).dump(), kRoomToTell / 2);
+void reportUnsupported(const std::string& what) {
+  report(OrderedJson(toUtf8(what)).dump(), kRoomForReports / 2);
 }
 
-void takeFindings(std::string_view told, Verdict& verdict) {
-  std::istringstream lines{std::string(told)};
+void takeFindings(std::string_view reports, Verdict& verdict) {
+  std::istringstream lines{std::string(reports)};
   for (std::string line; std::getline(lines, line);) {
     const OrderedJson finding = OrderedJson::parse(line);
     if (finding.is_string()) {

@@ -45,10 +45,10 @@ void readNamed(const std::string& file, const std::function<void()>& read) try {
 
 /// A worker that crashed for want of something says nothing of its file.
 void requirePlenty(const WorkerEnd& end, const std::string& file) {
-  Verdict told;
-  takeFindings(end.told, told);
-  if (end.kind == WorkerEnd::Kind::kDone || told.unread.empty()) return;
-  const Problem& want = told.unread.front();
+  Verdict found;
+  takeFindings(end.reports, found);
+  if (end.kind == WorkerEnd::Kind::kDone || found.unread.empty()) return;
+  const Problem& want = found.unread.front();
   throw FileError(file, want.identifier, want.message);
 }
 
@@ -57,7 +57,7 @@ int readInWorker(const Context& context, const std::string& file,
                  const std::function<void(Module&)>& read) {
   const Limits& limits = context.arguments.limits;
   const auto work = [&] {
-    tellScarcityInCrashes();
+    reportScarcityInCrashes();
     Module module;
     module.setWarningHandler(printWarning);
     setByteLimit(kSessionArrayBytes);

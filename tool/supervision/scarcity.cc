@@ -50,8 +50,9 @@ std::array<std::string, 2>& lastWords() {
   return lines;
 }
 
-void tellAndCrash(int signal) {
-  if (const Scarcity* scarcity = findScarcity()) tell(lastWords().at(scarcity == &kMemory ? 1 : 0));
+void reportAndCrash(int signal) {
+  if (const Scarcity* scarcity = findScarcity())
+    report(lastWords().at(scarcity == &kMemory ? 1 : 0));
   std::raise(signal);  // the handler is gone
 }
 
@@ -75,11 +76,11 @@ Problem problemOf(const Scarcity& scarcity) {
   return {"", scarcity.identifier, scarcity.message};
 }
 
-void tellScarcityInCrashes() {
+void reportScarcityInCrashes() {
   lastWords();
   useOtherStack();
   struct sigaction action = {};
-  action.sa_handler = tellAndCrash;
+  action.sa_handler = reportAndCrash;
   action.sa_flags = static_cast<int>(SA_ONSTACK | SA_RESETHAND | SA_NODEFER);
   for (const int signal : {SIGSEGV, SIGBUS, SIGABRT, SIGFPE, SIGILL})
     ::sigaction(signal, &action, nullptr);

@@ -18,7 +18,8 @@ const Scarcity* findScarcity() noexcept;
 /// The same as a finding of a check.
 Problem problemOf(const Scarcity& scarcity);
 
-/// From now on a crash of this process while something is scarce is told to the watcher as that.
-void tellScarcityInCrashes();
+/// From now on, a crash of this process while memory or space is scarce is reported as caused by
+/// it.
+void reportScarcityInCrashes();
 
 }  // namespace ambrix::tool

@@ -21,14 +21,14 @@ void beginStep(std::string_view what) {
   ++watched->count;
 }
 
-void tell(std::string_view line, std::size_t andFor) {
+void report(std::string_view line, std::size_t spare) {
   if (watched == nullptr) return;
-  if (line.size() + 1 + andFor > watched->told.size() - watched->toldBytes) {
-    ++watched->untold;
+  if (line.size() + 1 + spare > watched->reports.size() - watched->reportBytes) {
+    ++watched->unreported;
     return;
   }
-  *std::ranges::copy(line, watched->told.data() + watched->toldBytes).out = '\n';
-  watched->toldBytes += line.size() + 1;
+  *std::ranges::copy(line, watched->reports.data() + watched->reportBytes).out = '\n';
+  watched->reportBytes += line.size() + 1;
 }
 
 Pause::Pause() noexcept {
@@ -74,12 +74,12 @@ std::string Steps::last() const {
   return memory_->last.data();
 }
 
-std::string Steps::told() const {
-  return {memory_->told.data(), memory_->toldBytes};
+std::string Steps::reports() const {
+  return {memory_->reports.data(), memory_->reportBytes};
 }
 
-std::size_t Steps::untold() const noexcept {
-  return memory_->untold;
+std::size_t Steps::unreported() const noexcept {
+  return memory_->unreported;
 }
 
 }  // namespace ambrix::tool

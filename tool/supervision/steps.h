@@ -1,4 +1,4 @@
-// What a worker is at: it writes this into memory that it shares with the process watching it.
+// The steps of a worker, the process that reads a file, in memory that it shares with its watcher.
 #pragma once
 
 #include <array>
@@ -10,18 +10,18 @@
 
 namespace ambrix::tool {
 
-/// Says what begins now, "reading variable 3" for example. The clock of the time limit starts
-/// anew. Without a watcher, none of what is here does anything.
+/// Names the step that begins, such as "reading variable 3", and restarts the clock of the time
+/// limit. Without a watcher the functions here do nothing.
 void beginStep(std::string_view what);
 
-/// The bytes that a worker may leave for its watcher.
-inline constexpr std::size_t kRoomToTell = 1 << 18;
+/// The bytes of all reports of a worker.
+inline constexpr std::size_t kRoomForReports = 1 << 18;
 
-/// Leaves a line for the watcher, who finds it however the worker ends. When there is no room for
-/// it and for as much more, it is only counted.
-void tell(std::string_view line, std::size_t andFor = 0);
+/// Leaves a line for the watcher, also if the worker crashes later. The line is only counted if
+/// fewer than `spare` bytes would remain.
+void report(std::string_view line, std::size_t spare = 0);
 
-/// While one of these exists no time counts, because the worker waits for somebody else.
+/// Stops the clock of the time limit while it exists, because the worker waits for another process.
 class Pause {
  public:
   Pause() noexcept;
@@ -30,7 +30,7 @@ class Pause {
   ~Pause();
 };
 
-/// The shared memory. The watcher reads the texts when the worker is gone.
+/// The shared memory. The watcher reads the texts after the worker has ended.
 class Steps {
  public:
   Steps();
@@ -38,28 +38,28 @@ class Steps {
   Steps& operator=(const Steps&) = delete;
   ~Steps();
 
-  /// Makes this process the one that is watched.
+  /// Makes this process the watched one.
   void adopt() const noexcept;
-  /// Says that the work has been done to its end.
+  /// Marks the work as complete.
   void finish() const noexcept;
 
   [[nodiscard]] bool finished() const noexcept;
   [[nodiscard]] bool paused() const noexcept;
-  /// How many steps have begun.
+  /// The number of steps begun.
   [[nodiscard]] std::uint32_t count() const noexcept;
   [[nodiscard]] std::string last() const;
-  [[nodiscard]] std::string told() const;
-  /// How many lines found no room.
-  [[nodiscard]] std::size_t untold() const noexcept;
+  [[nodiscard]] std::string reports() const;
+  /// The number of lines for which there was no room.
+  [[nodiscard]] std::size_t unreported() const noexcept;
 
   struct Memory {
     std::atomic<std::uint32_t> count;
     std::atomic<std::uint32_t> pauses;
     std::atomic<bool> finished;
     std::array<char, 1024> last;
-    std::size_t toldBytes;
-    std::array<char, kRoomToTell> told;
-    std::size_t untold;
+    std::size_t reportBytes;
+    std::array<char, kRoomForReports> reports;
+    std::size_t unreported;
   };
 
  private:

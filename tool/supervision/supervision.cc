@@ -149,8 +149,8 @@ WorkerEnd supervise(const Limits& limits, const std::function<int()>& work) {
   }
   WorkerEnd end = watch(worker, held, steps, limits.seconds);
   end.step = steps.last();
-  end.told = steps.told();
-  end.untold = steps.untold();
+  end.reports = steps.reports();
+  end.unreported = steps.unreported();
   if (end.kind == Kind::kInterrupted) std::raise(end.signal);
   return end;
 }

@@ -23,11 +23,11 @@ struct Limits {
 struct WorkerEnd {
   enum class Kind { kDone, kCrashed, kQuit, kKilled, kTooSlow, kInterrupted };
   Kind kind = Kind::kDone;
-  int status = 0;          // what the work returned, if it is done
-  int signal = 0;          // that ended it otherwise
-  std::string step;        // the last that it began
-  std::string told;        // the lines that it left
-  std::size_t untold = 0;  // how many more there were
+  int status = 0;              // what the work returned, if it is done
+  int signal = 0;              // that ended it otherwise
+  std::string step;            // the last that it began
+  std::string reports;         // the lines that it left
+  std::size_t unreported = 0;  // how many more there were
 };
 
 /// Runs the work, which throws nothing, in a child that is watched and may take what the limits
