@@ -15,6 +15,12 @@ qvArray* owned(const qvArray* array) {
   return const_cast<qvArray*>(array);
 }
 
+void requireOwnElements(const qvArray& array) {
+  if (array.storage == Storage::kBorrowed) {
+    throw std::logic_error("the elements of the array are borrowed");
+  }
+}
+
 qvArray* make(ClassId classId, Sizes sizes, Content content) {
   return makeArray(static_cast<qvClassID>(classId), sizes, content);
 }
@@ -48,6 +54,11 @@ Array Array::fromBytes(ClassId classId, Sizes sizes, std::span<const std::byte> 
   return array;
 }
 
+Array Array::borrowed(ClassId classId, Sizes sizes, std::span<const std::byte> elements,
+                      std::shared_ptr<const void> keeper) {
+  return Array(borrowElements(static_cast<qvClassID>(classId), sizes, elements, std::move(keeper)));
+}
+
 Array Array::text(std::u16string_view units) {
   return Array(makeText(units));
 }
@@ -78,6 +89,26 @@ Array Array::adopt(qvArray* array) noexcept {
 
 qvArray* Array::release() noexcept {
   return owned(std::exchange(array_, nullptr));
+}
+
+void* Array::mutableElementsOf(ClassId classId) {
+  const void* const elements = elementsOf(classId);
+  requireOwnElements(*array_);
+  return const_cast<void*>(elements);
+}
+
+OwnedElements Array::releaseElements() {
+  if (array_ == nullptr) throw std::logic_error("there is no array");
+  if (array_->classId == qvCELL_CLASS) throw std::logic_error("a cell array keeps its elements");
+  requireOwnElements(*array_);
+  OwnedElements elements(array_->elements, FreeElements(owned(array_)));
+  if (!elements) *this = Array();  // nobody would free what is left of it
+  (void)release();
+  return elements;
+}
+
+void FreeElements::operator()(void*) const noexcept {
+  destroyArray(array_);
 }
 
 }  // namespace ambrix

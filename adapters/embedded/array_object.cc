@@ -7,6 +7,7 @@
 #include <new>
 #include <stdexcept>
 #include <type_traits>
+#include <utility>
 
 #include "adapters/embedded/allocation.h"
 #include "adapters/embedded/host_errors.h"
@@ -44,7 +45,6 @@ Shape shapeOf(qvClassID classId, std::span<const std::size_t> sizes) {
   if (__builtin_mul_overflow(shape.elementCount, elementBytes(classId), &shape.bytes)) {
     raiseOutOfMemory();
   }
-  requireWithinLimit(shape.bytes);
   while (sizes.size() > 2 && sizes.back() == 1)
     sizes = sizes.first(sizes.size() - 1);
   shape.sizes = sizes;
@@ -64,9 +64,30 @@ std::size_t roundUp(std::size_t bytes) {
   return (bytes + kAlignment - 1) / kAlignment * kAlignment;
 }
 
-struct Release {
-  void operator()(void* memory) const noexcept { release(memory); }
+/// Where the elements lie when they are few, and what keeps them when they are borrowed.
+void* behindSizes(qvArray& array) {
+  const std::size_t headBytes = sizeof(qvArray) + array.dimensionCount * sizeof(std::size_t);
+  return reinterpret_cast<std::byte*>(&array) + roundUp(headBytes);
+}
+
+using Keeper = std::shared_ptr<const void>;
+
+struct ReleaseHead {
+  void operator()(qvArray* array) const noexcept { release(array); }
 };
+using Head = std::unique_ptr<qvArray, ReleaseHead>;
+
+/// An array without elements, and room behind it.
+Head makeHead(qvClassID classId, const Shape& shape, std::size_t room) {
+  const std::size_t headBytes =
+      roundUp(sizeof(qvArray) + shape.dimensionCount * sizeof(std::size_t));
+  Head array(new (allocate(headBytes + room)) qvArray);
+  array->classId = classId;
+  array->elementCount = shape.elementCount;
+  array->dimensionCount = shape.dimensionCount;
+  storeSizes(*array, shape);
+  return array;
+}
 
 }  // namespace
 
@@ -99,27 +120,41 @@ std::size_t elementBytes(qvClassID classId) noexcept {
 qvArray* makeArray(qvClassID classId, std::span<const std::size_t> sizes, Content content) {
   if (elementBytes(classId) == 0) throw std::logic_error("no array can have this class");
   const Shape shape = shapeOf(classId, sizes);
+  requireWithinLimit(shape.bytes);
   const bool zeroed = content == Content::kZero || classId == qvCELL_CLASS;
   const bool isInline = shape.bytes <= kMostInlineBytes;
-  const std::size_t headBytes =
-      roundUp(sizeof(qvArray) + shape.dimensionCount * sizeof(std::size_t));
 
-  std::unique_ptr<void, Release> block(allocate(headBytes + (isInline ? shape.bytes : 0)));
-  auto* const array = new (block.get()) qvArray;
-  array->classId = classId;
-  array->elementCount = shape.elementCount;
-  array->dimensionCount = shape.dimensionCount;
-  array->ownsElements = !isInline;
-  storeSizes(*array, shape);
+  Head array = makeHead(classId, shape, isInline ? shape.bytes : 0);
   if (!isInline) {
     array->elements = zeroed ? allocateZeroed(shape.bytes) : allocate(shape.bytes);
+    array->storage = Storage::kOwnBlock;
   } else if (shape.bytes != 0) {
-    array->elements = static_cast<std::byte*>(block.get()) + headBytes;
+    array->elements = behindSizes(*array);
     if (zeroed) std::memset(array->elements, 0, shape.bytes);
   }
   countArray(1);
-  block.release();
-  return array;
+  return array.release();
+}
+
+qvArray* borrowElements(qvClassID classId, std::span<const std::size_t> sizes,
+                        std::span<const std::byte> elements, std::shared_ptr<const void> keeper) {
+  const std::size_t each = elementBytes(classId);
+  if (each == 0 || classId == qvCELL_CLASS) {
+    throw std::invalid_argument("elements of this class can't be borrowed");
+  }
+  const Shape shape = shapeOf(classId, sizes);
+  if (shape.bytes != elements.size()) {
+    throw std::invalid_argument("the data do not fill the array");
+  }
+  if (reinterpret_cast<std::uintptr_t>(elements.data()) % each != 0) {
+    throw std::invalid_argument("the data are not aligned");
+  }
+  Head array = makeHead(classId, shape, sizeof(Keeper));
+  new (behindSizes(*array)) Keeper(std::move(keeper));
+  array->elements = const_cast<std::byte*>(elements.data());  // `storage` keeps all from writing
+  array->storage = Storage::kBorrowed;
+  countArray(1);
+  return array.release();
 }
 
 namespace {
@@ -134,6 +169,11 @@ Tracked* chainCells(const qvArray& array, Tracked* chain) noexcept {
   return chain;
 }
 
+void releaseElements(qvArray& array) noexcept {
+  if (array.storage == Storage::kOwnBlock) return release(array.elements);
+  std::destroy_at(static_cast<Keeper*>(behindSizes(array)));
+}
+
 }  // namespace
 
 void destroyArray(qvArray* array) noexcept {
@@ -145,7 +185,7 @@ void destroyArray(qvArray* array) noexcept {
     auto* const next = reinterpret_cast<qvArray*>(pending);
     pending = next->place.next;
     if (next->classId == qvCELL_CLASS) pending = chainCells(*next, pending);
-    if (next->ownsElements) release(next->elements);
+    if (next->storage != Storage::kInline) releaseElements(*next);
     release(next);
     countArray(-1);
   }

@@ -2,18 +2,25 @@
 #pragma once
 
 #include <cstddef>
+#include <memory>
 #include <span>
 #include <string_view>
 
 #include "adapters/common/array_functions.h"
 #include "adapters/embedded/tracked_list.h"
 
+namespace ambrix {
+
+enum class Storage : unsigned char { kInline, kOwnBlock, kBorrowed };
+
+}  // namespace ambrix
+
 /// One block of memory: this, the sizes and, when they are few, the elements. Many elements have
-/// a block of their own.
+/// a block of their own. Behind the sizes of borrowed elements is what keeps them.
 struct alignas(std::max_align_t) qvArray {
   ambrix::Tracked place;  // must stay first: lists hold this
   qvClassID classId = qvUNKNOWN_CLASS;
-  bool ownsElements = false;  // in a block of their own
+  ambrix::Storage storage = ambrix::Storage::kInline;
   std::size_t elementCount = 0;
   std::size_t dimensionCount = 0;
   void* elements = nullptr;  // null when there are none
@@ -36,6 +43,11 @@ std::size_t elementBytes(qvClassID classId) noexcept;
 /// A new array that is on no list and belongs to the caller. Cells are always unset. Raises the
 /// host's errors; throws std::logic_error for a class that arrays cannot have.
 qvArray* makeArray(qvClassID classId, std::span<const std::size_t> sizes, Content content);
+
+/// The same over elements of somebody else. Throws std::invalid_argument for elements that do not
+/// fill the sizes, are not aligned or of a class that has none.
+qvArray* borrowElements(qvClassID classId, std::span<const std::size_t> sizes,
+                        std::span<const std::byte> elements, std::shared_ptr<const void> keeper);
 
 /// A deep copy that is on no list and belongs to the caller.
 qvArray* copyArray(const qvArray& array);

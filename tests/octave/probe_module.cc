@@ -44,8 +44,7 @@ qvArray* row(std::span<const double> values) {
   return array;
 }
 
-// --- What arguments are
-// ---------------------------------------------------------------------------
+// --- What arguments are ---------------------------------------------------------------------
 
 void inspect(const Call& call) {
   const qvArray* const array = call.arguments[0];
@@ -73,8 +72,7 @@ void cells(const Call& call) {
   call.outputs[0] = row(classes);
 }
 
-// --- What becomes of results
-// ----------------------------------------------------------------------
+// --- What becomes of results ----------------------------------------------------------------
 
 void zeros(const Call& call) {
   const auto sizes = sizesOf(call.arguments[0]);
@@ -126,8 +124,7 @@ void manyResults(const Call& call) {
     call.outputs[i] = qvCreateDoubleScalar(i == 0 ? call.outputCount : i);
 }
 
-// --- Messages, exceptions and memory
-// --------------------------------------------------------------
+// --- Messages, exceptions and memory --------------------------------------------------------
 
 const MessageId message("TEST:probe", "told", {-5, std::string("n%s"), std::u16string(u"\u20AC")});
 

@@ -2,6 +2,7 @@
 #pragma once
 
 #include <initializer_list>
+#include <memory>
 #include <span>
 #include <string_view>
 #include <type_traits>
@@ -9,6 +10,8 @@
 #include <vector>
 
 #include "ambrix/array_view.h"
+#include "ambrix/export.h"
+#include "ambrix/owned_elements.h"
 
 namespace ambrix {
 
@@ -28,10 +31,10 @@ class Sizes : public std::span<const std::size_t> {
 /// "TOLVEX:host:badDimension" for a size that is negative when taken as signed and
 /// "TOLVEX:host:outOfMemory" for an array that cannot be had, and std::invalid_argument for data
 /// that do not fit the sizes.
-class [[gnu::visibility("default")]] Array : public ArrayView {
+class AMBRIX_EXPORT Array : public ArrayView {
  public:
   Array() noexcept = default;
-  Array(Array && other) noexcept : ArrayView(std::exchange(other.array_, nullptr)) {}
+  Array(Array&& other) noexcept : ArrayView(std::exchange(other.array_, nullptr)) {}
   Array& operator=(Array&& other) noexcept;
   Array(const Array&) = delete;
   Array& operator=(const Array&) = delete;
@@ -43,6 +46,22 @@ class [[gnu::visibility("default")]] Array : public ArrayView {
   static Array uninitialized(ClassId classId, Sizes sizes);
   /// The given bytes as the elements of an array of numbers, characters or logicals.
   static Array fromBytes(ClassId classId, Sizes sizes, std::span<const std::byte> elements);
+
+  /// An array over memory of the caller's, as an argument that is not copied: its elements are read
+  /// where they are, and nobody writes to them, neither the module nor `mutableData`. The memory
+  /// must stay as long as the array, also when a cell array has taken it over; `keeper`, when it is
+  /// given, lives as long as the array and is let go, in whatever thread, with it. It must not
+  /// throw then. Elements are numbers, characters, or logicals with bytes of 0 and 1. They must be
+  /// aligned for their type, else, or when they do not fill the sizes, it is a
+  /// std::invalid_argument. A copy of the array owns its memory. `setByteLimit` does not matter
+  /// here.
+  static Array borrowed(ClassId classId, Sizes sizes, std::span<const std::byte> elements,
+                        std::shared_ptr<const void> keeper = nullptr);
+  template <ArrayElement T>
+  static Array borrowed(std::span<const T> values, Sizes sizes,
+                        std::shared_ptr<const void> keeper = nullptr) {
+    return borrowed(classIdOf<T>(), sizes, std::as_bytes(values), std::move(keeper));
+  }
 
   /// A 1-by-1 array.
   template <ArrayElement T>
@@ -72,32 +91,37 @@ class [[gnu::visibility("default")]] Array : public ArrayView {
   static Array fromNarrow(std::string_view bytes);
 
   /// A cell array with no element set.
-  static Array cell(Sizes sizes) {
-    return zeros(ClassId::kCell, sizes);
-  }
+  static Array cell(Sizes sizes) { return zeros(ClassId::kCell, sizes); }
   /// Puts an array into a cell array, in place of what was there. Throws like `element`.
   void setElement(std::size_t index, Array value);
 
   /// A deep copy.
-  [[nodiscard]] Array clone() const {
-    return copyOf(*this);
-  }
+  [[nodiscard]] Array clone() const { return copyOf(*this); }
   static Array copyOf(ArrayView array);
 
-  /// The elements for writing. Throws std::logic_error when the class holds other values.
+  /// The elements for writing. Throws std::logic_error when the class holds other values and when
+  /// they are borrowed.
   template <ArrayElement T>
   [[nodiscard]] std::span<T> mutableData() {
-    return {static_cast<T*>(const_cast<void*>(elementsOf(classIdOf<T>()))), elementCount()};
+    return {static_cast<T*>(mutableElementsOf(classIdOf<T>())), elementCount()};
   }
   using ArrayView::text;
 
+  /// Gives up the elements, which stay where they are, with the duty to free them; the handle is
+  /// empty then. Null when there are none. Few elements lie in one block of memory with the array's
+  /// sizes: freeing the elements frees all of it, as late for few as for many. Until then
+  /// `liveCounts` counts the array. Throws std::logic_error for a cell array and for elements that
+  /// are borrowed, and leaves the array as it is.
+  [[nodiscard]] OwnedElements releaseElements();
+
   /// Takes over an array that the module's interface has made, from the call that made it as well.
-  static Array adopt(qvArray * array) noexcept;
+  static Array adopt(qvArray* array) noexcept;
   /// Gives the array up; the caller owns it.
   [[nodiscard]] qvArray* release() noexcept;
 
  private:
   explicit Array(const qvArray* array) noexcept : ArrayView(array) {}
+  void* mutableElementsOf(ClassId classId);
 };
 
 }  // namespace ambrix

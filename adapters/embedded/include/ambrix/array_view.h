@@ -9,6 +9,8 @@
 #include <string_view>
 #include <type_traits>
 
+#include "ambrix/export.h"
+
 struct qvArray;
 
 namespace ambrix {
@@ -50,27 +52,22 @@ constexpr ClassId classIdOf() {
 
 /// A C++ type that some class of arrays holds: a number, bool or char16_t.
 template <typename T>
-concept ArrayElement = classIdOf<T>()
-!= ClassId::kUnknown;
+concept ArrayElement = (classIdOf<T>() != ClassId::kUnknown);
 
 /// The class as people know it: "double", "single", "int8", ..., "char", "logical", "cell".
-[[gnu::visibility("default")]] const char* className(ClassId classId) noexcept;
+AMBRIX_EXPORT const char* className(ClassId classId) noexcept;
 
 /// A borrowed array, or none. It is a pointer: copy it freely, and don't outlive the owner.
 /// Apart from `operator bool` and `handle`, members need an array.
-class [[gnu::visibility("default")]] ArrayView {
+class AMBRIX_EXPORT ArrayView {
  public:
   constexpr ArrayView() noexcept = default;
   constexpr explicit ArrayView(const qvArray* array) noexcept : array_(array) {}
 
   /// Whether there is an array.
-  constexpr explicit operator bool() const noexcept {
-    return array_ != nullptr;
-  }
+  constexpr explicit operator bool() const noexcept { return array_ != nullptr; }
   /// The array as the module's interface knows it.
-  [[nodiscard]] constexpr const qvArray* handle() const noexcept {
-    return array_;
-  }
+  [[nodiscard]] constexpr const qvArray* handle() const noexcept { return array_; }
 
   [[nodiscard]] ClassId classId() const noexcept;
   [[nodiscard]] const char* className() const noexcept;
@@ -90,9 +87,7 @@ class [[gnu::visibility("default")]] ArrayView {
 
   /// The units of a character array, first dimension fastest. Throws std::logic_error for others.
   [[nodiscard]] std::u16string_view chars() const;
-  [[nodiscard]] std::u16string text() const {
-    return std::u16string(chars());
-  }
+  [[nodiscard]] std::u16string text() const { return std::u16string(chars()); }
   /// The same as UTF-8; an unpaired surrogate becomes U+FFFD.
   [[nodiscard]] std::string utf8() const;
 

@@ -1,9 +1,11 @@
 // A host inside a C++ program: everything there is to include.
 //
+// clang-format off
 //   ambrix::Module module;
-//   const std::vector<ambrix::Array> file = module.call("open",
-//   {ambrix::Array::fromUtf8("a.cdf")}); const std::vector<ambrix::Array> facts =
-//   module.call("inquire", {file[0]}); module.call("close", {file[0]});
+//   const auto file = module.call("open", {ambrix::Array::fromUtf8("a.cdf")});
+//   const auto facts = module.call("inquire", {file[0]});
+//   module.call("close", {file[0]});
+// clang-format on
 #pragma once
 
 #include "ambrix/array.h"
@@ -11,3 +13,4 @@
 #include "ambrix/error.h"
 #include "ambrix/memory.h"
 #include "ambrix/module.h"
+#include "ambrix/visit.h"

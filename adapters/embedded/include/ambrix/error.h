@@ -7,6 +7,7 @@
 #include <string>
 #include <vector>
 
+#include "ambrix/export.h"
 #include "host/message_id.h"
 
 namespace ambrix {
@@ -16,11 +17,11 @@ using TOLVEX::ambrix::MessageId;
 
 /// The text of a message: a sentence with the message's values in it. Narrow values are taken over
 /// byte by byte, UTF-16 values become UTF-8.
-[[gnu::visibility("default")]] std::string messageText(const MessageId& id);
+AMBRIX_EXPORT std::string messageText(const MessageId& id);
 
 /// An error that the module has raised, or the host itself ("TOLVEX:host:badDimension" and
 /// "TOLVEX:host:outOfMemory"). `what()` is the message text.
-class [[gnu::visibility("default")]] Error : public std::exception {
+class AMBRIX_EXPORT Error : public std::exception {
  public:
   explicit Error(const MessageId& id);
   ~Error() override;
@@ -37,7 +38,7 @@ class [[gnu::visibility("default")]] Error : public std::exception {
 };
 
 /// A module that cannot be loaded; `what()` tells which and why.
-class [[gnu::visibility("default")]] LoadError : public std::runtime_error {
+class AMBRIX_EXPORT LoadError : public std::runtime_error {
  public:
   using std::runtime_error::runtime_error;
   ~LoadError() override;

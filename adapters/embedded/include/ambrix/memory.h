@@ -4,6 +4,8 @@
 #include <cstddef>
 #include <cstdint>
 
+#include "ambrix/export.h"
+
 namespace ambrix {
 
 /// How many arrays and how many of the module's scratch buffers exist in this process. Elements of
@@ -14,17 +16,18 @@ struct LiveCounts {
 
   friend bool operator==(const LiveCounts&, const LiveCounts&) = default;
 };
-[[gnu::visibility("default")]] LiveCounts liveCounts() noexcept;
+AMBRIX_EXPORT LiveCounts liveCounts() noexcept;
 
 /// The most bytes that the elements of one array, or one scratch buffer, may take; beyond it the
 /// error is "TOLVEX:host:outOfMemory". At first there is no limit but the machine's.
-[[gnu::visibility("default")]] void setByteLimit(std::size_t bytes) noexcept;
-[[gnu::visibility("default")]] std::size_t byteLimit() noexcept;
+AMBRIX_EXPORT void setByteLimit(std::size_t bytes) noexcept;
+AMBRIX_EXPORT std::size_t byteLimit() noexcept;
 
 /// For tests: the n-th allocation from now fails, once, as if memory had run out; 0 takes it back.
-/// Small arrays and scratch buffers are one allocation, larger arrays two.
-[[gnu::visibility("default")]] void failAllocation(std::uint64_t n) noexcept;
+/// Small arrays, arrays over borrowed memory and scratch buffers are one allocation, larger arrays
+/// two.
+AMBRIX_EXPORT void failAllocation(std::uint64_t n) noexcept;
 /// Whether the failure asked for is still to come.
-[[gnu::visibility("default")]] bool failurePending() noexcept;
+AMBRIX_EXPORT bool failurePending() noexcept;
 
 }  // namespace ambrix

@@ -13,19 +13,20 @@
 
 #include "ambrix/array.h"
 #include "ambrix/error.h"
+#include "ambrix/export.h"
 #include "ambrix/memory.h"
 
 namespace ambrix {
 
 /// Where the module is installed: ambrix_module.so in the folder of this library.
-[[gnu::visibility("default")]] std::filesystem::path defaultModulePath();
+AMBRIX_EXPORT std::filesystem::path defaultModulePath();
 
 /// All results of a call.
 inline constexpr std::size_t kAllOutputs = std::numeric_limits<std::size_t>::max();
 
 /// A module and the calls of its entry point. Neither the module nor the CDF library behind it may
 /// be entered from two threads at a time; arrays may be made and destroyed on any thread.
-class [[gnu::visibility("default")]] Module {
+class AMBRIX_EXPORT Module {
  public:
   using EntryPoint = void (*)(int, qvArray**, int, const qvArray**);
   using WarningHandler = std::function<void(const MessageId&)>;
@@ -35,7 +36,7 @@ class [[gnu::visibility("default")]] Module {
   explicit Module(const std::filesystem::path& path = defaultModulePath());
   /// A module whose entry point is part of the program.
   explicit Module(EntryPoint entryPoint);
-  Module(Module && other) noexcept;
+  Module(Module&& other) noexcept;
   Module& operator=(Module&& other) noexcept;
   /// Unloads the module.
   ~Module();
