@@ -6,52 +6,44 @@
 
 #include <algorithm>
 #include <cstddef>
-#include <cstdint>
 #include <exception>
 #include <iostream>
 #include <limits>
+#include <span>
 #include <sstream>
 #include <string>
-#include <string_view>
 
 namespace {
 
 using ambrix::Array;
 using ambrix::ArrayView;
-using ambrix::ClassId;
 
 constexpr std::size_t kValuesShown = 4;
 
-/// The first of some numbers. They are T in C++: `data` refuses another type.
+/// The first of some numbers.
 template <typename T>
-std::string firstNumbers(ArrayView values) {
+std::string firstNumbers(std::span<const T> values) {
   std::ostringstream text;
   text.precision(std::numeric_limits<T>::digits10);
-  const auto shown = values.data<T>().first(std::min(values.elementCount(), kValuesShown));
+  const auto shown = values.first(std::min(values.size(), kValuesShown));
   for (const T value : shown)
     text << ' ' << +value;  // the sign makes a number of an int8
-  if (shown.size() < values.elementCount()) text << " ...";
+  if (shown.size() < values.size()) text << " ...";
   return text.str();
 }
 
 /// The first of some texts. Characters are the first dimension; each holds one byte of the file.
-std::string firstText(ArrayView values, std::size_t length) {
-  const std::u16string_view text = values.chars().substr(0, length);
+std::string firstText(std::span<const char16_t> characters, std::size_t length) {
+  const auto text = characters.first(std::min(characters.size(), length));
   return " \"" + std::string(text.begin(), text.end()) + '"';
 }
 
 std::string firstValues(ArrayView values, std::size_t textLength) {
-  const ClassId held = values.classId();
-  if (held == ClassId::kChar) return firstText(values, textLength);
-  if (held == ClassId::kDouble) return firstNumbers<double>(values);
-  if (held == ClassId::kSingle) return firstNumbers<float>(values);
-  if (held == ClassId::kInt8) return firstNumbers<std::int8_t>(values);
-  if (held == ClassId::kUint8) return firstNumbers<std::uint8_t>(values);
-  if (held == ClassId::kInt16) return firstNumbers<std::int16_t>(values);
-  if (held == ClassId::kUint16) return firstNumbers<std::uint16_t>(values);
-  if (held == ClassId::kInt32) return firstNumbers<std::int32_t>(values);
-  if (held == ClassId::kUint32) return firstNumbers<std::uint32_t>(values);
-  return std::string(" of class ") + values.className();
+  return visit(values,
+               ambrix::Overloaded{
+                   [](ArrayView cells) { return std::string(cells.className()); },
+                   [&](std::span<const char16_t> text) { return firstText(text, textLength); },
+                   [](auto numbers) { return firstNumbers(numbers); }});
 }
 
 double number(ArrayView array) {

@@ -1,6 +1,7 @@
 #include "adapters/embedded/array_object.h"
 
 #include <algorithm>
+#include <array>
 #include <cstdint>
 #include <cstring>
 #include <memory>
@@ -11,6 +12,7 @@
 
 #include "adapters/embedded/allocation.h"
 #include "adapters/embedded/host_errors.h"
+#include "ambrix/visit.h"
 
 static_assert(std::is_standard_layout_v<qvArray>, "an array is found by its place on a list");
 
@@ -19,6 +21,16 @@ namespace {
 
 constexpr std::size_t kMostInlineBytes = 256;
 constexpr std::size_t kAlignment = alignof(std::max_align_t);
+
+/// By class number.
+constexpr auto kElementBytes = [] {
+  std::array<std::size_t, qvUINT64_CLASS + 1> bytes{};
+  const auto store = Overloaded{[](std::type_identity<ArrayView>) { return sizeof(qvArray*); },
+                                []<typename T>(std::type_identity<T>) { return sizeof(T); }};
+  for (const ClassId classId : kClassIds)
+    bytes[static_cast<std::size_t>(classId)] = visitClass(classId, store);
+  return bytes;
+}();
 
 struct Shape {
   std::span<const std::size_t> sizes;  // without trailing 1s; may be fewer than two
@@ -92,29 +104,7 @@ Head makeHead(qvClassID classId, const Shape& shape, std::size_t room) {
 }  // namespace
 
 std::size_t elementBytes(qvClassID classId) noexcept {
-  switch (classId) {
-    case qvLOGICAL_CLASS:
-    case qvINT8_CLASS:
-    case qvUINT8_CLASS:
-      return 1;
-    case qvCHAR_CLASS:
-    case qvINT16_CLASS:
-    case qvUINT16_CLASS:
-      return 2;
-    case qvSINGLE_CLASS:
-    case qvINT32_CLASS:
-    case qvUINT32_CLASS:
-      return 4;
-    case qvCELL_CLASS:
-    case qvDOUBLE_CLASS:
-    case qvINT64_CLASS:
-    case qvUINT64_CLASS:
-      return 8;
-    case qvUNKNOWN_CLASS:
-    case qvSTRUCT_CLASS:
-      break;
-  }
-  return 0;
+  return static_cast<std::size_t>(classId) < kElementBytes.size() ? kElementBytes[classId] : 0;
 }
 
 qvArray* makeArray(qvClassID classId, std::span<const std::size_t> sizes, Content content) {

@@ -6,6 +6,8 @@
 #include <cstring>
 #include <iterator>
 #include <limits>
+#include <span>
+#include <type_traits>
 #include <vector>
 
 namespace ambrix_fuzz {
@@ -27,12 +29,6 @@ constexpr double kNumbers[] = {
     0x1p63,        -0x1p63,       1e19,
     1e300,         -1e31,         5e-324,
     kInfinity,     -kInfinity,    std::numeric_limits<double>::quiet_NaN(),
-};
-
-constexpr ClassId kClasses[] = {
-    ClassId::kCell,   ClassId::kLogical, ClassId::kChar,   ClassId::kDouble, ClassId::kSingle,
-    ClassId::kInt8,   ClassId::kUint8,   ClassId::kInt16,  ClassId::kUint16, ClassId::kInt32,
-    ClassId::kUint32, ClassId::kInt64,   ClassId::kUint64,
 };
 
 using Shape = std::vector<std::size_t>;
@@ -118,11 +114,15 @@ std::string shownNumber(double number) {
 }
 
 std::string shownElement(ArrayView array, std::size_t index) {
-  if (array.classId() == ClassId::kDouble) return shownNumber(array.data<double>()[index]);
-  if (array.classId() == ClassId::kUint64)
-    return std::to_string(array.data<std::uint64_t>()[index]);
-  if (array.classId() == ClassId::kLogical) return array.data<bool>()[index] ? "true" : "false";
-  return "?";
+  return visit(array, ambrix::Overloaded{[](ArrayView) { return std::string("?"); },
+                                         [&](std::span<const bool> values) {
+                                           return std::string(values[index] ? "true" : "false");
+                                         },
+                                         [&]<typename T>(std::span<const T> values) {
+                                           if constexpr (std::is_integral_v<T>)
+                                             return std::to_string(values[index]);
+                                           return shownNumber(static_cast<double>(values[index]));
+                                         }});
 }
 
 }  // namespace
@@ -148,7 +148,7 @@ std::u16string anyText(Choices& choices) {
 Array anyArray(Choices& choices) {
   if (choices.oneIn(4)) return Array::scalar(anyNumber(choices));
   if (choices.oneIn(4)) return Array::text(anyText(choices));
-  Array array = Array::zeros(choices.pick(kClasses), choices.pick(kShapes));
+  Array array = Array::zeros(choices.pick(ambrix::kClassIds), choices.pick(kShapes));
   fill(choices, array);
   return array;
 }

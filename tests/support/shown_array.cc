@@ -1,20 +1,22 @@
 #include "tests/support/shown_array.h"
 
-#include <cstdint>
+#include <ambrix/visit.h>
+
 #include <iomanip>
+#include <limits>
+#include <span>
 #include <sstream>
 
 namespace ambrix_test {
 namespace {
 
 using ambrix::ArrayView;
-using ambrix::ClassId;
 
 template <typename T>
-void writeNumbers(std::ostream& out, ArrayView array) {
+void writeElements(std::ostream& out, std::span<const T> values) {
   const char* separator = "";
-  out << '[';
-  for (const T value : array.data<T>()) {
+  out << std::setprecision(std::numeric_limits<T>::max_digits10) << '[';
+  for (const T value : values) {
     out << separator << +value;
     separator = " ";
   }
@@ -22,9 +24,9 @@ void writeNumbers(std::ostream& out, ArrayView array) {
 }
 
 // Characters beyond ASCII as \xFF80.
-void writeText(std::ostream& out, ArrayView array) {
+void writeElements(std::ostream& out, std::span<const char16_t> text) {
   out << '\'';
-  for (const char16_t unit : array.chars()) {
+  for (const char16_t unit : text) {
     if (unit >= 0x20 && unit < 0x7F) {
       out << static_cast<char>(unit);
     } else {
@@ -34,42 +36,11 @@ void writeText(std::ostream& out, ArrayView array) {
   out << '\'';
 }
 
-void writeCells(std::ostream& out, ArrayView array) {
+void writeElements(std::ostream& out, ArrayView array) {
   out << '{';
   for (std::size_t i = 0; i < array.elementCount(); ++i)
     out << (i > 0 ? ", " : "") << shown(array.element(i));
   out << '}';
-}
-
-void writeElements(std::ostream& out, ArrayView array) {
-  switch (array.classId()) {
-    case ClassId::kDouble:
-      return writeNumbers<double>(out << std::setprecision(17), array);
-    case ClassId::kSingle:
-      return writeNumbers<float>(out << std::setprecision(9), array);
-    case ClassId::kInt8:
-      return writeNumbers<std::int8_t>(out, array);
-    case ClassId::kUint8:
-      return writeNumbers<std::uint8_t>(out, array);
-    case ClassId::kInt16:
-      return writeNumbers<std::int16_t>(out, array);
-    case ClassId::kUint16:
-      return writeNumbers<std::uint16_t>(out, array);
-    case ClassId::kInt32:
-      return writeNumbers<std::int32_t>(out, array);
-    case ClassId::kUint32:
-      return writeNumbers<std::uint32_t>(out, array);
-    case ClassId::kUint64:
-      return writeNumbers<std::uint64_t>(out, array);
-    case ClassId::kLogical:
-      return writeNumbers<bool>(out, array);
-    case ClassId::kChar:
-      return writeText(out, array);
-    case ClassId::kCell:
-      return writeCells(out, array);
-    default:
-      out << '?';
-  }
 }
 
 }  // namespace
@@ -84,7 +55,7 @@ std::string shown(ArrayView array) {
     separator = "x";
   }
   out << ' ';
-  writeElements(out, array);
+  visit(array, [&](auto elements) { writeElements(out, elements); });
   return out.str();
 }
 

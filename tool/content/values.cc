@@ -3,7 +3,10 @@
 #include <fmt/format.h>
 
 #include <cmath>
+#include <span>
+#include <stdexcept>
 
+#include "ambrix/visit.h"
 #include "tool/content/cdf_file.h"
 #include "tool/output/text.h"
 
@@ -26,10 +29,10 @@ ValueText formatNumber(T value) {
 }
 
 template <typename T>
-std::vector<ValueText> formatNumbers(ArrayView array) {
+std::vector<ValueText> formatNumbers(std::span<const T> values) {
   std::vector<ValueText> texts;
-  texts.reserve(array.elementCount());
-  for (const T value : array.data<T>())
+  texts.reserve(values.size());
+  for (const T value : values)
     texts.push_back(formatNumber(value));
   return texts;
 }
@@ -82,25 +85,8 @@ std::vector<ValueText> formatTexts(ArrayView array, std::size_t length) {
   return texts;
 }
 
-std::vector<ValueText> formatByClass(ArrayView array) {
-  switch (array.classId()) {
-    case ClassId::kDouble:
-      return formatNumbers<double>(array);
-    case ClassId::kSingle:
-      return formatNumbers<float>(array);
-    case ClassId::kInt8:
-      return formatNumbers<std::int8_t>(array);
-    case ClassId::kUint8:
-      return formatNumbers<std::uint8_t>(array);
-    case ClassId::kInt16:
-      return formatNumbers<std::int16_t>(array);
-    case ClassId::kUint16:
-      return formatNumbers<std::uint16_t>(array);
-    case ClassId::kInt32:
-      return formatNumbers<std::int32_t>(array);
-    default:
-      return formatNumbers<std::uint32_t>(array);
-  }
+std::vector<ValueText> formatNumbers(ArrayView cells) {
+  throw std::logic_error(std::string("no value is of class ") + cells.className());
 }
 
 }  // namespace
@@ -119,7 +105,7 @@ std::vector<ValueText> formatValues(Module& module, ArrayView array, std::string
   if (isCharacterType(datatype)) return formatTexts(array, elements);
   if (datatype == "cdf_epoch") return formatEpochs(module, array);
   if (datatype == "cdf_epoch16") return formatEpochs16(module, array);
-  return formatByClass(array);
+  return visit(array, [](auto numbers) { return formatNumbers(numbers); });
 }
 
 std::string joinValues(const std::vector<ValueText>& values) {

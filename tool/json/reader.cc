@@ -4,21 +4,18 @@
 #include <concepts>
 #include <limits>
 #include <string>
+#include <type_traits>
 #include <utility>
 #include <vector>
 
+#include "ambrix/visit.h"
 #include "tool/json/value.h"
 
 namespace ambrix::tool {
 namespace {
 
-constexpr std::array kClasses = {
-    ClassId::kCell,   ClassId::kLogical, ClassId::kChar,  ClassId::kDouble, ClassId::kSingle,
-    ClassId::kInt8,   ClassId::kUint8,   ClassId::kInt16, ClassId::kUint16, ClassId::kInt32,
-    ClassId::kUint32, ClassId::kInt64,   ClassId::kUint64};
-
 ClassId classNamed(const Json& name) {
-  for (const ClassId classId : kClasses) {
+  for (const ClassId classId : kClassIds) {
     if (name == className(classId)) return classId;
   }
   throw JsonError("an unknown class");
@@ -114,34 +111,11 @@ Array readCells(std::span<const std::size_t> sizes, const Json& data) {
 }
 
 Array readData(ClassId classId, std::span<const std::size_t> sizes, const Json& data) {
-  switch (classId) {
-    case ClassId::kCell:
-      return readCells(sizes, data);
-    case ClassId::kLogical:
-      return readElements<bool>(sizes, data);
-    case ClassId::kChar:
-      return readChars(sizes, data);
-    case ClassId::kDouble:
-      return readElements<double>(sizes, data);
-    case ClassId::kSingle:
-      return readElements<float>(sizes, data);
-    case ClassId::kInt8:
-      return readElements<std::int8_t>(sizes, data);
-    case ClassId::kUint8:
-      return readElements<std::uint8_t>(sizes, data);
-    case ClassId::kInt16:
-      return readElements<std::int16_t>(sizes, data);
-    case ClassId::kUint16:
-      return readElements<std::uint16_t>(sizes, data);
-    case ClassId::kInt32:
-      return readElements<std::int32_t>(sizes, data);
-    case ClassId::kUint32:
-      return readElements<std::uint32_t>(sizes, data);
-    case ClassId::kInt64:
-      return readElements<std::int64_t>(sizes, data);
-    default:
-      return readElements<std::uint64_t>(sizes, data);
-  }
+  return visitClass(
+      classId,
+      Overloaded{[&](std::type_identity<ArrayView>) { return readCells(sizes, data); },
+                 [&](std::type_identity<char16_t>) { return readChars(sizes, data); },
+                 [&]<typename T>(std::type_identity<T>) { return readElements<T>(sizes, data); }});
 }
 
 /// The short forms of numbers and logicals in a row.

@@ -2,10 +2,12 @@
 #include <array>
 #include <charconv>
 #include <cmath>
+#include <span>
 #include <type_traits>
 #include <utility>
 
 #include "adapters/catalogue/unicode.h"
+#include "ambrix/visit.h"
 #include "tool/json/surrogates.h"
 #include "tool/json/value.h"
 #include "tool/output/text.h"
@@ -40,17 +42,21 @@ void appendElement(std::string& json, T value) {
 }
 
 template <typename T>
-void appendElements(std::string& json, ArrayView array) {
+void appendElements(std::string& json, std::span<const T> values) {
   json += '[';
   const char* separator = "";
-  for (const T value : array.data<T>()) {
+  for (const T value : values) {
     json += std::exchange(separator, ",");
     appendElement(json, value);
   }
   json += ']';
 }
 
-void appendCells(std::string& json, ArrayView array) {
+void appendElements(std::string& json, std::span<const char16_t> units) {
+  appendString(json, {units.data(), units.size()});
+}
+
+void appendElements(std::string& json, ArrayView array) {
   json += '[';
   for (std::size_t index = 0; index < array.elementCount(); ++index) {
     if (index > 0) json += ',';
@@ -58,39 +64,6 @@ void appendCells(std::string& json, ArrayView array) {
     appendValue(json, element ? element : Array::zeros(ClassId::kDouble, {0, 0}));
   }
   json += ']';
-}
-
-void appendData(std::string& json, ArrayView array) {
-  switch (array.classId()) {
-    case ClassId::kCell:
-      return appendCells(json, array);
-    case ClassId::kLogical:
-      return appendElements<bool>(json, array);
-    case ClassId::kChar:
-      return appendString(json, array.chars());
-    case ClassId::kDouble:
-      return appendElements<double>(json, array);
-    case ClassId::kSingle:
-      return appendElements<float>(json, array);
-    case ClassId::kInt8:
-      return appendElements<std::int8_t>(json, array);
-    case ClassId::kUint8:
-      return appendElements<std::uint8_t>(json, array);
-    case ClassId::kInt16:
-      return appendElements<std::int16_t>(json, array);
-    case ClassId::kUint16:
-      return appendElements<std::uint16_t>(json, array);
-    case ClassId::kInt32:
-      return appendElements<std::int32_t>(json, array);
-    case ClassId::kUint32:
-      return appendElements<std::uint32_t>(json, array);
-    case ClassId::kInt64:
-      return appendElements<std::int64_t>(json, array);
-    case ClassId::kUint64:
-      return appendElements<std::uint64_t>(json, array);
-    case ClassId::kUnknown:
-      json += "[]";
-  }
 }
 
 /// UTF-16 of a text in which every byte outside valid UTF-8 is the character of its number.
@@ -110,7 +83,7 @@ void appendValue(std::string& json, ArrayView array) {
     appendDigits(json, size);
   }
   json += R"(],"data":)";
-  appendData(json, array);
+  visit(array, [&](auto elements) { appendElements(json, elements); });
   json += '}';
 }
 

@@ -1,6 +1,7 @@
 // What a host array is and holds, seen without owning it.
 #pragma once
 
+#include <array>
 #include <concepts>
 #include <cstddef>
 #include <cstdint>
@@ -32,6 +33,12 @@ enum class ClassId : int {
   kInt64 = 14,
   kUint64 = 15,
 };
+
+/// The classes that arrays can have.
+inline constexpr std::array kClassIds = {
+    ClassId::kCell,   ClassId::kLogical, ClassId::kChar,  ClassId::kDouble, ClassId::kSingle,
+    ClassId::kInt8,   ClassId::kUint8,   ClassId::kInt16, ClassId::kUint16, ClassId::kInt32,
+    ClassId::kUint32, ClassId::kInt64,   ClassId::kUint64};
 
 /// The class whose elements are C++ values of type T; kUnknown when there is none.
 template <typename T>

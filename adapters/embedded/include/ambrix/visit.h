@@ -24,7 +24,7 @@ Overloaded(Functions...) -> Overloaded<Functions...>;
 /// function does, in the same type for each class. Throws std::logic_error for a class that arrays
 /// cannot have.
 template <typename Function>
-decltype(auto) visitClass(ClassId classId, Function&& function) {
+constexpr decltype(auto) visitClass(ClassId classId, Function&& function) {
   switch (classId) {
     case ClassId::kCell:
       return function(std::type_identity<ArrayView>());
