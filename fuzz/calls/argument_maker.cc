@@ -9,23 +9,24 @@
 namespace ambrix_fuzz {
 namespace {
 
-/// Arguments that depend on nothing: a letter and the numbers from which one is chosen.
+/// Arguments that depend on nothing: a kind and the numbers from which one is chosen.
 struct Numbers {
-  char letter;
+  const char* kind;
   std::vector<double> values;
 };
 
-const Numbers kNumbersByLetter[] = {
-    {'e', {0, 1, 2, 3}},                           // entry
-    {'r', {0, 1, 2, 3, 4, 5, 9, 17, 2147483647}},  // record; the last has no place in a count
-    {'t', {1, 2}},                                 // record interval
-    {'g', {1, 2}},                                 // scope or majority
-    {'F', {1, 1, 1, 2}},                           // format
-    {'b', {0, 1, 2, 5, 16, 100}},                  // how many or how much
-    {'C', {0, 1, 0, 1, 2}},                        // checksum
-    {'O', {0, -1}},                                // read-only, validation
-    {'B', {0, 0, 0, 1}},                           // backward files
-    {'s', {0, 1, 2}},                              // sparse records
+const Numbers kNumbersByKind[] = {
+    {"entry", {0, 1, 2, 3}},
+    {"record", {0, 1, 2, 3, 4, 5, 9, 17, 2147483647}},  // the last has no place in a count
+    {"stride", {1, 2}},
+    {"scope", {1, 2}},
+    {"majority", {1, 2}},
+    {"format", {1, 1, 1, 2}},
+    {"amount", {0, 1, 2, 5, 16, 100}},
+    {"checksum", {0, 1, 0, 1, 2}},
+    {"mode", {0, -1}},
+    {"backward", {0, 0, 0, 1}},
+    {"sparseness", {0, 1, 2}},
 };
 
 constexpr const char* kFileNames[] = {"f0", "f1", "f2", "f3.cdf", "long-name-of-a-file"};
@@ -51,63 +52,56 @@ double asDouble(std::size_t number) {
 
 std::vector<Array> ArgumentMaker::argumentsOf(const Command& command) {
   std::vector<Array> arguments;
-  for (const char* letter = command.arguments; *letter != '\0'; ++letter) {
-    if (*letter != '?') {
-      arguments.push_back(makeArgument(*letter));
-    } else if (choices_.oneIn(3)) {
-      break;
-    }
+  for (const ambrix_test::Argument& argument : command.arguments) {
+    if (argument.optional && choices_.oneIn(3)) break;
+    arguments.push_back(makeArgument(argument.kind));
   }
   return arguments;
 }
 
-Array ArgumentMaker::makeArgument(char letter) {
-  const auto* numbers = std::ranges::find_if(
-      kNumbersByLetter, [letter](const Numbers& row) { return row.letter == letter; });
-  if (numbers != std::end(kNumbersByLetter)) return Array::scalar(choices_.pick(numbers->values));
-  return (this->*makerOf(letter))();
+Array ArgumentMaker::makeArgument(std::string_view kind) {
+  const auto* numbers = std::ranges::find(kNumbersByKind, kind, &Numbers::kind);
+  if (numbers != std::end(kNumbersByKind)) return Array::scalar(choices_.pick(numbers->values));
+  return (this->*makerOf(kind))();
 }
 
-ArgumentMaker::Maker ArgumentMaker::makerOf(char letter) {
+ArgumentMaker::Maker ArgumentMaker::makerOf(std::string_view kind) {
   using M = ArgumentMaker;
   struct Row {
-    char letter;
+    std::string_view kind;
     Maker maker;
   };
   static constexpr Row kMakers[] = {
-      {'f', &M::file},
-      {'o', &M::fileToOpen},
-      {'c', &M::fileToCreate},
-      {'v', &M::variable},
-      {'V', &M::variableName},
-      {'A', &M::attributeName},
-      {'w', &M::newName},
-      {'N', &M::constantName},
-      {'a', &M::attribute},
-      {'d', &M::datatype},
-      {'n', &M::numberOfElements},
-      {'D', &M::dimensions},
-      {'R', &M::recordVariance},
-      {'S', &M::dimensionVariances},
-      {'i', &M::indices},
-      {'I', &M::indices},
-      {'K', &M::counts},
-      {'T', &M::intervals},
-      {'k', &M::recordCount},
-      {'x', &M::value},
-      {'X', &M::record},
-      {'H', &M::slab},
-      {'E', &M::entryValue},
-      {'z', &M::compressionType},
-      {'Z', &M::compressionParameter},
-      {'7', &M::timeComponents},
-      {'0', &M::time16Components},
-      {'1', &M::times},
-      {'2', &M::times16},
+      {"file", &M::file},
+      {"path", &M::path},
+      {"variable", &M::variable},
+      {"variableName", &M::variableName},
+      {"attributeName", &M::attributeName},
+      {"newName", &M::newName},
+      {"constantName", &M::constantName},
+      {"attribute", &M::attribute},
+      {"datatype", &M::datatype},
+      {"elements", &M::numberOfElements},
+      {"sizes", &M::dimensions},
+      {"variance", &M::recordVariance},
+      {"variances", &M::dimensionVariances},
+      {"indices", &M::indices},
+      {"start", &M::indices},
+      {"counts", &M::counts},
+      {"strides", &M::intervals},
+      {"records", &M::recordCount},
+      {"value", &M::value},
+      {"recordValues", &M::record},
+      {"slabValues", &M::slab},
+      {"entryValues", &M::entryValue},
+      {"compression", &M::compressionType},
+      {"parameter", &M::compressionParameter},
+      {"components", &M::timeComponents},
+      {"components16", &M::time16Components},
+      {"epochs", &M::times},
+      {"epochs16", &M::times16},
   };
-  const auto* found =
-      std::ranges::find_if(kMakers, [letter](const Row& row) { return row.letter == letter; });
-  return found->maker;
+  return std::ranges::find(kMakers, kind, &Row::kind)->maker;
 }
 
 Array ArgumentMaker::file() {
@@ -116,12 +110,8 @@ Array ArgumentMaker::file() {
   return Array::scalar(file_->id);
 }
 
-Array ArgumentMaker::fileToOpen() {
+Array ArgumentMaker::path() {
   return text(choices_.oneIn(8) ? choices_.pick(kOddFileNames) : choices_.pick(kFileNames));
-}
-
-Array ArgumentMaker::fileToCreate() {
-  return fileToOpen();
 }
 
 Array ArgumentMaker::variable() {

@@ -1,14 +1,17 @@
 // The arguments of one call, each made to suit those before it.
 #pragma once
 
+#include <string_view>
 #include <vector>
 
 #include "fuzz/calls/choices.h"
-#include "fuzz/calls/command_signatures.h"
 #include "fuzz/calls/values.h"
 #include "fuzz/calls/world.h"
+#include "tests/support/command_signatures.h"
 
 namespace ambrix_fuzz {
+
+using ambrix_test::Command;
 
 /// Makes arguments that a careful user would give, as far as the world knows.
 class ArgumentMaker {
@@ -19,12 +22,11 @@ class ArgumentMaker {
 
  private:
   using Maker = Array (ArgumentMaker::*)();
-  static Maker makerOf(char letter);
-  Array makeArgument(char letter);
+  static Maker makerOf(std::string_view kind);
+  Array makeArgument(std::string_view kind);
 
   Array file();
-  Array fileToOpen();
-  Array fileToCreate();
+  Array path();
   Array variable();
   Array variableName();
   Array attributeName();

@@ -103,32 +103,36 @@ bool isValue(ArrayView array) {
   return std::ranges::find(kNever, array.classId()) == std::end(kNever);
 }
 
-bool isSane(char letter, ArrayView array) {
-  switch (letter) {
-    case 'h':
-      return isScalar(array, ClassId::kUint64);
-    case 'd':
-      return isScalar(array, ClassId::kDouble);
-    case 't':
-      return isLine(array);
-    case 'r':
-      return isPerDimension(array, ClassId::kDouble);
-    case 'l':
-      return isScalar(array, ClassId::kLogical);
-    case 'L':
-      return isPerDimension(array, ClassId::kLogical);
-    case 'c':
-      return isNames(array);
-    case 'p':  // of a compression
-      return isLine(array) || isScalar(array, ClassId::kDouble) ||
-             isEmptyMatrix(array, ClassId::kDouble);
-    case 'v':
-      return isValue(array);
-    case '0':  // components of an epoch16, over any further dimensions
-      return array.classId() == ClassId::kDouble && array.size()[0] == 10;
-    default:
-      return isMatrix(array, ClassId::kDouble, static_cast<std::size_t>(letter - '0'));
-  }
+bool isParameter(ArrayView array) {  // of a compression
+  return isLine(array) || isScalar(array, ClassId::kDouble) ||
+         isEmptyMatrix(array, ClassId::kDouble);
+}
+
+/// What the results of a kind are.
+struct Kind {
+  std::string_view name;
+  bool (*isSane)(ArrayView);
+};
+
+constexpr Kind kKinds[] = {
+    {"file", [](ArrayView array) { return isScalar(array, ClassId::kUint64); }},
+    {"number", [](ArrayView array) { return isScalar(array, ClassId::kDouble); }},
+    {"text", isLine},
+    {"row", [](ArrayView array) { return isPerDimension(array, ClassId::kDouble); }},
+    {"logical", [](ArrayView array) { return isScalar(array, ClassId::kLogical); }},
+    {"logicals", [](ArrayView array) { return isPerDimension(array, ClassId::kLogical); }},
+    {"names", isNames},
+    {"parameter", isParameter},
+    {"values", isValue},
+    {"epochs", [](ArrayView array) { return isMatrix(array, ClassId::kDouble, 1); }},
+    {"epochs16", [](ArrayView array) { return isMatrix(array, ClassId::kDouble, 2); }},
+    {"components", [](ArrayView array) { return isMatrix(array, ClassId::kDouble, 7); }},
+    {"components16",  // over any further dimensions
+     [](ArrayView array) { return array.classId() == ClassId::kDouble && array.size()[0] == 10; }},
+};
+
+bool isSane(std::string_view kind, ArrayView array) {
+  return std::ranges::find(kKinds, kind, &Kind::name)->isSane(array);
 }
 
 std::size_t valuesWanted(std::string_view command, const std::vector<Array>& arguments,
@@ -182,14 +186,15 @@ std::size_t requireKnown(const ambrix::MessageId& error) {
   return static_cast<std::size_t>(found - kErrors);
 }
 
-void requireSane(const Command& command, const std::vector<Array>& results, std::size_t outputs) {
-  const std::string_view expected = command.results;
+void requireSane(const ambrix_test::Command& command, const std::vector<Array>& results,
+                 std::size_t outputs) {
+  const std::vector<std::string>& expected = command.results;
   if (results.size() != std::min(outputs, expected.size())) {
-    violation(command.name + std::string(" has ") + std::to_string(results.size()) + " results");
+    violation(command.name + " has " + std::to_string(results.size()) + " results");
   }
   for (std::size_t i = 0; i < results.size(); ++i) {
     if (isSane(expected[i], results[i])) continue;
-    violation(command.name + std::string(" returns ") + shown(results[i]));
+    violation(command.name + " returns " + shown(results[i]));
   }
 }
 

@@ -7,8 +7,8 @@
 #include <string_view>
 #include <vector>
 
-#include "fuzz/calls/command_signatures.h"
 #include "fuzz/calls/world.h"
+#include "tests/support/command_signatures.h"
 
 namespace ambrix_fuzz {
 
@@ -22,7 +22,7 @@ std::size_t requireKnown(const ambrix::MessageId& error);
 std::size_t placeOfNotText();
 
 /// The number, the classes and the sizes of results are those of the command.
-void requireSane(const Command& command, const std::vector<ambrix::Array>& results,
+void requireSane(const ambrix_test::Command& command, const std::vector<ambrix::Array>& results,
                  std::size_t outputs);
 
 /// A value that a reader of variables returns has the class and the number of elements that the

@@ -19,7 +19,6 @@
 
 #include "fuzz/calls/call_log.h"
 #include "fuzz/calls/checks.h"
-#include "fuzz/calls/command_signatures.h"
 #include "fuzz/calls/sequence.h"
 
 namespace ambrix_fuzz {
@@ -161,9 +160,10 @@ void Run::tellBroken(int status) const {
 bool Run::reachedAll() const {
   if (log_.calls < kCallsThatReachAll) return true;
   bool all = true;
-  for (std::size_t i = 0; i < commands().size(); ++i) {
+  const std::vector<ambrix_test::Command>& commands = ambrix_test::commands();
+  for (std::size_t i = 0; i < commands.size(); ++i) {
     if (log_.succeeded[i] > 0) continue;
-    std::printf("NEVER SUCCEEDED: %s\n", commands()[i].name);
+    std::printf("NEVER SUCCEEDED: %s\n", commands[i].name.c_str());
     all = false;
   }
   return all;

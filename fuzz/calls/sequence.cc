@@ -16,9 +16,13 @@
 #include "fuzz/calls/mutation.h"
 #include "gateway/open_file_registry.h"
 #include "host/qvh.h"
+#include "tests/support/command_signatures.h"
 
 namespace ambrix_fuzz {
 namespace {
+
+using ambrix_test::commands;
+using ambrix_test::placeOf;
 
 constexpr std::size_t kByteLimit = 1 << 24;
 
@@ -125,7 +129,7 @@ void Sequence::callOne(std::size_t number) {
   input.name = Array::fromNarrow(command.name);
   input.arguments = ArgumentMaker(choices_, world_).argumentsOf(command);
   if (number >= std::size(kBeginnings)) spoil(choices_, world_, input);
-  confine(command.name, input.arguments);
+  confine(command.name.c_str(), input.arguments);
   beforeCall(choices_);
   callLog().note(shown(input));
   ++callLog().calls;

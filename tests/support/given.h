@@ -34,6 +34,14 @@ class Given {
 
 using Arguments = std::vector<Given>;
 
+/// They end with the arguments.
+inline std::vector<ArrayView> viewsOf(const Arguments& arguments) {
+  std::vector<ArrayView> views;
+  for (const Given& argument : arguments)
+    views.push_back(argument.view());
+  return views;
+}
+
 /// A row of any class: row<float>({1, 2}).
 template <typename T>
 Given row(std::initializer_list<T> values) {

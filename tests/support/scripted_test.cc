@@ -24,13 +24,6 @@ void watchedEntryPoint(int outputCount, qvArray* outputs[], int inputCount,
   }
 }
 
-std::vector<ArrayView> viewsOf(const Arguments& arguments) {
-  std::vector<ArrayView> views;
-  for (const Given& argument : arguments)
-    views.push_back(argument.view());
-  return views;
-}
-
 }  // namespace
 
 ScriptedTest::ScriptedTest() : module(watchedEntryPoint) {

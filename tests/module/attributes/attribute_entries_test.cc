@@ -122,25 +122,6 @@ TEST_F(AttributeEntriesTest, TheValueIsCheckedBeforeTheAttributeIsLookedUp) {
             refused("CDFgetAttrScope", kNoSuchAttr));
 }
 
-TEST_F(AttributeEntriesTest, ArgumentsAreReportedInOrderUnderTheirLabels) {
-  for (const char* command : {"getAttrgEntry", "getAttrEntry", "inquireAttrgEntry",
-                              "inquireAttrEntry", "deleteAttrgEntry"}) {
-    EXPECT_EQ(does(command, {5, "x", "x"}), validate("argumentNotUint64Scalar", "CDFID"));
-    EXPECT_EQ(does(command, {file, "x", "x"}), notScalar("ATTRNUM")) << command;
-    EXPECT_EQ(does(command, {file, 0, "x"}), notScalar("ENTRYNUM")) << command;
-  }
-  for (const char* command : {"putAttrgEntry", "putAttrEntry"}) {
-    EXPECT_EQ(does(command, {file, "x", "x", "x", 1}), notScalar("ATTRNUM")) << command;
-    EXPECT_EQ(does(command, {file, 0, "x", "x", 1}), notScalar("ENTRYNUM")) << command;
-    EXPECT_EQ(does(command, {file, 0, 0, "x", 1}), notScalar("DATATYPE")) << command;
-  }
-}
-
-TEST_F(AttributeEntriesTest, DeleteAttrEntryReportsABadAttributeAsAttnum) {
-  EXPECT_EQ(does("deleteAttrEntry", {file, "x", "x"}), notScalar("ATTNUM"));
-  EXPECT_EQ(does("deleteAttrEntry", {file, 1, "x"}), notScalar("ENTRYNUM"));
-}
-
 TEST_F(AttributeEntriesTest, DeletingAnEntryLeavesTheOthers) {
   for (const double entry : {0, 1, 2})
     results("putAttrgEntry", {file, 0, entry, 45, entry});

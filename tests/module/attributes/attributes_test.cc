@@ -116,54 +116,6 @@ TEST_F(AttributesTest, CountsOfTheOtherKindAreTheLibrarysToRefuse) {
             refused("CDFgetNumAttrgEntries", kIllegalForScope));
 }
 
-struct Command {
-  const char* name;
-  const char* routine;
-  Arguments more;
-};
-
-TEST_F(AttributesTest, AMissingAttributeFailsUnderTheRoutineOfEachCommand) {
-  const Command commands[] = {{"deleteAttr", "CDFdeleteAttr", {}},
-                              {"renameAttr", "CDFrenameAttr", {"n"}},
-                              {"getAttrName", "CDFgetAttrName", {}},
-                              {"getAttrScope", "CDFgetAttrScope", {}},
-                              {"inquireAttr", "CDFinquireCDF", {}},
-                              {"getAttrMaxgEntry", "CDFgetAttrMaxgEntry", {}},
-                              {"getAttrMaxEntry", "CDFgetAttrMaxzEntry", {}},
-                              {"getNumAttrgEntries", "CDFgetNumAttrgEntries", {}},
-                              {"getNumAttrEntries", "CDFgetNumAttrzEntries", {}}};
-  const std::pair<double, const char*> numbers[] = {
-      {2, kNoSuchAttr},  {4294967296.0, kNoSuchAttr}, {1e18, kNoSuchAttr},
-      {-1, kBadAttrNum}, {-1e18, kBadAttrNum},        {NAN, kBadAttrNum}};
-  for (const Command& command : commands) {
-    for (const auto& [number, text] : numbers) {
-      Arguments arguments{file, number};
-      arguments.insert(arguments.end(), command.more.begin(), command.more.end());
-      EXPECT_EQ(does(command.name, arguments), refused(command.routine, text))
-          << command.name << ' ' << number;
-    }
-  }
-}
-
-TEST_F(AttributesTest, ABadNumberIsReportedAsAttrnum) {
-  for (const char* command :
-       {"deleteAttr", "getAttrName", "getAttrScope", "inquireAttr", "getAttrMaxgEntry",
-        "getAttrMaxEntry", "getNumAttrgEntries", "getNumAttrEntries"}) {
-    EXPECT_EQ(does(command, {file, "0"}), notScalar("ATTRNUM")) << command;
-    EXPECT_EQ(does(command, {1, "0"}), validate("argumentNotUint64Scalar", "CDFID")) << command;
-  }
-}
-
-TEST_F(AttributesTest, RenameAttrReportsABadNumberAsAttnum) {
-  EXPECT_EQ(does("renameAttr", {file, "0", "n"}), notScalar("ATTNUM"));
-  EXPECT_EQ(does("renameAttr", {file, {}, 5}), notScalar("ATTNUM"));
-}
-
-TEST_F(AttributesTest, CreateAttrReadsTheNameBeforeTheScope) {
-  EXPECT_EQ(does("createAttr", {file, 5, "x"}), "basic_string::_M_construct null not valid");
-  EXPECT_EQ(does("createAttr", {file, "n", "x"}), notScalar("SCOPE"));
-}
-
 TEST_F(AttributesTest, FilesOfOthersShowTheirAttributes) {
   const Given example = open(distributionSample("example1.cdf"));
   EXPECT_EQ(does("inquireAttr", {example, 0}),

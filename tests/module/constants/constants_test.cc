@@ -57,10 +57,5 @@ TEST_F(ConstantsTest, Encoding10HasNoName) {
   }
 }
 
-TEST_F(ConstantsTest, TheNumberOfArgumentsIsChecked) {
-  EXPECT_EQ(does("getConstantNames", {"x"}), kWrongNumberOfInputs);
-  EXPECT_EQ(does("getConstantValue"), kWrongNumberOfInputs);
-}
-
 }  // namespace
 }  // namespace ambrix_test

@@ -86,15 +86,6 @@ TEST_F(FileCompressionTest, AnUnknownTypeIsReportedBeforeAnyParameterIsRead) {
   }
 }
 
-TEST_F(FileCompressionTest, ArgumentsAreReportedUnderTypeAndCparm) {
-  const Given file = create();
-  EXPECT_EQ(does("setCompression", {file, "5", 6}), notScalar("TYPE"));
-  EXPECT_EQ(does("setCompression", {file, 5, "6"}), notScalar("CPARM"));
-  EXPECT_EQ(does("setCompression", {file, 1, {}}), notScalar("CPARM"));
-  EXPECT_EQ(does("setCompression", {file, 1e19}), kOutOfBounds);
-  EXPECT_EQ(does("setCompression", {1, "x"}), validate("argumentNotUint64Scalar", "CDFID"));
-}
-
 TEST_F(FileCompressionTest, AMultiFileCannotBeCompressed) {
   EXPECT_EQ(does("setCompression", {createMultiFile(), 1}),
             refused("CDFsetCompression", kCannotCompress));
@@ -135,28 +126,6 @@ TEST_F(VariableCompressionTest, AGzipLevelReachesTheLibraryUnchecked) {
               refused("CDFsetzVarCompression", kBadCompressionParm));
   }
   EXPECT_EQ(does("setVarCompression", {file, variable, 5}), kNoLevel);
-}
-
-TEST_F(VariableCompressionTest, ArgumentsAreReportedUnderVarnumCtypeAndCparm) {
-  const Given file = create();
-  createVar(file, {});
-  EXPECT_EQ(does("setVarCompression", {file, "0", 1}), notScalar("VARNUM"));
-  EXPECT_EQ(does("setVarCompression", {file, 0, "1"}), notScalar("CTYPE"));
-  EXPECT_EQ(does("setVarCompression", {file, 0, 4, "x"}), unrecognized(4, "COMPRESSION"));
-  EXPECT_EQ(does("setVarCompression", {file, 0, 5, "x"}), notScalar("CPARM"));
-  EXPECT_EQ(does("getVarCompression", {file, "0"}), notScalar("VARNUM"));
-}
-
-TEST_F(VariableCompressionTest, AMissingVariableIsTheLibrarysFailure) {
-  const Given file = create();
-  createVar(file, {});
-  const std::pair<double, const char*> numbers[] = {
-      {1, kNoSuchVar}, {4294967296.0, kNoSuchVar}, {-1, kBadVarNum}};
-  for (const auto& [variable, text] : numbers) {
-    EXPECT_EQ(does("getVarCompression", {file, variable}), refused("CDFgetzVarCompression", text));
-    EXPECT_EQ(does("setVarCompression", {file, variable, 1}),
-              refused("CDFsetzVarCompression", text));
-  }
 }
 
 TEST_F(VariableCompressionTest, IsFixedOnceThereAreData) {

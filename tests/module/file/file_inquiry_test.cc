@@ -94,11 +94,6 @@ TEST_F(FileInquiryTest, TheVersionIsTheWritersWhileTheLibrarysIsTheRunning) {
             "double 1x1 [2]; double 1x1 [7]; double 1x1 [2]");
 }
 
-TEST_F(FileInquiryTest, LibraryCommandsTakeNoArguments) {
-  EXPECT_EQ(does("getLibraryVersion", {1}), kWrongNumberOfInputs);
-  EXPECT_EQ(does("getLibraryCopyright", {1}), kWrongNumberOfInputs);
-}
-
 TEST_F(FileInquiryTest, TheNameIsTheOneGivenWithoutItsExtension) {
   std::filesystem::create_directory("sub");
   const Given file = create("sub/made");

@@ -8,38 +8,6 @@ namespace {
 
 using FileSettingsTest = ModuleTest;
 
-struct Setter {
-  const char* command;
-  const char* label;
-};
-
-const Setter kSetters[] = {
-    {"setFormat", "NUMBUFFERS"},         {"setChecksum", "MODE"},
-    {"setMajority", "MAJORITY"},         {"setReadOnlyMode", "MODE"},
-    {"setCacheSize", "NUMBUFFERS"},      {"setVarsCacheSize", "NUMBUFFERS"},
-    {"setStageCacheSize", "NUMBUFFERS"}, {"setCompressionCacheSize", "NUMBUFFERS"},
-};
-
-TEST_F(FileSettingsTest, ABadNumberIsReportedUnderTheLabelOfEachSetter) {
-  const Given file = create();
-  for (const Setter& setter : kSetters) {
-    EXPECT_EQ(does(setter.command, {file, "1"}), notScalar(setter.label));
-    EXPECT_EQ(does(setter.command, {file, {}}), notScalar(setter.label));
-    EXPECT_EQ(does(setter.command, {file, 1e19}), kOutOfBounds);
-  }
-}
-
-TEST_F(FileSettingsTest, SetFormatLabelsItsArgumentLikeACacheSize) {
-  EXPECT_EQ(does("setFormat", {create(), "MULTI_FILE"}), notScalar("NUMBUFFERS"));
-}
-
-TEST_F(FileSettingsTest, ABadIdentifierComesBeforeABadNumber) {
-  for (const Setter& setter : kSetters) {
-    EXPECT_EQ(does(setter.command, {5, "x"}), validate("argumentNotUint64Scalar", "CDFID"));
-    EXPECT_EQ(does(setter.command, {Array::scalar(std::uint64_t{5}), "x"}), kInvalidFileId);
-  }
-}
-
 TEST_F(FileSettingsTest, FormatIsSingleFileUntilItIsChanged) {
   const Given file = create();
   EXPECT_EQ(does("getFormat", {file}), "char 1x11 'SINGLE_FILE'");

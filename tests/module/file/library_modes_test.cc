@@ -48,19 +48,5 @@ TEST_F(LibraryModesTest, BackwardFilesAreOfVersion27) {
   EXPECT_EQ(does("getVersion", {open("old")}).substr(0, 31), "double 1x1 [2]; double 1x1 [7];");
 }
 
-TEST_F(LibraryModesTest, ABadModeIsReportedUnderItsLabel) {
-  for (const char* command : {"setValidate", "setFileBackward"}) {
-    EXPECT_EQ(does(command, {"on"}), notScalar("MODE"));
-    EXPECT_EQ(does(command, {Array::scalar(true)}), notScalar("MODE"));
-    EXPECT_EQ(does(command, {{}}), notScalar("MODE"));
-    EXPECT_EQ(does(command, {-1e19}), kOutOfBounds);
-  }
-}
-
-TEST_F(LibraryModesTest, GettersTakeNoArguments) {
-  EXPECT_EQ(does("getValidate", {1}), kWrongNumberOfInputs);
-  EXPECT_EQ(does("getFileBackward", {create()}), kWrongNumberOfInputs);
-}
-
 }  // namespace
 }  // namespace ambrix_test

@@ -40,39 +40,6 @@ TEST_F(DispatchTest, ACommandThatIsNoTextIsALogicError) {
   }
 }
 
-struct Counts {
-  const char* name;
-  int minimum;
-  int maximum;
-};
-
-// One row of each kind of range; the whole table has a test of its own.
-const Counts kCounts[] = {
-    {"getVarData", 3, 4},          {"setCompression", 2, 3},  {"setVarCompression", 3, 4},
-    {"getConstantNames", 0, 0},    {"getFileBackward", 0, 0}, {"getLibraryVersion", 0, 0},
-    {"getLibraryCopyright", 0, 0}, {"getValidate", 0, 0},     {"open", 1, 1},
-    {"hyperPutVarData", 9, 9}};
-
-TEST_F(DispatchTest, TooFewAndTooManyArgumentsAreRefusedBeforeAnyIsRead) {
-  for (const Counts& row : kCounts) {
-    if (row.minimum > 0) {
-      const Arguments tooFew(static_cast<std::size_t>(row.minimum - 1));
-      EXPECT_EQ(does(row.name, tooFew), kWrongNumberOfInputs) << row.name;
-    }
-    const Arguments tooMany(static_cast<std::size_t>(row.maximum + 1));
-    EXPECT_EQ(does(row.name, tooMany), kWrongNumberOfInputs) << row.name;
-  }
-}
-
-TEST_F(DispatchTest, EveryCountOfARangeReachesTheHandler) {
-  for (const Counts& row : kCounts) {
-    for (int count = std::max(row.minimum, 1); count <= row.maximum; ++count) {
-      const std::string text = does(row.name, Arguments(static_cast<std::size_t>(count)));
-      EXPECT_NE(text, kWrongNumberOfInputs) << row.name << " with " << count;
-    }
-  }
-}
-
 TEST_F(DispatchTest, AnUnknownNameIsReportedWhateverItsArguments) {
   EXPECT_EQ(does("openCDF"), cdflib("invalidOperation", "openCDF"));
 }
@@ -114,16 +81,6 @@ TEST_F(DispatchTest, NanIsTheMostNegativeNumberAndNoOverflow) {
   const Given file = create();
   createVar(file, {});
   EXPECT_EQ(does("getVarName", {file, NAN}), refused("CDFgetzVarName", kBadVarNum));
-}
-
-TEST_F(DispatchTest, ATextArgumentThatIsNoTextIsALogicError) {
-  const Given file = create();
-  const std::string logicError = "basic_string::_M_construct null not valid";
-  EXPECT_EQ(does("open", {5}), logicError);
-  EXPECT_EQ(does("create", {5}), logicError);
-  EXPECT_EQ(does("getVarNum", {file, 5}), logicError);
-  EXPECT_EQ(does("getConstantValue", {5}), logicError);
-  EXPECT_EQ(does("createAttr", {file, 5, 1}), logicError);
 }
 
 TEST_F(DispatchTest, TheUnloadHandlerIsRegisteredByACallThatFails) {

@@ -13,13 +13,6 @@ namespace {
 
 namespace fs = std::filesystem;
 
-std::vector<ArrayView> viewsOf(const Arguments& arguments) {
-  std::vector<ArrayView> views;
-  for (const Given& argument : arguments)
-    views.push_back(argument.view());
-  return views;
-}
-
 std::size_t arraysIn(ArrayView array) {
   std::size_t count = 1;
   if (array.classId() != ClassId::kCell) return count;

@@ -95,13 +95,6 @@ TEST_F(PadValuesTest, PadValuesOfOthersAreRead) {
   EXPECT_EQ(does("getVarPadValue", {columns, 0}), "int16 1x1 [0]");
 }
 
-TEST_F(PadValuesTest, AMissingVariableIsTheInquirysFailure) {
-  EXPECT_EQ(does("getVarPadValue", {file, 0}), refused("CDFinquirezVar", kNoSuchVar));
-  EXPECT_EQ(does("setVarPadValue", {file, 4294967296.0, 1}), refused("CDFinquirezVar", kNoSuchVar));
-  EXPECT_EQ(does("getVarPadValue", {file, "x"}), notScalar("VARNUM"));
-  EXPECT_EQ(does("setVarPadValue", {file, "x", 1}), notScalar("VARNUM"));
-}
-
 TEST_F(PadValuesTest, AReadOnlyFileKeepsItsPadValue) {
   const double variable = createVar(file, {.datatype = 45});
   file = reopen(file);

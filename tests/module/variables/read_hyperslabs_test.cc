@@ -126,23 +126,6 @@ TEST_F(ReadHyperslabsTest, MoreRecordsThanMemoryHoldsAreTheHostsError) {
               testing::StartsWith("TOLVEX:host:outOfMemory"));
 }
 
-TEST_F(ReadHyperslabsTest, ArgumentsAreReadInOrderUnderTheirLabels) {
-  const Given example = open(distributionSample("example1.cdf"));
-  const Given bad = Array::cell({1, 2});
-  Arguments arguments{example, bad, bad, bad, bad, bad, bad, bad};
-  const char* scalars[] = {"VARNUM", "RECSTART", "RECCOUNT", "RECSTRIDE"};
-  for (std::size_t i = 0; i < 4; ++i) {
-    EXPECT_EQ(does("hyperGetVarData", arguments), notScalar(scalars[i]));
-    arguments[i + 1] = 0;
-  }
-  const char* vectors[] = {"DIMSTART", "DIMCOUNT", "DIMSTRIDe"};
-  for (std::size_t i = 0; i < 3; ++i) {
-    EXPECT_EQ(does("hyperGetVarData", arguments),
-              validate("argumentNotDoublePrecision", vectors[i]));
-    arguments[i + 5] = {0, 0};
-  }
-}
-
 TEST_F(ReadHyperslabsTest, TextsKeepTheirCharactersInTheFirstDimension) {
   AMBRIX_NEED_SAMPLE(path, "nasajava_test.cdf");
   const Given others = open(path);

@@ -105,14 +105,5 @@ TEST_F(ReadValuesTest, UnsupportedDatatypesAreReportedAfterTheIndices) {
   EXPECT_EQ(does("getVarData", {others, int8, 0, {}}), cdflib("badDimSpec", 1L, "newI8"));
 }
 
-TEST_F(ReadValuesTest, ArgumentsAreReadInOrder) {
-  const Given example = open(distributionSample("example1.cdf"));
-  EXPECT_EQ(does("getVarData", {7, "x", "x", "x"}), validate("argumentNotUint64Scalar", "CDFID"));
-  EXPECT_EQ(does("getVarData", {example, "x", "x", 0}), notScalar("VARNUM"));
-  EXPECT_EQ(does("getVarData", {example, 99, "x", 0}), notScalar("RECNUM"));
-  EXPECT_EQ(does("getVarData", {example, 99, 0, Array::cell({1, 1})}),
-            refused("CDFinquirezVar", kNoSuchVar));
-}
-
 }  // namespace
 }  // namespace ambrix_test

@@ -120,38 +120,5 @@ TEST_F(VariableInquiryTest, ClosingAVariableIsForMultiFiles) {
   EXPECT_EQ(does("getVarData", {multi, 0, 0}), "int32 1x1 [4]");
 }
 
-TEST_F(VariableInquiryTest, CloseVarReportsABadVariableAsCdfid) {
-  const Given file = create();
-  EXPECT_EQ(does("closeVar", {file, "0"}), notScalar("CDFID"));
-  EXPECT_EQ(does("closeVar", {file, Array::scalar(std::uint64_t{0})}), notScalar("CDFID"));
-}
-
-TEST_F(VariableInquiryTest, AMissingVariableFailsUnderTheRoutineOfEachCommand) {
-  struct Command {
-    const char* name;
-    const char* routine;
-    const char* label;
-    Arguments more;
-  };
-  const Command commands[] = {{"inquireVar", "CDFinquirezVar", "VARNUM", {}},
-                              {"closeVar", "CDFclosezVar", "CDFID", {}},
-                              {"deleteVar", "CDFdeletezVar", "VARNUM", {}},
-                              {"renameVar", "CDFrenamezVar", "VARNUM", {"n"}},
-                              {"getVarName", "CDFgetzVarName", "VARNUM", {}}};
-  const Given file = create();
-  createVar(file, {});
-  const std::pair<double, const char*> numbers[] = {
-      {1, kNoSuchVar}, {4294967296.0, kNoSuchVar}, {-1, kBadVarNum}, {-4294967296.0, kBadVarNum}};
-  for (const Command& command : commands) {
-    Arguments arguments{file, "x"};
-    arguments.insert(arguments.end(), command.more.begin(), command.more.end());
-    EXPECT_EQ(does(command.name, arguments), notScalar(command.label));
-    for (const auto& [number, text] : numbers) {
-      arguments[1] = number;
-      EXPECT_EQ(does(command.name, arguments), refused(command.routine, text)) << command.name;
-    }
-  }
-}
-
 }  // namespace
 }  // namespace ambrix_test

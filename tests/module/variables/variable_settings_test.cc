@@ -97,11 +97,6 @@ TEST_F(VariableSettingsTest, CacheSizesAreForMultiFiles) {
             refused("CDFsetzVarCacheSize", kBadCacheSize));
 }
 
-TEST_F(VariableSettingsTest, ABadNumberOfBuffersIsReportedBeforeTheFormatIsRead) {
-  EXPECT_EQ(does("setVarCacheSize", {file, 0, {1, 2}}), notScalar("NUMBUFFERS"));
-  EXPECT_EQ(does("setVarCacheSize", {file, "0", {1, 2}}), notScalar("VARNUM"));
-}
-
 // A record of 2^32 values has a size of 0 to the library, which divides by it.
 TEST_F(VariableSettingsTest, VariablesWithOversizedRecordsAreRefusedWhereTheLibraryWouldDivide) {
   createVar(file, {.sizes = {65536, 65536}, .name = "huge"});
@@ -121,55 +116,6 @@ TEST_F(VariableSettingsTest, DeletingRecordsOfAMultiFileDoesNothing) {
   results("putVarRecordData", {multi, 0, 0, kOne});
   EXPECT_EQ(does("deleteVarRecords", {multi, 0, 0, 0}), "done");
   EXPECT_EQ(does("getVarNumRecsWritten", {multi, 0}), "double 1x1 [1]");
-}
-
-struct Command {
-  const char* name;
-  const char* routine;
-  std::vector<const char*> labels;  // behind that of the variable
-};
-
-const Command kCommands[] = {
-    {"getVarAllocRecords", "CDFgetzVarAllocRecords", {}},
-    {"getVarBlockingFactor", "CDFgetzVarBlockingFactor", {}},
-    {"getVarMaxAllocRecNum", "CDFgetzVarMaxAllocRecNum", {}},
-    {"getVarMaxWrittenRecNum", "CDFgetzVarMaxWrittenRecNum", {}},
-    {"getVarNumRecsWritten", "CDFgetzVarNumRecsWritten", {}},
-    {"getVarReservePercent", "CDFgetzVarReservePercent", {}},
-    {"getVarSparseRecords", "CDFgetzVarSparseRecords", {}},
-    {"setVarAllocBlockRecords", "CDFsetzVarAllocBlockRecords", {"RECSTART", "RECSTOP"}},
-    {"setVarBlockingFactor", "CDFsetzVarBlockingFactor", {"BLOCKINGFACTOR"}},
-    {"setVarInitialRecs", "CDFsetzVarInitialRecs", {"NUMRECS"}},
-    {"setVarReservePercent", "CDFsetzVarReservePercent", {"PERCENT"}},
-    {"setVarSparseRecords", "CDFsetzVarSparseRecords", {"STYPE"}},
-};
-
-TEST_F(VariableSettingsTest, AMissingVariableFailsUnderTheRoutineOfEachCommand) {
-  for (const Command& command : kCommands) {
-    const std::pair<double, const char*> variables[] = {
-        {1, kNoSuchVar}, {4294967296.0, kNoSuchVar}, {-1, kBadVarNum}};
-    for (const auto& [variable, text] : variables) {
-      Arguments arguments{file, variable};
-      arguments.resize(2 + command.labels.size(), 1);
-      EXPECT_EQ(does(command.name, arguments), refused(command.routine, text)) << command.name;
-    }
-  }
-}
-
-TEST_F(VariableSettingsTest, BadNumbersAreReportedInOrderUnderTheirLabels) {
-  for (const Command& command : kCommands) {
-    Arguments arguments(2 + command.labels.size(), "x");
-    EXPECT_EQ(does(command.name, arguments), validate("argumentNotUint64Scalar", "CDFID"));
-    arguments[0] = file;
-    EXPECT_EQ(does(command.name, arguments), notScalar("VARNUM")) << command.name;
-    arguments[1] = 99;
-    for (std::size_t i = 0; i < command.labels.size(); ++i) {
-      EXPECT_EQ(does(command.name, arguments), notScalar(command.labels[i])) << command.name;
-      arguments[2 + i] = 1e30;
-      EXPECT_EQ(does(command.name, arguments), kOutOfBounds) << command.name;
-      arguments[2 + i] = 1;
-    }
-  }
 }
 
 }  // namespace

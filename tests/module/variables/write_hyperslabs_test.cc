@@ -164,21 +164,5 @@ TEST_F(WriteHyperslabsTest, AlongADimensionThatDoesNotVaryTheLastValueStays) {
   EXPECT_EQ(does("hyperGetVarData", {file, 0, 0, 1, 1, 0, 3, 1}), "double 3x1 [3 3 3]");
 }
 
-TEST_F(WriteHyperslabsTest, ArgumentsAreReadInOrderUnderTheirLabels) {
-  const Given bad = Array::cell({1, 2});
-  Arguments arguments{file, bad, bad, bad, bad, bad, bad, bad, bad};
-  const char* scalars[] = {"VARNUM", "RECSTART", "RECCOUNT", "RECSTRIDE"};
-  for (std::size_t i = 0; i < 4; ++i) {
-    EXPECT_EQ(does("hyperPutVarData", arguments), notScalar(scalars[i]));
-    arguments[i + 1] = 0;
-  }
-  const char* vectors[] = {"DIMSTART", "DIMCOUNT", "DIMSTRIDE"};
-  for (std::size_t i = 0; i < 3; ++i) {
-    EXPECT_EQ(does("hyperPutVarData", arguments),
-              validate("argumentNotDoublePrecision", vectors[i]));
-    arguments[i + 5] = {0, 0};
-  }
-}
-
 }  // namespace
 }  // namespace ambrix_test

@@ -138,16 +138,5 @@ TEST_F(WriteRecordsTest, TheRangeToDeleteIsTheLibrarysToJudge) {
   EXPECT_EQ(does("getVarNumRecsWritten", {file, variable}), "double 1x1 [3]");
 }
 
-TEST_F(WriteRecordsTest, ArgumentsAreReadInOrder) {
-  EXPECT_EQ(does("putVarRecordData", {5, "x", "x", 1}),
-            validate("argumentNotUint64Scalar", "CDFID"));
-  EXPECT_EQ(does("putVarRecordData", {file, "x", "x", 1}), notScalar("VARNUM"));
-  EXPECT_EQ(does("putVarRecordData", {file, 9, "x", 1}), notScalar("RECNUM"));
-  EXPECT_EQ(does("putVarRecordData", {file, 9, 0, 1}), refused("CDFinquirezVar", kNoSuchVar));
-  EXPECT_EQ(does("deleteVarRecords", {file, "x", "x", "x"}), notScalar("VARNUM"));
-  EXPECT_EQ(does("deleteVarRecords", {file, 9, "x", "x"}), notScalar("STARTREC"));
-  EXPECT_EQ(does("deleteVarRecords", {file, 9, 0, "x"}), notScalar("ENDREC"));
-}
-
 }  // namespace
 }  // namespace ambrix_test

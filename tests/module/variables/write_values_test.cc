@@ -132,17 +132,6 @@ TEST_F(WriteValuesTest, NumbersOutOfRangeAreTheLibrarysFailureAndWriteNothing) {
   EXPECT_EQ(does("getVarRecordData", {file, variable, 0}), "double 2x1 [1 2]");
 }
 
-TEST_F(WriteValuesTest, ArgumentsAreReadInOrder) {
-  const Given cell = Array::cell({1, 1});
-  EXPECT_EQ(does("putVarData", {5, cell, cell, cell, cell}),
-            validate("argumentNotUint64Scalar", "CDFID"));
-  EXPECT_EQ(does("putVarData", {file, cell, cell, cell, cell}), notScalar("VARNUM"));
-  EXPECT_EQ(does("putVarData", {file, 9, cell, cell, cell}), notScalar("RECNUM"));
-  EXPECT_EQ(does("putVarData", {file, 9, 0, cell, cell}),
-            validate("argumentNotDoublePrecision", "INDICES"));
-  EXPECT_EQ(does("putVarData", {file, 9, 0, {1e30}, cell}), kOutOfBounds);
-}
-
 TEST_F(WriteValuesTest, AReadOnlyFileIsNotWritten) {
   const double variable = createVar(file, {.datatype = 22});
   file = reopen(file);

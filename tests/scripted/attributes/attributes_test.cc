@@ -27,21 +27,6 @@ TEST_F(AttributesTest, RenameAttrLabelsTheAttributeAttnum) {
   EXPECT_EQ(errorOf("renameAttr", {file(), "x", 5}), notScalar("ATTNUM"));
 }
 
-TEST_F(AttributesTest, TheOthersLabelItAttrnum) {
-  for (const char* command :
-       {"deleteAttr", "getAttrName", "getAttrScope", "inquireAttr", "getAttrMaxgEntry",
-        "getAttrMaxEntry", "getNumAttrgEntries", "getNumAttrEntries"}) {
-    EXPECT_EQ(errorOf(command, {file(), "x"}), notScalar("ATTRNUM")) << command;
-    EXPECT_EQ(errorOf(command, {7, "x"}), validate("argumentNotUint64Scalar", "CDFID")) << command;
-  }
-  EXPECT_THAT(calls(), IsEmpty());
-}
-
-TEST_F(AttributesTest, CreateAttrConvertsTheNameBeforeTheScope) {
-  EXPECT_EQ(errorOf("createAttr", {file(), "n", "x"}), notScalar("SCOPE"));
-  EXPECT_EQ(errorOf("createAttr", {file(), 5, "x"}), "basic_string::_M_construct null not valid");
-}
-
 TEST_F(AttributesTest, GetAttrNameReturnsUpTo256Characters) {
   const std::string longest(256, 'n');
   fake.answerText("ATTR_NAME_", longest);

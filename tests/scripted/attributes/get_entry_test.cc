@@ -77,14 +77,5 @@ TEST_F(GetEntryTest, DeleteAttrEntryLabelsTheAttributeAttnum) {
   EXPECT_EQ(errorOf("deleteAttrEntry", {file(), "x", "x"}), notScalar("ATTNUM"));
 }
 
-TEST_F(GetEntryTest, TheOthersLabelItAttrnumAndTheEntryEntrynum) {
-  for (const char* command : {"getAttrgEntry", "getAttrEntry", "inquireAttrgEntry",
-                              "inquireAttrEntry", "deleteAttrgEntry"})
-    EXPECT_EQ(errorOf(command, {file(), "x", "x"}), notScalar("ATTRNUM")) << command;
-  for (const char* command : {"getAttrgEntry", "getAttrEntry", "inquireAttrgEntry",
-                              "inquireAttrEntry", "deleteAttrgEntry", "deleteAttrEntry"})
-    EXPECT_EQ(errorOf(command, {file(), 2, "x"}), notScalar("ENTRYNUM")) << command;
-}
-
 }  // namespace
 }  // namespace ambrix_test

@@ -106,14 +106,6 @@ TEST_F(PutEntryTest, TheDatatypeIsLookedAtBeforeTheClass) {
   EXPECT_THAT(calls(), IsEmpty());
 }
 
-TEST_F(PutEntryTest, ArgumentsAreConvertedInOrderUnderTheirLabels) {
-  EXPECT_EQ(errorOf("putAttrEntry", {7, "x", "x", "x", 1}),
-            validate("argumentNotUint64Scalar", "CDFID"));
-  EXPECT_EQ(errorOf("putAttrEntry", {file(), "x", "x", "x", 1}), notScalar("ATTRNUM"));
-  EXPECT_EQ(errorOf("putAttrEntry", {file(), 2, "x", "x", 1}), notScalar("ENTRYNUM"));
-  EXPECT_EQ(errorOf("putAttrEntry", {file(), 2, 5, "x", 1}), notScalar("DATATYPE"));
-}
-
 TEST_F(PutEntryTest, FailuresNameTheRoutineOfTheKind) {
   fake.failCall(1, -2017);
   EXPECT_EQ(errorOf("putAttrEntry", {file(), 2, 5, 45, 1}),

@@ -2,7 +2,7 @@
 // and never as the number that the lower bits make.
 #include <sstream>
 
-#include "tests/scripted/commands/command_cases.h"
+#include "tests/scripted/commands/command_test.h"
 
 namespace ambrix_test {
 namespace {
@@ -10,7 +10,7 @@ namespace {
 constexpr long kNoSuchVar = -2019;
 constexpr long kBadVarNum = -2041;
 
-class LargeNumbersTest : public CommandTest, public testing::WithParamInterface<CommandCase> {
+class LargeNumbersTest : public CommandTest {
  protected:
   LargeNumbersTest() {
     ::ambrix::setByteLimit(1 << 20);
@@ -37,12 +37,12 @@ std::vector<std::string> wordsOf(const std::vector<std::string>& calls) {
 }
 
 /// The places of a command's numbers: argument and element.
-std::vector<std::pair<std::size_t, std::size_t>> numbersOf(const CommandCase& given) {
+std::vector<std::pair<std::size_t, std::size_t>> numbersOf(const Command& command) {
   std::vector<std::pair<std::size_t, std::size_t>> places;
-  for (std::size_t i = 0; i < given.arguments.size(); ++i) {
-    const ArrayView argument = given.arguments[i].view();
-    if (i == given.dataAt || argument.classId() != ClassId::kDouble) continue;
-    for (std::size_t at = 0; at < argument.elementCount(); ++at)
+  for (std::size_t i = 0; i < command.arguments.size(); ++i) {
+    const Conversion conversion = command.arguments[i].conversion;
+    if (conversion != Conversion::kNumber && conversion != Conversion::kNumbers) continue;
+    for (std::size_t at = 0; at < exampleOf(command.arguments[i]).view().elementCount(); ++at)
       places.emplace_back(i, at);
   }
   return places;
@@ -66,9 +66,9 @@ void expectRefusedNumbers(const std::vector<std::string>& words,
 
 /// The calls after one number of the argument has been moved.
 void LargeNumbersTest::moveAndCompare(std::size_t argument, std::size_t at, double distance) {
-  Arguments arguments = GetParam().arguments;
-  arguments[argument] = moved(arguments[argument].view(), at, distance);
-  const std::string error = errorOf(GetParam().command, arguments);
+  Arguments given = arguments();
+  given[argument] = moved(given[argument].view(), at, distance);
+  const std::string error = errorOf(command(), given);
   const std::vector<std::string> words = wordsOf(calls());
   EXPECT_TRUE(error != "no error" || words.size() == usual.size()) << "argument " << argument;
   EXPECT_NE(words, usual) << "argument " << argument << " was cut";
@@ -78,7 +78,7 @@ void LargeNumbersTest::moveAndCompare(std::size_t argument, std::size_t at, doub
 TEST_P(LargeNumbersTest, NumbersBeyond32BitsNeverReachTheLibraryCut) {
   call("setVarInitialRecs", {file(), 3, 1});  // writers differ before the first to a file
   fake.forgetCalls();
-  call(GetParam().command, GetParam().arguments);
+  call(command(), arguments());
   usual = wordsOf(calls());
   for (const auto& [argument, at] : numbersOf(GetParam())) {
     for (const double distance : {4294967296.0, -4294967296.0, 1e15})
@@ -86,30 +86,35 @@ TEST_P(LargeNumbersTest, NumbersBeyond32BitsNeverReachTheLibraryCut) {
   }
 }
 
-INSTANTIATE_TEST_SUITE_P(Commands, LargeNumbersTest, testing::ValuesIn(commandCases()),
-                         [](const auto& given) { return given.param.command; });
+INSTANTIATE_TEST_SUITE_P(Commands, LargeNumbersTest, testing::ValuesIn(commands()), nameOf);
 
-using KindsOfNumbersTest = CommandTest;
+using KindsOfNumbersTest = ScriptedTest;
 
 TEST_F(KindsOfNumbersTest, EachKindOfNumberIsReplacedByOneOfItsKind) {
   constexpr double kFar = 4294967296.0;
-  const std::pair<CommandCase, const char*> replaced[] = {
-      {{"getVarName", {file(), kFar + 3}, {}},
-       "SELECT_ CDF_ 7 | zVAR_ 2147483647 | GET_ zVAR_NAME_"},
-      {{"getVarName", {file(), -kFar}, {}}, "SELECT_ CDF_ 7 | zVAR_ -1 | GET_ zVAR_NAME_"},
-      {{"getAttrName", {file(), kFar}, {}}, "SELECT_ CDF_ 7 | ATTR_ 2147483647 | GET_ ATTR_NAME_"},
-      {{"getAttrName", {file(), -kFar}, {}}, "SELECT_ CDF_ 7 | ATTR_ -1 | GET_ ATTR_NAME_"},
-      {{"deleteAttrEntry", {file(), 2, kFar}, {}}, "CDFdeleteAttrEntry 7 3 2 -1"},
-      {{"setFormat", {file(), kFar + 1}, {}}, "SELECT_ CDF_ 7 | PUT_ CDF_FORMAT_ -1"},
-      {{"createAttr", {file(), "a", kFar + 1}, {}}, "SELECT_ CDF_ 7 | CREATE_ ATTR_ 'a' -1"},
+  struct Call {
+    const char* command;
+    Arguments arguments;
+    const char* text;
+  };
+  const Call replaced[] = {
+      {"getVarName", {file(), kFar + 3}, "SELECT_ CDF_ 7 | zVAR_ 2147483647 | GET_ zVAR_NAME_"},
+      {"getVarName", {file(), -kFar}, "SELECT_ CDF_ 7 | zVAR_ -1 | GET_ zVAR_NAME_"},
+      {"getAttrName", {file(), kFar}, "SELECT_ CDF_ 7 | ATTR_ 2147483647 | GET_ ATTR_NAME_"},
+      {"getAttrName", {file(), -kFar}, "SELECT_ CDF_ 7 | ATTR_ -1 | GET_ ATTR_NAME_"},
+      {"deleteAttrEntry", {file(), 2, kFar}, "CDFdeleteAttrEntry 7 3 2 -1"},
+      {"setFormat", {file(), kFar + 1}, "SELECT_ CDF_ 7 | PUT_ CDF_FORMAT_ -1"},
+      {"createAttr", {file(), "a", kFar + 1}, "SELECT_ CDF_ 7 | CREATE_ ATTR_ 'a' -1"},
       // -1 would mean "on" to the library.
-      {{"setReadOnlyMode", {file(), kFar}, {}}, "SELECT_ CDF_ 7 | CDF_READONLY_MODE_ 2147483647"},
-      {{"setVarCompression", {file(), 3, 5, kFar + 6}, {}},
+      {"setReadOnlyMode", {file(), kFar}, "SELECT_ CDF_ 7 | CDF_READONLY_MODE_ 2147483647"},
+      {"setVarCompression",
+       {file(), 3, 5, kFar + 6},
        "SELECT_ CDF_ 7 | zVAR_ 3 | PUT_ zVAR_COMPRESSION_ 5 [-1]"},
-      {{"deleteVarRecords", {file(), 3, 0, kFar}, {}},
+      {"deleteVarRecords",
+       {file(), 3, 0, kFar},
        "SELECT_ CDF_ 7 | zVAR_ 3 | DELETE_ zVAR_RECORDS_ 0 -1"}};
-  for (const auto& [given, text] : replaced) {
-    call(given.command, given.arguments);
+  for (const auto& [command, arguments, text] : replaced) {
+    call(command, arguments);
     EXPECT_EQ(calls().back(), text);
   }
 }

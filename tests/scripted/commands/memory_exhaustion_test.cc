@@ -4,7 +4,7 @@
 
 #include "gateway/errors.h"
 #include "gateway/open_file_registry.h"
-#include "tests/scripted/commands/command_cases.h"
+#include "tests/scripted/commands/command_test.h"
 #include "tests/support/failing_new.h"
 
 namespace ambrix_test {
@@ -15,10 +15,9 @@ using testing::IsEmpty;
 const std::string kOutOfMemory = "TOLVEX:host:outOfMemory()";
 constexpr std::uint64_t kMoreThanAnyCommandTakes = 2000;
 
-class MemoryExhaustionTest : public CommandTest, public testing::WithParamInterface<CommandCase> {
+class MemoryExhaustionTest : public CommandTest {
  protected:
   MemoryExhaustionTest() {
-    fake.answer("CDFgetValidate", {1});
     fake.moveExactly(0);
     usual = outcome([](std::uint64_t) {}, 0);
   }
@@ -40,14 +39,13 @@ std::string MemoryExhaustionTest::outcome(const std::function<void(std::uint64_t
                                           std::uint64_t n) {
   call("open", {"any.cdf"});  // again, in case that the command closes it
   fake.forgetCalls();
-  std::vector<ArrayView> arguments;
-  for (const Given& argument : GetParam().arguments)
-    arguments.push_back(argument.view());
+  const Arguments given = arguments();
+  const std::vector<ArrayView> views = viewsOf(given);
   std::vector<Array> results;
   std::string text = "done";
   try {
     fail(n);
-    results = module.call(GetParam().command, arguments);
+    results = module.call(command(), views);
     fail(0);
   } catch (const ::ambrix::Error& error) {
     fail(0);
@@ -83,14 +81,14 @@ TEST_P(MemoryExhaustionTest, OfTheModuleIsTheSameErrorAndLeavesNothingBehind) {
 
 // What fails then is the report of the failure, too.
 TEST_P(MemoryExhaustionTest, WhileAFailureIsReportedIsAnErrorLikewise) {
-  if (GetParam().reported.empty()) return;
+  if (reported().empty()) return;
   const auto alive = ::ambrix::liveCounts();
-  const std::size_t failing = GetParam().reported[0].empty() ? 2 : 1;
-  const std::string failure = reportOf(firstReport(GetParam()), -2013);
+  const std::size_t first = firstReported(GetParam());
+  const std::string failure = reportOf(reported()[first], -2013);
   std::string text = kOutOfMemory;
   for (std::uint64_t n = 1; text == kOutOfMemory; ++n) {
-    const auto failBoth = [this, failing](std::uint64_t at) {
-      if (at > 0) fake.failCall(failing, -2013);
+    const auto failBoth = [this, first](std::uint64_t at) {
+      if (at > 0) fake.failCall(first + 1, -2013);
       failNew(at);
     };
     text = outcome(failBoth, n);
@@ -100,8 +98,7 @@ TEST_P(MemoryExhaustionTest, WhileAFailureIsReportedIsAnErrorLikewise) {
   EXPECT_EQ(text, failure);
 }
 
-INSTANTIATE_TEST_SUITE_P(Commands, MemoryExhaustionTest, testing::ValuesIn(commandCases()),
-                         [](const auto& given) { return given.param.command; });
+INSTANTIATE_TEST_SUITE_P(Commands, MemoryExhaustionTest, testing::ValuesIn(commands()), nameOf);
 
 /// Each error, with texts too long to fit into a string itself.
 std::vector<std::function<TOLVEX::ambrix::MessageId()>> errors() {
@@ -149,7 +146,7 @@ TEST(ErrorsAndMemoryTest, AnErrorThatCannotBeMadeLeavesNothingBehind) {
   }
 }
 
-using FilesAndMemoryTest = CommandTest;
+using FilesAndMemoryTest = ScriptedTest;
 
 // Nobody could close a file that the library has opened and whose identifier is lost.
 TEST_F(FilesAndMemoryTest, NoFileIsOpenedUnlessItsIdentifierCanBeReturned) {

@@ -87,10 +87,5 @@ TEST_F(GetCompressionTest, AParameterThatTheLibraryLeavesUntouchedReadsAsZero) {
   EXPECT_EQ(shown(call("getVarCompression", {file(), 3})[1]), "double 1x1 [0]");
 }
 
-TEST_F(GetCompressionTest, TheVariableIsReportedUnderItsLabelAfterTheFile) {
-  EXPECT_EQ(errorOf("getVarCompression", {file(), "x"}), notScalar("VARNUM"));
-  EXPECT_EQ(errorOf("getVarCompression", {7, "x"}), validate("argumentNotUint64Scalar", "CDFID"));
-}
-
 }  // namespace
 }  // namespace ambrix_test

@@ -61,18 +61,5 @@ TEST_F(LibraryModesTest, SetFileBackwardTakesZeroAndOneOnly) {
   EXPECT_THAT(calls(), IsEmpty());
 }
 
-TEST_F(LibraryModesTest, ModesAreReportedUnderTheirLabel) {
-  for (const char* command : {"setValidate", "setFileBackward"}) {
-    EXPECT_EQ(errorOf(command, {"x"}), notScalar("MODE"));
-    EXPECT_EQ(errorOf(command, {{}}), notScalar("MODE"));
-  }
-}
-
-TEST_F(LibraryModesTest, GettersTakeNoArgument) {
-  for (const char* command : {"getValidate", "getFileBackward"}) {
-    EXPECT_EQ(errorOf(command, {file()}), validate("wrongNumberOfInputs"));
-  }
-}
-
 }  // namespace
 }  // namespace ambrix_test

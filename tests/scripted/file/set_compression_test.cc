@@ -64,24 +64,5 @@ TEST_F(SetCompressionTest, AVariablesGzipLevelGoesToTheLibraryUnchecked) {
   }
 }
 
-TEST_F(SetCompressionTest, AFilesArgumentsHaveTheirLabels) {
-  EXPECT_EQ(errorOf("setCompression", {7, "x", "x"}), validate("argumentNotUint64Scalar", "CDFID"));
-  EXPECT_EQ(errorOf("setCompression", {file(), "x", "x"}), notScalar("TYPE"));
-  EXPECT_EQ(errorOf("setCompression", {file(), 5, "x"}), notScalar("CPARM"));
-}
-
-TEST_F(SetCompressionTest, AVariablesTypeIsLabelledCtype) {
-  EXPECT_EQ(errorOf("setVarCompression", {file(), "x", "x", "x"}), notScalar("VARNUM"));
-  EXPECT_EQ(errorOf("setVarCompression", {file(), 3, "x", "x"}), notScalar("CTYPE"));
-  EXPECT_EQ(errorOf("setVarCompression", {file(), 3, 5, "x"}), notScalar("CPARM"));
-}
-
-TEST_F(SetCompressionTest, TheArgumentsAreTwoOrThreeAndThreeOrFour) {
-  EXPECT_EQ(errorOf("setCompression", {file()}), validate("wrongNumberOfInputs"));
-  EXPECT_EQ(errorOf("setCompression", {file(), 1, 0, 0}), validate("wrongNumberOfInputs"));
-  EXPECT_EQ(errorOf("setVarCompression", {file(), 3}), validate("wrongNumberOfInputs"));
-  EXPECT_EQ(errorOf("setVarCompression", {file(), 3, 1, 0, 0}), validate("wrongNumberOfInputs"));
-}
-
 }  // namespace
 }  // namespace ambrix_test

@@ -83,14 +83,5 @@ TEST_F(CreateVariableTest, AnEmptyRecordVarianceIsAMismatchAfterTheDimensionVari
   EXPECT_EQ(errorWith({}, {-1}), cdflib("mismatchedVarianceSize", 1, 2));
 }
 
-TEST_F(CreateVariableTest, ArgumentsAreConvertedInOrderUnderTheirLabels) {
-  EXPECT_EQ(errorOf("createVar", {file(), 5, "x", "x", {}, "x", "x"}),
-            "basic_string::_M_construct null not valid");
-  EXPECT_EQ(errorOf("createVar", {file(), "v", "x", "x", {}, "x", "x"}), notScalar("DATATYPE"));
-  EXPECT_EQ(errorOf("createVar", {file(), "v", 4, "x", {}, "x", "x"}), notScalar("NUMELEMENTS"));
-  EXPECT_EQ(errorOf("createVar", {file(), "v", 4, 1, Array::cell({1, 1}), "x", "x"}),
-            validate("argumentNotDoublePrecision", "DIMS"));
-}
-
 }  // namespace
 }  // namespace ambrix_test

@@ -107,10 +107,5 @@ TEST_F(PadValuesTest, TheClassIsLookedAtBeforeTheNumberOfElements) {
   EXPECT_THAT(calls(), ElementsAre(kInquiry, kInquiry));
 }
 
-TEST_F(PadValuesTest, TheVariableIsReportedUnderItsLabel) {
-  EXPECT_EQ(errorOf("getVarPadValue", {file(), "x"}), notScalar("VARNUM"));
-  EXPECT_EQ(errorOf("setVarPadValue", {file(), "x", 1}), notScalar("VARNUM"));
-}
-
 }  // namespace
 }  // namespace ambrix_test

@@ -143,21 +143,6 @@ TEST_F(ReadHyperslabTest, ButOfPartsOfThemTheLibraryWritesOnlyWhatIsWanted) {
   }
 }
 
-TEST_F(ReadHyperslabTest, ArgumentsAreConvertedInOrderUnderTheirLabels) {
-  const Given x = "x", cell = Array::cell({1, 1});
-  const auto error = [&](const Arguments& arguments) {
-    return errorOf("hyperGetVarData", arguments);
-  };
-  EXPECT_EQ(error({file(), x, x, x, x, cell, cell, cell}), notScalar("VARNUM"));
-  EXPECT_EQ(error({file(), 3, x, x, x, cell, cell, cell}), notScalar("RECSTART"));
-  EXPECT_EQ(error({file(), 3, 0, x, x, cell, cell, cell}), notScalar("RECCOUNT"));
-  EXPECT_EQ(error({file(), 3, 0, 1, x, cell, cell, cell}), notScalar("RECSTRIDE"));
-  EXPECT_EQ(error({file(), 3, 0, 1, 1, cell, cell, cell}),
-            validate("argumentNotDoublePrecision", "DIMSTART"));
-  EXPECT_EQ(error({file(), 3, 0, 1, 1, {}, cell, cell}),
-            validate("argumentNotDoublePrecision", "DIMCOUNT"));
-}
-
 TEST_F(ReadHyperslabTest, TheIntervalLabelEndsInASmallE) {
   EXPECT_EQ(errorWith({}, {}, Array::cell({1, 1})),
             validate("argumentNotDoublePrecision", "DIMSTRIDe"));

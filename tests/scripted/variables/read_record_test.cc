@@ -89,10 +89,5 @@ TEST_F(ReadRecordTest, ADamagedDescriptionIsRefusedInTheLibrarysWords) {
             libraryFailure("CDFgetzVarRecordData", -2004));
 }
 
-TEST_F(ReadRecordTest, ArgumentsAreConvertedInOrderUnderTheirLabels) {
-  EXPECT_EQ(errorOf("getVarRecordData", {file(), "x", "x"}), notScalar("VARNUM"));
-  EXPECT_EQ(errorOf("getVarRecordData", {file(), 3, "x"}), notScalar("RECNUM"));
-}
-
 }  // namespace
 }  // namespace ambrix_test

@@ -98,13 +98,5 @@ TEST_F(ReadValueTest, DimensionsThatDoNotVaryAddNoBytesToARecord) {
   EXPECT_EQ(errorOf("getVarData", {file(), 3, 0, {0, 0}}), "no error");
 }
 
-TEST_F(ReadValueTest, ArgumentsAreConvertedInOrderUnderTheirLabels) {
-  EXPECT_EQ(errorOf("getVarData", {file(), "x", "x"}), notScalar("VARNUM"));
-  EXPECT_EQ(errorOf("getVarData", {file(), 3, "x"}), notScalar("RECNUM"));
-  describe({});
-  EXPECT_EQ(errorOf("getVarData", {file(), 3, 0, Array::cell({1, 1})}),
-            validate("argumentNotDoublePrecision", "INDICES"));
-}
-
 }  // namespace
 }  // namespace ambrix_test

@@ -66,12 +66,6 @@ TEST_F(VariableDefinitionTest, CloseVarLabelsTheVariableCdfid) {
   EXPECT_EQ(errorOf("closeVar", {file(), "x"}), notScalar("CDFID"));
 }
 
-TEST_F(VariableDefinitionTest, TheOthersLabelItVarnum) {
-  for (const char* command : {"inquireVar", "deleteVar", "getVarName"})
-    EXPECT_EQ(errorOf(command, {file(), "x"}), notScalar("VARNUM")) << command;
-  EXPECT_EQ(errorOf("renameVar", {file(), "x", 5}), notScalar("VARNUM"));
-}
-
 TEST_F(VariableDefinitionTest, GetVarNumReturnsTheNumber) {
   fake.answer("CDFgetVarNum", {12});
   EXPECT_EQ(shown(result("getVarNum", {file(), "v"})), "double 1x1 [12]");

@@ -129,21 +129,6 @@ TEST_F(WriteHyperslabTest, CountsThatTheLibraryRefusesNeedNoDataHoweverLargeThei
   EXPECT_THAT(calls().back(), testing::HasSubstr("zVAR_DIMCOUNTS_ [-2 -2] | "));
 }
 
-TEST_F(WriteHyperslabTest, ArgumentsAreConvertedInOrderUnderTheirLabels) {
-  const Given x = "x", cell = Array::cell({1, 1});
-  const auto error = [&](const Arguments& arguments) {
-    return errorOf("hyperPutVarData", arguments);
-  };
-  EXPECT_EQ(error({file(), x, x, x, x, cell, cell, cell, x}), notScalar("VARNUM"));
-  EXPECT_EQ(error({file(), 3, x, x, x, cell, cell, cell, x}), notScalar("RECSTART"));
-  EXPECT_EQ(error({file(), 3, 0, x, x, cell, cell, cell, x}), notScalar("RECCOUNT"));
-  EXPECT_EQ(error({file(), 3, 0, 1, x, cell, cell, cell, x}), notScalar("RECSTRIDE"));
-  EXPECT_EQ(error({file(), 3, 0, 1, 1, cell, cell, cell, x}),
-            validate("argumentNotDoublePrecision", "DIMSTART"));
-  EXPECT_EQ(error({file(), 3, 0, 1, 1, {}, cell, cell, x}),
-            validate("argumentNotDoublePrecision", "DIMCOUNT"));
-}
-
 TEST_F(WriteHyperslabTest, TheIntervalLabelIsAllCapitals) {
   EXPECT_EQ(errorOf("hyperPutVarData", {file(), 3, 0, 1, 1, {}, {}, Array::cell({1, 1}), "x"}),
             validate("argumentNotDoublePrecision", "DIMSTRIDE"));

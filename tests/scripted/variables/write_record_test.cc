@@ -79,10 +79,5 @@ TEST_F(WriteRecordTest, ADamagedDescriptionIsRefusedInTheLibrarysWords) {
   EXPECT_EQ(errorWith({}), libraryFailure("CDFputzVarRecordData", -2004));
 }
 
-TEST_F(WriteRecordTest, ArgumentsAreConvertedInOrderUnderTheirLabels) {
-  EXPECT_EQ(errorOf("putVarRecordData", {file(), "x", "x", 1}), notScalar("VARNUM"));
-  EXPECT_EQ(errorOf("putVarRecordData", {file(), 3, "x", 1}), notScalar("RECNUM"));
-}
-
 }  // namespace
 }  // namespace ambrix_test

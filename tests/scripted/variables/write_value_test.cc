@@ -17,8 +17,6 @@ TEST_F(WriteValueTest, AScalarVariableStillNeedsItsEmptyIndices) {
   EXPECT_THAT(fake.bytesRead(), ElementsAre(2, 1));
   EXPECT_THAT(calls(), ElementsAre(kInquiry, kMajority,
                                    kOnRecord + "9 | zVAR_DIMINDICES_ [] | PUT_ zVAR_DATA_"));
-  EXPECT_EQ(errorOf("putVarData", {file(), 3, 9, row<std::int16_t>({1})}),
-            validate("wrongNumberOfInputs"));
 }
 
 TEST_F(WriteValueTest, IndicesAreReversedForARowMajorFile) {
@@ -105,21 +103,10 @@ TEST_F(WriteValueTest, ADamagedDescriptionIsRefusedInTheLibrarysWords) {
             libraryFailure("CDFputzVarData", -2004));
 }
 
-TEST_F(WriteValueTest, ArgumentsAreConvertedInOrderUnderTheirLabels) {
-  const Given cell = Array::cell({1, 1});
-  EXPECT_EQ(errorOf("putVarData", {file(), "x", "x", cell, 1}), notScalar("VARNUM"));
-  EXPECT_EQ(errorOf("putVarData", {file(), 3, "x", cell, 1}), notScalar("RECNUM"));
-  EXPECT_EQ(errorOf("putVarData", {file(), 3, 0, cell, 1}),
-            validate("argumentNotDoublePrecision", "INDICES"));
-}
-
 TEST_F(WriteValueTest, RecordsAreDeletedAsARangeThatTheLibraryJudges) {
   describe({});
   EXPECT_THAT(call("deleteVarRecords", {file(), 3, 9, 4}), IsEmpty());
   EXPECT_EQ(calls().back(), "SELECT_ CDF_ 7 | zVAR_ 3 | DELETE_ zVAR_RECORDS_ 9 4");
-  EXPECT_EQ(errorOf("deleteVarRecords", {file(), "x", "x", "x"}), notScalar("VARNUM"));
-  EXPECT_EQ(errorOf("deleteVarRecords", {file(), 3, "x", "x"}), notScalar("STARTREC"));
-  EXPECT_EQ(errorOf("deleteVarRecords", {file(), 3, 0, "x"}), notScalar("ENDREC"));
 }
 
 }  // namespace
