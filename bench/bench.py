@@ -115,7 +115,7 @@ def main():
     options = arguments()
     with working_folder() as folder:
         results = run(options, folder)
-    tables = {"workloads": report.main_rows(WORKLOADS, results["workloads"], not options.quick),
+    tables = {"workloads": report.main_rows(WORKLOADS, results["workloads"]),
               "settings": report.setting_rows(SETTINGS, results["settings"])}
     for rows in tables.values():
         if len(rows) > 1:

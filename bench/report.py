@@ -35,20 +35,13 @@ def cell(workload, facts):
     return time_text(facts["median"])
 
 
-def goal_text(workload, facts):
-    if workload.goal is None or "ratio" not in facts:
-        return ""
-    return f"{workload.goal:.2f} " + ("met" if facts["ratio"] <= workload.goal else "missed")
-
-
-def main_rows(workloads, results, goals=True):
+def main_rows(workloads, results):
     names = list(dict.fromkeys(name for facts in results.values() for name in facts))
-    rows = [["workload", *(PEOPLE_SAY.get(name, name) for name in names), "goal" if goals else ""]]
+    rows = [["workload", *(PEOPLE_SAY.get(name, name) for name in names)]]
     for workload in workloads:
         facts = results.get(workload.name)
         if facts:
-            rows.append([workload.title, *(cell(workload, facts.get(name)) for name in names),
-                         goal_text(workload, facts.get("module", {})) if goals else ""])
+            rows.append([workload.title, *(cell(workload, facts.get(name)) for name in names)])
     return rows
 
 

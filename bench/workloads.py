@@ -2,35 +2,35 @@
 
 import collections
 
-Workload = collections.namedtuple("Workload", "name title goal calls")
+Workload = collections.namedtuple("Workload", "name title calls")
 Setting = collections.namedtuple("Setting", "title before after")
 
-# Names that the programs know, what people read, the most that the ratio to bare calls may be, and
-# the number of calls in a round where a time for each is of more interest than the whole.
+# The name of a workload in the programs, its title in tables, and the number of calls in a round if
+# the table shows the time of one call.
 WORKLOADS = (
-    Workload("read", "read 51 MB of doubles, row-major", 0.5, None),
-    Workload("read_column_major", "read the same, column-major", 0.5, None),
-    Workload("read_gzip", "read the same, gzip", 1.02, None),
-    Workload("write", "write 51 MB of doubles, row-major", 1.02, None),
-    Workload("write_column_major", "write the same, column-major", 1.02, None),
-    Workload("write_gzip", "write the same, gzip", 1.02, None),
-    Workload("walk_metadata", "walk 500 variables with 20 attributes each", None, None),
-    Workload("write_metadata", "write 500 variables with 20 attributes each", None, None),
-    Workload("read_values", 'read 100,000 values by "getVarData"', 1.3, 100_000),
-    Workload("read_values_hyper", 'read 100,000 values by "hyperGetVarData"', 1.3, 100_000),
-    Workload("read_text", "read 100,000 texts of 32 characters", None, None),
-    Workload("write_text", "write 100,000 texts of 32 characters", None, None),
-    Workload("widen", "widen characters, against memcpy of the same traffic", 1.3, None),
-    Workload("narrow", "narrow characters, likewise", 1.3, None),
-    Workload("read_strided", "read every second value of 2000 images, each way", 1.02, None),
-    Workload("epoch_breakdown", "break 1,000,000 epochs down", 1.05, None),
-    Workload("epoch_compute", "compute 1,000,000 epochs", 1.05, None),
-    Workload("epoch16_breakdown", "break 1,000,000 epoch16s down", 1.05, None),
-    Workload("epoch16_compute", "compute 1,000,000 epoch16s", 1.05, None),
-    Workload("get_constant", 'call "getConstantValue"', None, 20_000),
-    Workload("unknown_command", "call an unknown command", None, 20_000),
-    Workload("refused_argument", "have an argument refused", None, 20_000),
-    Workload("library_failure", "have the library fail", None, 20_000),
+    Workload("read", "read 51 MB of doubles, row-major", None),
+    Workload("read_column_major", "read the same, column-major", None),
+    Workload("read_gzip", "read the same, gzip", None),
+    Workload("write", "write 51 MB of doubles, row-major", None),
+    Workload("write_column_major", "write the same, column-major", None),
+    Workload("write_gzip", "write the same, gzip", None),
+    Workload("walk_metadata", "walk 500 variables with 20 attributes each", None),
+    Workload("write_metadata", "write 500 variables with 20 attributes each", None),
+    Workload("read_values", 'read 100,000 values by "getVarData"', 100_000),
+    Workload("read_values_hyper", 'read 100,000 values by "hyperGetVarData"', 100_000),
+    Workload("read_text", "read 100,000 texts of 32 characters", None),
+    Workload("write_text", "write 100,000 texts of 32 characters", None),
+    Workload("widen", "widen characters, against memcpy of the same traffic", None),
+    Workload("narrow", "narrow characters, likewise", None),
+    Workload("read_strided", "read every second value of 2000 images, each way", None),
+    Workload("epoch_breakdown", "break 1,000,000 epochs down", None),
+    Workload("epoch_compute", "compute 1,000,000 epochs", None),
+    Workload("epoch16_breakdown", "break 1,000,000 epoch16s down", None),
+    Workload("epoch16_compute", "compute 1,000,000 epoch16s", None),
+    Workload("get_constant", 'call "getConstantValue"', 20_000),
+    Workload("unknown_command", "call an unknown command", 20_000),
+    Workload("refused_argument", "have an argument refused", 20_000),
+    Workload("library_failure", "have the library fail", 20_000),
 )
 
 # What users can set: the workload without and with it.

@@ -17,6 +17,10 @@ import report  # noqa: E402
 import workloads  # noqa: E402
 
 
+# Commands that call no routine of the CDF library.
+WITHOUT_LIBRARY = {"get_constant", "unknown_command", "refused_argument"}
+
+
 class QuickRun(unittest.TestCase):
     @classmethod
     def setUpClass(cls):
@@ -33,10 +37,10 @@ class QuickRun(unittest.TestCase):
         for workload in workloads.WORKLOADS:
             facts = self.results["workloads"][workload.name]
             self.assertGreater(facts["module"]["median"], 0, workload.name)
-            if "library" in facts:
+            if workload.name in WITHOUT_LIBRARY:
+                self.assertNotIn("library", facts, workload.name)
+            else:
                 self.assertGreater(facts["module"]["ratio"], 0, workload.name)
-            elif workload.goal is not None:
-                self.fail(f"{workload.name} has a goal and nothing to be compared with")
 
     def test_every_setting_is_measured(self):
         titles = [setting.title for setting in workloads.SETTINGS]
