@@ -3,7 +3,9 @@
 import json
 import math
 import os
+import pathlib
 import random
+import re
 import struct
 import subprocess
 import tempfile
@@ -13,6 +15,7 @@ from support.ambrix_session import Array, CallError, Session, array
 from tool.support import has_sanitizer
 
 TOOL = os.environ["AMBRIX_TOOL"]
+DOCUMENT = pathlib.Path(__file__).resolve().parents[2] / "docs" / "session-protocol.md"
 BAD_REQUEST = "ambrix:session:badRequest"
 
 
@@ -421,6 +424,24 @@ class StreamTest(unittest.TestCase):
             (file,) = session.call("create", os.path.join(folder, "a"))
             self.assertEqual(session.value("getChecksum", file), "NO_CHECKSUM")
             session.call("close", file)
+
+
+class DocumentTest(SessionCase):
+    """The example in docs/session-protocol.md, with the identifier that this session gives."""
+
+    def test_the_example_is_answered_as_shown(self):
+        example, last = re.findall(r"^```\n(.*?)^```", DOCUMENT.read_text(), re.S | re.M)
+        lines = example.splitlines()
+        shown_id = re.search(r'"uint64".*?\[(\d+)\]', lines[1]).group(1)
+        given_id = None
+        for request, answer in zip(lines[::2], lines[1::2]):
+            self.assertEqual(request[:2], "> ")
+            given = self.session.send_line(request[2:].replace(shown_id, str(given_id)))
+            given_id = given_id or given["outputs"][0]["data"][0]
+            printed = json.dumps(given, separators=(",", ":"))
+            self.assertEqual(printed.replace(str(given_id), shown_id), answer, request)
+        self.session.close()
+        self.assertEqual({"unload": {"warnings": self.session.unload_warnings}}, json.loads(last))
 
 
 if __name__ == "__main__":
