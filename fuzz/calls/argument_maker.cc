@@ -31,7 +31,6 @@ const Numbers kNumbersByKind[] = {
 
 constexpr const char* kFileNames[] = {"f0", "f1", "f2", "f3.cdf", "long-name-of-a-file"};
 constexpr const char* kOddFileNames[] = {"missing", "", ".", "empty", "text.cdf", "nofolder/f"};
-constexpr long kDatatypeCodes[] = {22, 4, 51, 32, 1, 2, 11, 12, 14, 21, 31, 41, 44, 45, 52};
 constexpr const char* kConstants[] = {"VARY",       "CDF_INT4",         "cdf_epoch16",
                                       "READONLYon", "GZIP_COMPRESSION", "RLE_OF_ZEROs"};
 

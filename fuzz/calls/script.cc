@@ -13,7 +13,6 @@
 namespace ambrix_fuzz {
 namespace {
 
-constexpr long kDatatypes[] = {22, 4, 51, 32, 1, 2, 11, 12, 14, 21, 31, 41, 44, 45, 52};
 constexpr long kOddNumbers[] = {-1,
                                 0,
                                 2,
@@ -70,7 +69,7 @@ void Script::decide() {
 
 void Script::describeSanely() {
   variable_ = Description();
-  variable_.datatype = choices_->pick(kDatatypes);
+  variable_.datatype = choices_->pick(kDatatypeCodes);
   variable_.elements = isText(variable_.datatype) ? 1 + static_cast<long>(choices_->below(9)) : 1;
   variable_.dimensions = static_cast<long>(choices_->below(4));
   variable_.majority = 1 + static_cast<long>(choices_->below(2));

@@ -13,6 +13,11 @@
 namespace ambrix_fuzz {
 namespace {
 
+using ambrix_test::CdfDatatype;
+using ambrix_test::findCdfDatatype;
+using ambrix_test::kCdfDatatypes;
+using ambrix_test::lowerCaseName;
+
 constexpr double kInfinity = std::numeric_limits<double>::infinity();
 
 constexpr double kNumbers[] = {
@@ -74,39 +79,6 @@ void fill(Choices& choices, Array& array) {
   }
 }
 
-struct Datatype {
-  long code;
-  ClassId classId;
-  std::size_t bytes;
-  const char* name;
-};
-
-// clang-format off
-constexpr Datatype kDatatypes[] = {
-    {1,  ClassId::kInt8,   1,  "cdf_int1"},
-    {2,  ClassId::kInt16,  2,  "cdf_int2"},
-    {4,  ClassId::kInt32,  4,  "cdf_int4"},
-    {11, ClassId::kUint8,  1,  "cdf_uint1"},
-    {12, ClassId::kUint16, 2,  "cdf_uint2"},
-    {14, ClassId::kUint32, 4,  "cdf_uint4"},
-    {21, ClassId::kSingle, 4,  "cdf_real4"},
-    {22, ClassId::kDouble, 8,  "cdf_real8"},
-    {31, ClassId::kDouble, 8,  "cdf_epoch"},
-    {32, ClassId::kDouble, 16, "cdf_epoch16"},
-    {41, ClassId::kInt8,   1,  "cdf_byte"},
-    {44, ClassId::kSingle, 4,  "cdf_float"},
-    {45, ClassId::kDouble, 8,  "cdf_double"},
-    {51, ClassId::kChar,   1,  "cdf_char"},
-    {52, ClassId::kChar,   1,  "cdf_uchar"},
-};
-// clang-format on
-
-const Datatype* findDatatype(long code) {
-  const auto* found =
-      std::ranges::find_if(kDatatypes, [code](const Datatype& row) { return row.code == code; });
-  return found == std::end(kDatatypes) ? nullptr : found;
-}
-
 std::string shownNumber(double number) {
   std::array<char, 32> text{};
   std::snprintf(text.data(), text.size(), "%.17g", number);
@@ -160,23 +132,22 @@ Array valuesOf(Choices& choices, ClassId classId, std::size_t count) {
 }
 
 ClassId classOfDatatype(long datatype) {
-  const Datatype* found = findDatatype(datatype);
+  const CdfDatatype* found = findCdfDatatype(datatype);
   return found == nullptr ? ClassId::kUnknown : found->classId;
 }
 
 std::size_t bytesOfDatatype(long datatype) {
-  const Datatype* found = findDatatype(datatype);
+  const CdfDatatype* found = findCdfDatatype(datatype);
   return found == nullptr ? 0 : found->bytes;
 }
 
 long datatypeOfName(std::string_view name) {
-  const auto* found =
-      std::ranges::find_if(kDatatypes, [name](const Datatype& row) { return name == row.name; });
-  return found == std::end(kDatatypes) ? 0 : found->code;
+  const auto* found = std::ranges::find(kCdfDatatypes, name, lowerCaseName);
+  return found == std::end(kCdfDatatypes) ? 0 : found->code;
 }
 
 bool isText(long datatype) {
-  return datatype == 51 || datatype == 52;
+  return classOfDatatype(datatype) == ClassId::kChar;
 }
 
 std::string shown(ArrayView array) {

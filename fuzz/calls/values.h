@@ -3,10 +3,12 @@
 
 #include <ambrix/embedded.h>
 
+#include <iterator>
 #include <string>
 #include <string_view>
 
 #include "fuzz/calls/choices.h"
+#include "tests/support/datatypes.h"
 
 namespace ambrix_fuzz {
 
@@ -24,6 +26,10 @@ std::u16string anyText(Choices& choices);
 
 /// A row of values, the first of them of any kind.
 Array valuesOf(Choices& choices, ClassId classId, std::size_t count);
+
+/// In the order in which they are chosen from.
+inline constexpr long kDatatypeCodes[] = {22, 4, 51, 32, 1, 2, 11, 12, 14, 21, 31, 41, 44, 45, 52};
+static_assert(std::size(kDatatypeCodes) == std::size(ambrix_test::kCdfDatatypes));
 
 /// The class of a supported datatype; kUnknown for others. And the bytes of one element.
 ClassId classOfDatatype(long datatype);

@@ -6,32 +6,22 @@
 #include <string_view>
 #include <utility>
 
+#include "tests/support/datatypes.h"
+
 namespace ambrix::fuzz {
 namespace {
 
-struct Datatype {
-  std::string_view name;
-  ClassId classId;
-  std::size_t bytes;
-};
+using ambrix_test::CdfDatatype;
 
-constexpr Datatype kDatatypes[] = {
-    {"CDF_INT1", ClassId::kInt8, 1},    {"CDF_UINT1", ClassId::kUint8, 1},
-    {"CDF_INT2", ClassId::kInt16, 2},   {"CDF_UINT2", ClassId::kUint16, 2},
-    {"CDF_INT4", ClassId::kInt32, 4},   {"CDF_UINT4", ClassId::kUint32, 4},
-    {"CDF_REAL4", ClassId::kSingle, 4}, {"CDF_REAL8", ClassId::kDouble, 8},
-    {"CDF_EPOCH", ClassId::kDouble, 8}, {"CDF_EPOCH16", ClassId::kDouble, 8},
-    {"CDF_CHAR", ClassId::kChar, 2},    {"CDF_UCHAR", ClassId::kChar, 2}};
-
-const Datatype& datatypeNamed(std::string_view name) {
-  for (const Datatype& datatype : kDatatypes)
+const CdfDatatype& datatypeNamed(std::string_view name) {
+  for (const CdfDatatype& datatype : ambrix_test::kCdfDatatypes)
     if (datatype.name == name) return datatype;
   throw std::invalid_argument(std::string(name));
 }
 
 /// Values with runs of zeros and with others that repeat, so that every compression finds some.
-Array someValues(const Datatype& datatype, std::size_t count) {
-  std::vector<std::byte> bytes(count * datatype.bytes);
+Array someValues(const CdfDatatype& datatype, std::size_t count) {
+  std::vector<std::byte> bytes(count * elementBytes(datatype));
   for (std::size_t i = 0; i < bytes.size(); ++i)
     if (i / 24 % 2 == 1) bytes[i] = static_cast<std::byte>(i * i / 7 % 100);
   if (datatype.classId == ClassId::kChar) {

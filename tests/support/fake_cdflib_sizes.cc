@@ -2,17 +2,11 @@
 
 #include <gtest/gtest.h>
 
-#include <map>
-
+#include "tests/support/datatypes.h"
 #include "tests/support/fake_cdflib.h"
 
 namespace ambrix_test {
 namespace {
-
-// By the library's manual; it knows two datatypes that the module does not support.
-const std::map<long, double> kSizes = {{1, 1},  {2, 2},  {4, 4},  {8, 8},  {11, 1},  {12, 2},
-                                       {14, 4}, {21, 4}, {22, 8}, {31, 8}, {32, 16}, {33, 8},
-                                       {41, 1}, {44, 4}, {45, 8}, {51, 1}, {52, 1}};
 
 std::size_t counted(double bytes) {
   if (!fakeCdflib().movesExactly()) return 0;  // nobody needs it
@@ -21,15 +15,14 @@ std::size_t counted(double bytes) {
   return 0;
 }
 
-double elementBytes(long datatype) {
-  const auto found = kSizes.find(datatype);
-  return found == kSizes.end() ? 0 : found->second;
+double datatypeBytes(long code) {
+  return static_cast<double>(libraryBytes(code));
 }
 
 double valueBytes() {
   const FakeCdflib& fake = fakeCdflib();
   return static_cast<double>(fake.number("zVAR_NUMELEMS_")) *
-         elementBytes(fake.number("zVAR_DATATYPE_"));
+         datatypeBytes(fake.number("zVAR_DATATYPE_"));
 }
 
 }  // namespace
@@ -58,7 +51,7 @@ std::size_t bytesOfHyperslab(long records, std::span<const long> counts) {
 }
 
 std::size_t bytesOfEntry(long datatype, long elements) {
-  return counted(elementBytes(datatype) * static_cast<double>(elements));
+  return counted(datatypeBytes(datatype) * static_cast<double>(elements));
 }
 
 }  // namespace ambrix_test

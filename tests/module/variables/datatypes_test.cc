@@ -1,4 +1,6 @@
 // Values of every datatype: written by each writer, in both majorities, read by each reader.
+#include "tests/support/datatypes.h"
+
 #include <cstring>
 
 #include "tests/module/support/file_bytes.h"
@@ -9,39 +11,39 @@ namespace {
 
 struct Datatype {
   long code;
-  const char* className;
   Given values;       // two values
   const char* texts;  // as shown
   std::string bytes;  // as they stand in the file
 };
 
 template <typename T>
-Datatype numbers(long code, const char* className, std::initializer_list<T> values,
-                 const char* texts) {
-  return {code, className, Array::row<T>(values), texts, bytesOf<T>(values)};
+Datatype numbers(long code, std::initializer_list<T> values, const char* texts) {
+  return {code, Array::row<T>(values), texts, bytesOf<T>(values)};
 }
 
 std::vector<Datatype> datatypes() {
   return {
-      numbers<std::int8_t>(1, "int8", {-128, 127}, "[-128 127]"),
-      numbers<std::int16_t>(2, "int16", {-32768, 32767}, "[-32768 32767]"),
-      numbers<std::int32_t>(4, "int32", {-2147483647 - 1, 2147483647}, "[-2147483648 2147483647]"),
-      numbers<std::uint8_t>(11, "uint8", {200, 255}, "[200 255]"),
-      numbers<std::uint16_t>(12, "uint16", {40000, 65535}, "[40000 65535]"),
-      numbers<std::uint32_t>(14, "uint32", {3000000000, 4294967295}, "[3000000000 4294967295]"),
-      numbers<float>(21, "single", {1.5F, -2.25F}, "[1.5 -2.25]"),
-      numbers<double>(22, "double", {1e300, -0.1},
-                      "[1.0000000000000001e+300 -0.10000000000000001]"),
-      numbers<double>(31, "double", {63113904000000.0, 62167219200000.0},
-                      "[63113904000000 62167219200000]"),
-      numbers<double>(32, "double", {63113904000.0, 123456789012.0, 63113904001.0, 5.0},
+      numbers<std::int8_t>(1, {-128, 127}, "[-128 127]"),
+      numbers<std::int16_t>(2, {-32768, 32767}, "[-32768 32767]"),
+      numbers<std::int32_t>(4, {-2147483647 - 1, 2147483647}, "[-2147483648 2147483647]"),
+      numbers<std::uint8_t>(11, {200, 255}, "[200 255]"),
+      numbers<std::uint16_t>(12, {40000, 65535}, "[40000 65535]"),
+      numbers<std::uint32_t>(14, {3000000000, 4294967295}, "[3000000000 4294967295]"),
+      numbers<float>(21, {1.5F, -2.25F}, "[1.5 -2.25]"),
+      numbers<double>(22, {1e300, -0.1}, "[1.0000000000000001e+300 -0.10000000000000001]"),
+      numbers<double>(31, {63113904000000.0, 62167219200000.0}, "[63113904000000 62167219200000]"),
+      numbers<double>(32, {63113904000.0, 123456789012.0, 63113904001.0, 5.0},
                       "[63113904000 123456789012 63113904001 5]"),
-      numbers<std::int8_t>(41, "int8", {-1, 1}, "[-1 1]"),
-      numbers<float>(44, "single", {3.25F, 1e30F}, "[3.25 1.00000002e+30]"),
-      numbers<double>(45, "double", {0.5, -7}, "[0.5 -7]"),
-      {51, "char", "xY", "'xY'", "xY"},
-      {52, "char", Array::text(u"\u00E9\u007F"), "'\\xFFE9\\x7F'", "\xE9\x7F"},
+      numbers<std::int8_t>(41, {-1, 1}, "[-1 1]"),
+      numbers<float>(44, {3.25F, 1e30F}, "[3.25 1.00000002e+30]"),
+      numbers<double>(45, {0.5, -7}, "[0.5 -7]"),
+      {51, "xY", "'xY'", "xY"},
+      {52, Array::text(u"\u00E9\u007F"), "'\\xFFE9\\x7F'", "\xE9\x7F"},
   };
+}
+
+std::string classOf(const Datatype& datatype) {
+  return findCdfDatatype(datatype.code)->className;
 }
 
 class DatatypesTest : public ModuleTest {
@@ -58,10 +60,15 @@ class DatatypesTest : public ModuleTest {
 
   /// How a record of two values reads: pairs keep theirs in the first dimension.
   static std::string record(const Datatype& datatype) {
-    return std::string(datatype.className) + (datatype.code == 32 ? " 2x2 " : " 2x1 ") +
+    return std::string(classOf(datatype)) + (datatype.code == 32 ? " 2x2 " : " 2x1 ") +
            datatype.texts;
   }
 };
+
+TEST_F(DatatypesTest, NoneIsLeftOut) {
+  EXPECT_TRUE(
+      std::ranges::equal(datatypes(), kCdfDatatypes, {}, &Datatype::code, &CdfDatatype::code));
+}
 
 TEST_F(DatatypesTest, RecordsComeBackWholeAndStandInTheFileAsTheyAre) {
   for (const bool rowMajor : {true, false}) {
@@ -94,7 +101,7 @@ TEST_F(DatatypesTest, HyperslabsComeBackWhole) {
       const bool leading = datatype.code == 32 || datatype.code == 51 || datatype.code == 52;
       const char* size = datatype.code == 32 ? " 2x2 " : leading ? " 1x2 " : " 2x1 ";
       EXPECT_EQ(does("hyperGetVarData", {file, variable++, 1, 1, 1, 0, 2, 1}),
-                datatype.className + (size + std::string(datatype.texts)));
+                classOf(datatype) + (size + std::string(datatype.texts)));
     }
     results("delete", {file});
   }

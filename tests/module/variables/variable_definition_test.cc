@@ -1,5 +1,6 @@
 // Creating variables: arguments, variances, and what the library refuses.
 #include "tests/module/support/module_test.h"
+#include "tests/support/datatypes.h"
 
 namespace ambrix_test {
 namespace {
@@ -134,14 +135,9 @@ TEST_F(VariableDefinitionTest, NumbersBeyond32BitsAreNotCut) {
 }
 
 TEST_F(VariableDefinitionTest, EveryDatatypeHasItsLowerCaseName) {
-  const std::pair<double, const char*> datatypes[] = {
-      {1, "cdf_int1"},    {2, "cdf_int2"},     {4, "cdf_int4"},   {11, "cdf_uint1"},
-      {12, "cdf_uint2"},  {14, "cdf_uint4"},   {21, "cdf_real4"}, {22, "cdf_real8"},
-      {31, "cdf_epoch"},  {32, "cdf_epoch16"}, {41, "cdf_byte"},  {44, "cdf_float"},
-      {45, "cdf_double"}, {51, "cdf_char"},    {52, "cdf_uchar"}};
-  for (const auto& [datatype, name] : datatypes) {
-    results("createVar", {file, name, datatype, 1, {}, -1, {}});
-    const double variable = number("getVarNum", {file, name});
+  for (const CdfDatatype& datatype : kCdfDatatypes) {
+    const std::string name = lowerCaseName(datatype);
+    const double variable = createVar(file, {.datatype = datatype.code, .name = name.c_str()});
     EXPECT_EQ(results("inquireVar", {file, variable})[1].utf8(), name);
   }
 }

@@ -7,6 +7,7 @@
 #include <new>
 
 #include "gateway/sizes.h"
+#include "tests/support/datatypes.h"
 
 namespace ambrix_test {
 namespace {
@@ -20,22 +21,11 @@ std::size_t bytesFor(long datatype, long count) {
   return buffer.size();
 }
 
-TEST(ValueBufferTest, EachDatatypeHasItsSize) {
-  for (const long datatype : {1, 11, 41})
-    EXPECT_EQ(bytesFor(datatype, 5), 5U) << datatype;
-  for (const long datatype : {2, 12})
-    EXPECT_EQ(bytesFor(datatype, 5), 10U) << datatype;
-  for (const long datatype : {4, 14, 21, 44})
-    EXPECT_EQ(bytesFor(datatype, 5), 20U) << datatype;
-  for (const long datatype : {22, 31, 45})
-    EXPECT_EQ(bytesFor(datatype, 5), 40U) << datatype;
-  EXPECT_EQ(bytesFor(32, 5), 80U);
-}
-
-TEST(ValueBufferTest, CharactersGetRoomForATerminator) {
-  for (const long datatype : {51, 52}) {
-    EXPECT_EQ(bytesFor(datatype, 5), 6U);
-    EXPECT_EQ(bytesFor(datatype, 0), 1U);
+TEST(ValueBufferTest, EachDatatypeHasItsSizeAndCharactersRoomForATerminator) {
+  for (const CdfDatatype& datatype : kCdfDatatypes) {
+    const std::size_t terminator = isText(datatype) ? 1 : 0;
+    EXPECT_EQ(bytesFor(datatype.code, 5), 5 * datatype.bytes + terminator) << datatype.name;
+    EXPECT_EQ(bytesFor(datatype.code, 0), terminator) << datatype.name;
   }
 }
 

@@ -1,4 +1,5 @@
 // Reading one value.
+#include "tests/support/datatypes.h"
 #include "tests/support/scripted_test.h"
 
 namespace ambrix_test {
@@ -44,14 +45,10 @@ TEST_F(ReadValueTest, ATextIsAColumnWithSignWidenedCharacters) {
 }
 
 TEST_F(ReadValueTest, EveryDatatypeComesInItsClass) {
-  const std::pair<long, const char*> classes[] = {
-      {1, "int8"},    {2, "int16"},   {4, "int32"},   {11, "uint8"},  {12, "uint16"},
-      {14, "uint32"}, {21, "single"}, {22, "double"}, {31, "double"}, {32, "double"},
-      {41, "int8"},   {44, "single"}, {45, "double"}, {51, "char"},   {52, "char"}};
-  for (const auto& [datatype, name] : classes) {
-    describe({.datatype = datatype});
-    fake.answerData(std::vector<char>(datatype == 32 ? 16 : 1, 1));
-    EXPECT_EQ(result("getVarData", {file(), 3, 0}).className(), std::string(name));
+  for (const CdfDatatype& datatype : kCdfDatatypes) {
+    describe({.datatype = datatype.code});
+    fake.answerData(std::vector<char>(datatype.bytes, 1));
+    EXPECT_STREQ(result("getVarData", {file(), 3, 0}).className(), datatype.className);
   }
 }
 
