@@ -2,9 +2,10 @@
 // array and give its class and data.
 #include "adapters/common/array_functions.h"
 
-#include <algorithm>
 #include <stdexcept>
 #include <string_view>
+
+#include "adapters/common/narrow_text.h"
 
 using ambrix::Content;
 using ambrix::makeInCall;
@@ -73,8 +74,7 @@ qvArray* qvCreateString(const char* text) {
   const std::string_view bytes = text == nullptr ? std::string_view() : text;
   const std::size_t sizes[] = {bytes.empty() ? 0U : 1U, bytes.size()};
   qvArray* const array = makeInCall(qvCHAR_CLASS, sizes, Content::kUnset);
-  std::ranges::transform(bytes, qvGetChars(array),
-                         [](char byte) { return static_cast<unsigned char>(byte); });
+  ambrix::widen(bytes, qvGetChars(array));
   return array;
 }
 

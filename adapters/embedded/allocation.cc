@@ -4,11 +4,10 @@
 #include <cstdint>
 #include <cstdlib>
 #include <limits>
-#ifdef __linux__
-#include <sys/mman.h>
-#endif
 
-#include "adapters/embedded/host_errors.h"
+#include "adapters/common/host_errors.h"
+#include "adapters/common/large_pages.h"
+#include "adapters/common/scratch.h"
 #include "ambrix/memory.h"
 
 namespace ambrix {
@@ -36,25 +35,14 @@ std::size_t atLeastOne(std::size_t bytes) {
   return bytes == 0 ? 1 : bytes;
 }
 
-#ifdef __linux__
-// Reading into new memory is mostly a matter of the system providing it, page by page. Pages of
-// 2 MiB cost a small fraction; the system gives them where it is asked to and can. What reaches
-// beyond the last whole one is left in small pages, so that no more is used than was asked for.
-constexpr std::size_t kHugePage = std::size_t{2} << 20U;
-constexpr std::size_t kManyBytes = 2 * kHugePage;
-
+/// Memory that can have large pages begins where one can, so that all but its end lies in them.
 void* allocateUnset(std::size_t bytes) {
-  if (bytes < kManyBytes || bytes > PTRDIFF_MAX - kHugePage) return std::malloc(atLeastOne(bytes));
+  if (bytes < kLargePage || bytes > PTRDIFF_MAX - kLargePage) return std::malloc(atLeastOne(bytes));
   void* memory = nullptr;
-  if (posix_memalign(&memory, kHugePage, bytes) != 0) return nullptr;
-  madvise(memory, bytes / kHugePage * kHugePage, MADV_HUGEPAGE);  // a hint: failing is no matter
+  if (posix_memalign(&memory, kLargePage, bytes) != 0) return nullptr;
+  preferLargePages(memory, bytes);
   return memory;
 }
-#else
-void* allocateUnset(std::size_t bytes) {
-  return std::malloc(atLeastOne(bytes));
-}
-#endif
 
 }  // namespace
 
@@ -74,11 +62,20 @@ void release(void* memory) noexcept {
   std::free(memory);
 }
 
+void* allocateScratch(std::size_t headBytes, std::size_t bytes) {
+  requireWithinLimit(bytes);
+  void* const block = allocate(headBytes + bytes);
+  liveScratch.fetch_add(1, kRelaxed);
+  return block;
+}
+
+void releaseScratch(void* memory) noexcept {
+  release(memory);
+  liveScratch.fetch_sub(1, kRelaxed);
+}
+
 void countArray(int change) noexcept {
   liveArrays.fetch_add(change, kRelaxed);
-}
-void countScratch(int change) noexcept {
-  liveScratch.fetch_add(change, kRelaxed);
 }
 
 LiveCounts liveCounts() noexcept {

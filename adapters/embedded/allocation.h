@@ -15,8 +15,7 @@ void* allocateZeroed(std::size_t bytes);
 /// Returns memory of either kind, or null.
 void release(void* memory) noexcept;
 
-/// What liveCounts() tells.
+/// What liveCounts() tells of arrays.
 void countArray(int change) noexcept;
-void countScratch(int change) noexcept;
 
 }  // namespace ambrix

@@ -83,7 +83,7 @@ Array Array::copyOf(ArrayView array) {
 }
 
 Array Array::adopt(qvArray* array) noexcept {
-  if (array != nullptr) TrackedList::remove(array->place);
+  if (array != nullptr) array->unlink();
   return Array(array);
 }
 

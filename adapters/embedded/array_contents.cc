@@ -6,6 +6,7 @@
 #include <utility>
 #include <vector>
 
+#include "adapters/common/narrow_text.h"
 #include "adapters/embedded/array_object.h"
 
 namespace ambrix {
@@ -39,8 +40,7 @@ qvArray* makeText(std::u16string_view units) {
 
 qvArray* makeNarrowText(std::string_view bytes) {
   qvArray* const array = makeRowOfChars(bytes.size());
-  std::ranges::transform(bytes, static_cast<char16_t*>(array->elements),
-                         [](char byte) { return static_cast<unsigned char>(byte); });
+  widen(bytes, static_cast<char16_t*>(array->elements));
   return array;
 }
 
@@ -53,7 +53,7 @@ qvArray*& cellAt(const qvArray& array, std::size_t index) {
 void setCell(const qvArray& array, std::size_t index, qvArray* value) {
   qvArray*& cell = cellAt(array, index);
   if (cell == value) return;
-  if (value != nullptr) TrackedList::remove(value->place);
+  if (value != nullptr) value->unlink();
   destroyArray(std::exchange(cell, value));
 }
 

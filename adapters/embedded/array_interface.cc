@@ -1,8 +1,8 @@
 // The functions by which the module looks at arrays, and where those that it makes come from.
 #include "adapters/common/array_functions.h"
+#include "adapters/common/call_frame.h"
+#include "adapters/common/class_names.h"
 #include "adapters/embedded/array_object.h"
-#include "adapters/embedded/call_frame.h"
-#include "ambrix/array_view.h"
 
 qvArray* ambrix::makeInCall(qvClassID classId, std::span<const std::size_t> sizes,
                             Content content) {
@@ -24,7 +24,7 @@ qvClassID qvGetClassID(const qvArray* array) {
 }
 
 const char* qvGetClassName(const qvArray* array) {
-  return ambrix::ArrayView(array).className();
+  return ambrix::nameOfClass(array->classId);
 }
 
 std::size_t qvGetNumberOfElements(const qvArray* array) {

@@ -10,11 +10,10 @@
 #include <type_traits>
 #include <utility>
 
+#include "adapters/common/call_frame.h"
+#include "adapters/common/shape.h"
 #include "adapters/embedded/allocation.h"
-#include "adapters/embedded/host_errors.h"
 #include "ambrix/visit.h"
-
-static_assert(std::is_standard_layout_v<qvArray>, "an array is found by its place on a list");
 
 namespace ambrix {
 namespace {
@@ -31,46 +30,6 @@ constexpr auto kElementBytes = [] {
     bytes[static_cast<std::size_t>(classId)] = visitClass(classId, store);
   return bytes;
 }();
-
-struct Shape {
-  std::span<const std::size_t> sizes;  // without trailing 1s; may be fewer than two
-  std::size_t dimensionCount = 0;
-  std::size_t elementCount = 0;
-  std::size_t bytes = 0;
-};
-
-/// The number of elements; 0 as soon as one size is, however large the others are.
-std::size_t countElements(std::span<const std::size_t> sizes) {
-  std::size_t count = sizes.empty() ? 0 : 1;
-  bool tooMany = false;
-  for (const std::size_t size : sizes) {
-    if (size > PTRDIFF_MAX) raiseBadDimension();
-    tooMany |= __builtin_mul_overflow(count, size, &count);
-  }
-  if (tooMany && std::ranges::find(sizes, 0U) == sizes.end()) raiseOutOfMemory();
-  return tooMany ? 0 : count;
-}
-
-Shape shapeOf(qvClassID classId, std::span<const std::size_t> sizes) {
-  Shape shape;
-  shape.elementCount = countElements(sizes);
-  if (__builtin_mul_overflow(shape.elementCount, elementBytes(classId), &shape.bytes)) {
-    raiseOutOfMemory();
-  }
-  while (sizes.size() > 2 && sizes.back() == 1)
-    sizes = sizes.first(sizes.size() - 1);
-  shape.sizes = sizes;
-  shape.dimensionCount = std::max<std::size_t>(sizes.size(), 2);
-  return shape;
-}
-
-/// Sizes that are not given are 1, but no sizes at all make 0-by-0.
-void storeSizes(qvArray& array, const Shape& shape) {
-  const std::size_t missing = shape.sizes.empty() ? 0 : 1;
-  std::size_t* const sizes = array.sizes();
-  for (std::size_t i = 0; i < shape.dimensionCount; ++i)
-    sizes[i] = i < shape.sizes.size() ? shape.sizes[i] : missing;
-}
 
 std::size_t roundUp(std::size_t bytes) {
   return (bytes + kAlignment - 1) / kAlignment * kAlignment;
@@ -97,7 +56,8 @@ Head makeHead(qvClassID classId, const Shape& shape, std::size_t room) {
   array->classId = classId;
   array->elementCount = shape.elementCount;
   array->dimensionCount = shape.dimensionCount;
-  storeSizes(*array, shape);
+  for (std::size_t i = 0; i < shape.dimensionCount; ++i)
+    array->sizes()[i] = shape[i];
   return array;
 }
 
@@ -109,18 +69,19 @@ std::size_t elementBytes(qvClassID classId) noexcept {
 
 qvArray* makeArray(qvClassID classId, std::span<const std::size_t> sizes, Content content) {
   if (elementBytes(classId) == 0) throw std::logic_error("no array can have this class");
-  const Shape shape = shapeOf(classId, sizes);
-  requireWithinLimit(shape.bytes);
+  const Shape shape = shapeOf(sizes);
+  const std::size_t bytes = shape.bytes(elementBytes(classId));
+  requireWithinLimit(bytes);
   const bool zeroed = content == Content::kZero || classId == qvCELL_CLASS;
-  const bool isInline = shape.bytes <= kMostInlineBytes;
+  const bool isInline = bytes <= kMostInlineBytes;
 
-  Head array = makeHead(classId, shape, isInline ? shape.bytes : 0);
+  Head array = makeHead(classId, shape, isInline ? bytes : 0);
   if (!isInline) {
-    array->elements = zeroed ? allocateZeroed(shape.bytes) : allocate(shape.bytes);
+    array->elements = zeroed ? allocateZeroed(bytes) : allocate(bytes);
     array->storage = Storage::kOwnBlock;
-  } else if (shape.bytes != 0) {
+  } else if (bytes != 0) {
     array->elements = behindSizes(*array);
-    if (zeroed) std::memset(array->elements, 0, shape.bytes);
+    if (zeroed) std::memset(array->elements, 0, bytes);
   }
   countArray(1);
   return array.release();
@@ -132,8 +93,8 @@ qvArray* borrowElements(qvClassID classId, std::span<const std::size_t> sizes,
   if (each == 0 || classId == qvCELL_CLASS) {
     throw std::invalid_argument("elements of this class can't be borrowed");
   }
-  const Shape shape = shapeOf(classId, sizes);
-  if (shape.bytes != elements.size()) {
+  const Shape shape = shapeOf(sizes);
+  if (shape.bytes(each) != elements.size()) {
     throw std::invalid_argument("the data do not fill the array");
   }
   if (reinterpret_cast<std::uintptr_t>(elements.data()) % each != 0) {
@@ -149,36 +110,40 @@ qvArray* borrowElements(qvClassID classId, std::span<const std::size_t> sizes,
 
 namespace {
 
-/// Puts the cells of an array in front of a chain of arrays.
-Tracked* chainCells(const qvArray& array, Tracked* chain) noexcept {
-  for (qvArray* const cell : array.cells()) {
-    if (cell == nullptr) continue;
-    cell->place.next = chain;
-    chain = &cell->place;
-  }
-  return chain;
-}
-
 void releaseElements(qvArray& array) noexcept {
   if (array.storage == Storage::kOwnBlock) return release(array.elements);
   std::destroy_at(static_cast<Keeper*>(behindSizes(array)));
+}
+
+void destroyWithoutCells(qvArray& array) noexcept {
+  if (array.storage != Storage::kInline) releaseElements(array);
+  std::destroy_at(&array);
+  release(&array);
+  countArray(-1);
 }
 
 }  // namespace
 
 void destroyArray(qvArray* array) noexcept {
   if (array == nullptr) return;
-  TrackedList::remove(array->place);
-  // Cells nest as deep as anyone likes: what is still to be freed is chained, not recursed into.
-  Tracked* pending = &array->place;
-  while (pending != nullptr) {
-    auto* const next = reinterpret_cast<qvArray*>(pending);
-    pending = next->place.next;
-    if (next->classId == qvCELL_CLASS) pending = chainCells(*next, pending);
-    if (next->storage != Storage::kInline) releaseElements(*next);
-    release(next);
-    countArray(-1);
+  if (array->classId != qvCELL_CLASS) return destroyWithoutCells(*array);
+  // Cells nest as deep as anyone likes: what is still to be freed is listed, not recursed into.
+  array->unlink();
+  TrackedList pending;
+  pending.push_back(*array);
+  while (!pending.empty()) {
+    auto& next = static_cast<qvArray&>(pending.front());
+    pending.pop_front();
+    for (qvArray* const cell :
+         next.classId == qvCELL_CLASS ? next.cells() : std::span<qvArray*>()) {
+      if (cell != nullptr) pending.push_front(*cell);
+    }
+    destroyWithoutCells(next);
   }
+}
+
+void reclaimArray(Tracked& array) noexcept {
+  destroyArray(static_cast<qvArray*>(&array));
 }
 
 }  // namespace ambrix

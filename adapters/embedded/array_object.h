@@ -7,7 +7,7 @@
 #include <string_view>
 
 #include "adapters/common/array_functions.h"
-#include "adapters/embedded/tracked_list.h"
+#include "adapters/common/tracked.h"
 
 namespace ambrix {
 
@@ -17,8 +17,7 @@ enum class Storage : unsigned char { kInline, kOwnBlock, kBorrowed };
 
 /// One block of memory: this, the sizes and, when they are few, the elements. Many elements have
 /// a block of their own. Behind the sizes of borrowed elements is what keeps them.
-struct alignas(std::max_align_t) qvArray {
-  ambrix::Tracked place;  // must stay first: lists hold this
+struct alignas(std::max_align_t) qvArray : ambrix::Tracked {
   qvClassID classId = qvUNKNOWN_CLASS;
   ambrix::Storage storage = ambrix::Storage::kInline;
   std::size_t elementCount = 0;

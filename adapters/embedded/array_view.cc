@@ -3,6 +3,7 @@
 #include <stdexcept>
 
 #include "adapters/catalogue/unicode.h"
+#include "adapters/common/class_names.h"
 #include "adapters/embedded/array_object.h"
 
 namespace ambrix {
@@ -21,16 +22,10 @@ static_assert(isSame(ClassId::kUnknown, qvUNKNOWN_CLASS) && isSame(ClassId::kCel
               isSame(ClassId::kUint32, qvUINT32_CLASS) && isSame(ClassId::kInt64, qvINT64_CLASS) &&
               isSame(ClassId::kUint64, qvUINT64_CLASS));
 
-// By class number; 2 and 5 are classes of other hosts.
-constexpr const char* kClassNames[] = {"unknown", "cell",   "struct", "logical", "char",  "unknown",
-                                       "double",  "single", "int8",   "uint8",   "int16", "uint16",
-                                       "int32",   "uint32", "int64",  "uint64"};
-
 }  // namespace
 
 const char* className(ClassId classId) noexcept {
-  const auto number = static_cast<std::size_t>(classId);
-  return number < std::size(kClassNames) ? kClassNames[number] : kClassNames[0];
+  return nameOfClass(static_cast<qvClassID>(classId));
 }
 
 ClassId ArrayView::classId() const noexcept {

@@ -3,8 +3,6 @@
 #include <mutex>
 
 #include "adapters/catalogue/message_catalogue.h"
-#include "adapters/common/exported_interface.h"
-#include "adapters/embedded/host_errors.h"
 
 namespace ambrix {
 
@@ -49,19 +47,4 @@ std::string messageText(const MessageId& id) {
   return catalogue::messageText(id);
 }
 
-void raiseBadDimension() {
-  throw Error(MessageId("TOLVEX:host", "badDimension"));
-}
-void raiseOutOfMemory() {
-  throw Error(MessageId("TOLVEX:host", "outOfMemory"));
-}
-
 }  // namespace ambrix
-
-void qvErrMsgId(const TOLVEX::ambrix::MessageId& id) {
-  throw ambrix::Error(id);
-}
-
-void qvGetMessageText(const TOLVEX::ambrix::MessageId& id, std::string& text) {
-  text = ambrix::catalogue::messageText(id);
-}

@@ -8,17 +8,14 @@
 #include <stdexcept>
 #include <utility>
 
-#include "adapters/embedded/call_frame.h"
-#include "adapters/embedded/host_errors.h"
+#include "adapters/common/host_errors.h"
+#include "adapters/common/slots.h"
+#include "adapters/embedded/array_object.h"
 #include "adapters/embedded/loaded_module.h"
+#include "adapters/embedded/module_frame.h"
 
 namespace ambrix {
 namespace {
-
-/// Room for the results of any command: modules fill their slots without asking how many are
-/// wanted.
-constexpr std::size_t kSlots = 16;
-using Slots = std::array<qvArray*, kSlots>;
 
 /// The inputs of a call as the module takes them: the command, then the arguments.
 class Inputs {
@@ -48,13 +45,13 @@ class Inputs {
   std::vector<const qvArray*> many_;
 };
 
-/// Takes over the results up to the first slot that is empty; those beyond the wanted ones go.
-std::vector<Array> takeResults(const CallFrame& frame, const Slots& slots, std::size_t wanted) {
-  const auto filled = static_cast<std::size_t>(std::ranges::find(slots, nullptr) - slots.begin());
+/// Takes over the results; those beyond the wanted ones go.
+std::vector<Array> takeResults(const Slots& slots, std::size_t wanted) {
+  const auto filled = resultsIn(slots);
   std::vector<Array> results;
-  results.reserve(std::min(filled, wanted));
-  for (qvArray* const result : std::span(slots).first(filled)) {
-    if (!frame.holds(*result)) {
+  results.reserve(std::min(filled.size(), wanted));
+  for (qvArray* const result : filled) {
+    if (!result->is_linked()) {
       throw std::logic_error("the module has returned an array that is not its own");
     }
     Array array = Array::adopt(result);
@@ -74,17 +71,17 @@ struct Module::State {
   ~State() { unload(); }
 
   void load(const std::filesystem::path& path) {
-    const CallFrame frame(record);  // for what the module does while it is loaded
+    const ModuleFrame frame(record);  // for what the module does while it is loaded
     library.emplace(path);
     entryPoint = library->entryPoint();
   }
 
   std::vector<Array> call(Inputs& inputs, std::size_t outputs) {
-    CallFrame frame(record);
+    ModuleFrame frame(record);
     Slots slots{};
     entryPoint(static_cast<int>(std::min(outputs, kSlots)), slots.data(), inputs.count(),
                inputs.data());
-    std::vector<Array> results = takeResults(frame, slots, outputs);
+    std::vector<Array> results = takeResults(slots, outputs);
     const LiveCounts left = frame.remaining();
     leaks.arrays += left.arrays;
     leaks.scratch += left.scratch;
@@ -100,7 +97,7 @@ struct Module::State {
   }
 
   void runExitHandler() noexcept {
-    const CallFrame frame(record);
+    const ModuleFrame frame(record);
     try {
       if (record.exitHandler != nullptr) std::exchange(record.exitHandler, nullptr)();
     } catch (...) {

@@ -2,31 +2,27 @@
 #include <octave/oct.h>
 
 #include <algorithm>
-#include <array>
 #include <new>
 #include <vector>
 
-#include "adapters/octave/call_frame.h"
-#include "adapters/octave/host_errors.h"
-#include "adapters/octave/octave_array.h"
+#include "adapters/common/call_frame.h"
+#include "adapters/common/host_errors.h"
+#include "adapters/common/slots.h"
+#include "adapters/octave/array_object.h"
 #include "host/qvh.h"
 
 namespace {
 
-using ambrix::octave_host::CallFrame;
+using ambrix::CallFrame;
+using ambrix::Slots;
 
-/// Room for the results of any command: the module fills its slots without asking how many are
-/// wanted.
-constexpr std::size_t kSlots = 8;
-using Slots = std::array<qvArray*, kSlots>;
-
-/// The results up to the first slot that is empty, and no more than were asked for.
+/// The results, and no more than were asked for.
 octave_value_list takeResults(const Slots& slots, int nargout) {
-  const auto wanted = static_cast<std::ptrdiff_t>(std::clamp<int>(nargout, 1, kSlots));
-  const auto end = std::find(slots.begin(), slots.begin() + wanted, nullptr);
+  const auto filled = ambrix::resultsIn(slots);
+  const auto wanted = static_cast<std::size_t>(std::max(nargout, 1));
   octave_value_list results;
-  std::for_each(slots.begin(), end,
-                [&](const qvArray* result) { results.append(result->toOctave()); });
+  for (const qvArray* const result : filled.first(std::min(filled.size(), wanted)))
+    results.append(result->toOctave());
   return results;
 }
 
@@ -72,10 +68,10 @@ DEFUN_DLD(__ambrix__, args, nargout,
   } catch (const octave::exit_exception&) {
     throw;
   } catch (const std::bad_alloc&) {
-    ambrix::octave_host::raiseOutOfMemory();
+    ambrix::raiseOutOfMemory();
   } catch (const std::exception& failure) {
-    ambrix::octave_host::raiseUnexpected(failure.what());
+    ambrix::raiseUnexpected(failure.what());
   } catch (...) {
-    ambrix::octave_host::raiseUnexpected("an exception of an unknown kind");
+    ambrix::raiseUnexpected("an exception of an unknown kind");
   }
 }

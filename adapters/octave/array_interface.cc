@@ -2,17 +2,22 @@
 #include <stdexcept>
 
 #include "adapters/common/array_functions.h"
-#include "adapters/octave/call_frame.h"
-#include "adapters/octave/octave_array.h"
+#include "adapters/common/call_frame.h"
+#include "adapters/octave/array_object.h"
 
-using ambrix::octave_host::CallFrame;
 using ambrix::octave_host::Cells;
 
 qvArray* ambrix::makeInCall(qvClassID classId, std::span<const std::size_t> sizes,
                             Content content) {
   CallFrame* const frame = CallFrame::current();
   if (frame == nullptr) throw std::logic_error("arrays are made only while the module is called");
-  return frame->make(classId, sizes, content);
+  auto* const array = new qvArray(classId, sizes, content);
+  frame->trackArray(*array);
+  return array;
+}
+
+void ambrix::reclaimArray(Tracked& array) noexcept {
+  delete static_cast<qvArray*>(&array);
 }
 
 qvClassID qvGetClassID(const qvArray* array) {

@@ -7,11 +7,9 @@
 #include <memory>
 #include <type_traits>
 
-namespace ambrix::octave_host {
+#include "adapters/common/large_pages.h"
 
-/// Asks the system to back a large buffer that nobody has touched yet with large pages: the library
-/// fills it once, and most of the time that takes goes into getting pages.
-void preferLargePages(void* memory, std::size_t bytes) noexcept;
+namespace ambrix::octave_host {
 
 template <typename Element, typename Allocator>
 Allocator allocatorOf(const Array<Element, Allocator>&);

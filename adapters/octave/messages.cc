@@ -8,7 +8,6 @@
 #include <utility>
 
 #include "adapters/catalogue/message_catalogue.h"
-#include "adapters/octave/host_errors.h"
 #include "host/qvh.h"
 
 namespace {
@@ -48,23 +47,6 @@ void runExitHandler() {
 
 }  // namespace
 
-namespace ambrix::octave_host {
-
-void raiseBadDimension() {
-  qvErrMsgId(MessageId("TOLVEX:host", "badDimension"));
-  std::abort();  // never reached
-}
-void raiseOutOfMemory() {
-  qvErrMsgId(MessageId("TOLVEX:host", "outOfMemory"));
-  std::abort();
-}
-void raiseUnexpected(const char* text) {
-  qvErrMsgId(MessageId("TOLVEX:host", "unexpectedFailure", {std::string(text)}));
-  std::abort();
-}
-
-}  // namespace ambrix::octave_host
-
 void qvErrMsgId(const MessageId& id) {
   const std::string identifier = id.fullIdentifier();
   const std::string text = textFor(id);
@@ -80,10 +62,6 @@ void qvWarningMsgId(const MessageId& id) {
   } catch (...) {
     // Users can have warnings raised as errors, which would keep the files from being closed.
   }
-}
-
-void qvGetMessageText(const MessageId& id, std::string& text) {
-  text = ambrix::catalogue::messageText(id);
 }
 
 // Registered with the C library, which runs the handler when Octave unloads this oct-file and else

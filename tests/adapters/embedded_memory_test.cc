@@ -83,7 +83,7 @@ TEST_F(EmbeddedMemoryTest, LargeArraysFailWholeAtEitherAllocation) {
 #ifdef __linux__
 TEST_F(EmbeddedMemoryTest, ArraysOfManyBytesBeginWhereAHugePageCan) {
   constexpr std::size_t kHugePage = std::size_t{2} << 20U;
-  for (const std::size_t bytes : {2 * kHugePage, 2 * kHugePage + 1, 8 * kHugePage - 1}) {
+  for (const std::size_t bytes : {kHugePage, kHugePage + 1, 8 * kHugePage - 1}) {
     const Array array = Array::uninitialized(ClassId::kInt8, {bytes, 1});
     const auto data = array.bytes();
     EXPECT_EQ(reinterpret_cast<std::uintptr_t>(data.data()) % kHugePage, 0U);

@@ -12,6 +12,7 @@
 #include <vector>
 
 #include "adapters/common/array_functions.h"
+#include "adapters/common/tracked.h"
 
 namespace ambrix::octave_host {
 
@@ -29,7 +30,7 @@ using Elements =
 
 /// Either an argument, whose elements are taken out when they are first asked for, since getting at
 /// those of ranges, sparse matrices and the like means to compute them, or a result.
-struct qvArray {
+struct qvArray : ambrix::Tracked {
  public:
   explicit qvArray(const octave_value& argument);
   /// A result. Raises the host's errors; throws std::logic_error for a class that results cannot

@@ -1,4 +1,4 @@
-#include "adapters/octave/octave_array.h"
+#include "adapters/octave/array_object.h"
 
 #include <octave/Cell.h>
 
@@ -7,25 +7,23 @@
 #include <stdexcept>
 #include <utility>
 
-#include "adapters/octave/class_names.h"
+#include "adapters/common/class_names.h"
+#include "adapters/common/narrow_text.h"
+#include "adapters/common/shape.h"
+#include "adapters/octave/class_of.h"
 #include "adapters/octave/fresh_array.h"
-#include "adapters/octave/host_errors.h"
 
 using ambrix::Content;
+using ambrix::Shape;
 using namespace ambrix::octave_host;
 
 namespace {
 
-/// One size n makes n-by-1.
-dim_vector dimensionsOf(std::span<const std::size_t> sizes) {
-  dim_vector dims(sizes.empty() ? 0 : 1, sizes.empty() ? 0 : 1);
-  dims.resize(static_cast<int>(std::max<std::size_t>(sizes.size(), 2)), 1);
-  int index = 0;
-  for (const std::size_t size : sizes) {
-    if (size > PTRDIFF_MAX) raiseBadDimension();
-    dims.xelem(index++) = static_cast<octave_idx_type>(size);
-  }
-  dims.chop_trailing_singletons();
+dim_vector dimensionsOf(const Shape& shape) {
+  dim_vector dims;
+  dims.resize(static_cast<int>(shape.dimensionCount));
+  for (std::size_t i = 0; i < shape.dimensionCount; ++i)
+    dims.xelem(static_cast<int>(i)) = static_cast<octave_idx_type>(shape[i]);
   return dims;
 }
 
@@ -43,9 +41,7 @@ boolNDArray logicals(const octave_value& value) {
 
 octave_value narrowed(const Characters& characters, const dim_vector& dims) {
   auto bytes = makeUnsetArray<charNDArray>(dims);
-  const std::span units(characters.get(), static_cast<std::size_t>(bytes.numel()));
-  std::ranges::transform(units, bytes.fortran_vec(),
-                         [](char16_t unit) { return static_cast<char>(unit); });
+  ambrix::narrow({characters.get(), static_cast<std::size_t>(bytes.numel())}, bytes.fortran_vec());
   return octave_value(bytes, '\'');
 }
 
@@ -63,7 +59,7 @@ octave_value joined(const Cells& cells, const dim_vector& dims) {
 qvArray::qvArray(const octave_value& argument) : classId_(classOf(argument)), argument_(argument) {}
 
 qvArray::qvArray(qvClassID classId, std::span<const std::size_t> sizes, Content content)
-    : classId_(classId), dims_(dimensionsOf(sizes)) {
+    : classId_(classId), dims_(dimensionsOf(ambrix::shapeOf(sizes))) {
   create(*dims_, content);
 }
 
@@ -72,7 +68,7 @@ charNDArray qvArray::bytes() const {
 }
 
 const char* qvArray::className() const {
-  if (classId_ != qvUNKNOWN_CLASS) return nameOfClass(classId_);
+  if (classId_ != qvUNKNOWN_CLASS) return ambrix::nameOfClass(classId_);
   if (className_.empty()) className_ = argument_.class_name();
   return className_.c_str();
 }
@@ -108,8 +104,7 @@ void qvArray::widenArgument() const {
   const charNDArray source = bytes();
   const auto count = static_cast<std::size_t>(source.numel());
   auto units = std::make_unique_for_overwrite<char16_t[]>(count);
-  std::ranges::transform(std::span(source.data(), count), units.get(),
-                         [](char byte) { return static_cast<unsigned char>(byte); });
+  ambrix::widen({source.data(), count}, units.get());
   data_ = units.get();
   elements_ = std::move(units);
 }
