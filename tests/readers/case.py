@@ -3,6 +3,7 @@
 import tempfile
 import unittest
 import warnings
+from dataclasses import replace
 
 from readers import cdflib_reader, module_reader, pycdfpp_reader
 from readers.comparison import variable_differences
@@ -10,7 +11,7 @@ from readers.content import CHARACTERS, Unread, attempt, fill_texts
 from readers.known_faults import matching
 from support.ambrix_session import Session
 
-SAMPLES = {}  # what was read of sample files, by path
+SAMPLES = {}  # what was read of sample files, by reader and path
 READERS = (cdflib_reader, pycdfpp_reader)
 
 
@@ -31,10 +32,24 @@ class ReadersCase(unittest.TestCase):
 
     def read_sample(self, path):
         """Like `read`, of a file that does not change and is read once; with `reference`."""
-        if path not in SAMPLES:
-            content = self.read(path)
-            SAMPLES[path] = (content, reference(content, path))
-        return SAMPLES[path]
+        return (self.read_sample_alone(path),
+                once(reference, path, lambda: reference(self.read_sample_alone(path), path)))
+
+    def read_sample_alone(self, path):
+        return once(module_reader, path, lambda: self.read(path))
+
+
+def once(reader, path, read):
+    """What was read of a sample file, which takes long."""
+    key = (reader, str(path))
+    if key not in SAMPLES:
+        SAMPLES[key] = read()
+    return SAMPLES[key]
+
+
+def read_by(reader, path):
+    """What an independent reader finds in a sample file."""
+    return once(reader, path, lambda: attempt(reader.read, str(path)))
 
 
 def unexplained(reader, name, found):
@@ -49,7 +64,7 @@ def reference(one, path):
 
     Variables that no reader has right are left out.
     """
-    contents = [(reader, attempt(reader.read, str(path))) for reader in READERS]
+    contents = [(reader, read_by(reader, path)) for reader in READERS]
     found = {}
     for reader, content in contents:
         if isinstance(content, Unread):
@@ -63,6 +78,7 @@ def reference(one, path):
             faulty = any(matching(reader.NAME, path.name, text) for text in texts)
             if name not in found and not faulty:
                 if variable.code in CHARACTERS and one.nul_reads_as:
-                    variable.values = fill_texts(variable.values, one.nul_reads_as)
+                    variable = replace(variable,
+                                       values=fill_texts(variable.values, one.nul_reads_as))
                 found[name] = variable
     return found

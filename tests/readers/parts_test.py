@@ -2,17 +2,14 @@
 
 import random
 import unittest
-import warnings
 
 import numpy as np
 
-from readers import module_reader
-from readers.case import ReadersCase, reference
+from readers.case import ReadersCase
 from readers.comparison import first_difference, same_numbers
 from readers.content import leading_of
 from readers.module_reader import ModuleReader, host_size, to_numpy
 from readers.sample_files import readable_files
-from support.ambrix_session import Session
 
 RECORDS = 3  # of each variable
 SLABS = 2  # of each variable
@@ -64,14 +61,6 @@ def slab(size):
 
 
 class PartsTest(ReadersCase):
-    @classmethod
-    def setUpClass(cls):
-        """Right values of every file, by path."""
-        warnings.simplefilter("ignore")  # the readers' own
-        with Session() as session:
-            cls.right = {path: reference(module_reader.read(session, str(path)), path)
-                         for path in readable_files().values()}
-
     def setUp(self):
         super().setUp()
         random.seed(20)  # the same places each time
@@ -83,7 +72,8 @@ class PartsTest(ReadersCase):
     def check_all(self, check):
         """Calls check(reader, number, variable) for every variable with records, its values those
         of an independent reader."""
-        for path, right in self.right.items():
+        for path in readable_files().values():
+            _, right = self.read_sample(path)
             with ModuleReader(self.session, str(path)) as reader:
                 for number, name in enumerate(reader.names()):
                     variable = reader.definition(number)

@@ -3,9 +3,9 @@
 import unittest
 
 from readers import pycdfpp_reader
-from readers.case import READERS, ReadersCase, unexplained
+from readers.case import READERS, ReadersCase, read_by, unexplained
 from readers.comparison import differences
-from readers.content import CHARACTERS, attempt
+from readers.content import CHARACTERS
 from readers.known_faults import rows_for
 from readers.sample_files import FOLDER, UNREADABLE, distribution_files, folder_files
 from readers.sample_files import needs_folder, readable_files
@@ -17,10 +17,10 @@ class SamplesTest(ReadersCase):
         self.assertTrue(files)
         used = set()
         for name, path in files.items():
-            mine = self.read(path)
+            mine = self.read_sample_alone(path)
             for reader in READERS:
                 with self.subTest(file=name, reader=reader.NAME):
-                    theirs = attempt(reader.read, str(path))
+                    theirs = read_by(reader, path)
                     rest, rows = unexplained(reader, name, differences(mine, theirs))
                     used |= rows
                     self.assertEqual(rest, [])
