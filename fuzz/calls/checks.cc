@@ -9,54 +9,10 @@
 #include "fuzz/calls/call_log.h"
 #include "fuzz/calls/values.h"
 #include "gateway/open_file_registry.h"
+#include "tests/support/known_messages.h"
 
 namespace ambrix_fuzz {
 namespace {
-
-/// An identifier and the kinds of its values: i for integer, t for narrow text.
-struct KnownError {
-  const char* identifier;
-  std::string_view values;
-};
-
-constexpr KnownError kErrors[] = {
-    {"TOLVEX:ambrix:cdflib:badDimSpec", "it"},
-    {"TOLVEX:ambrix:cdflib:badDimensionExtent", "ti"},
-    {"TOLVEX:ambrix:cdflib:badEpoch16Modulus", ""},
-    {"TOLVEX:ambrix:cdflib:badEpochVector", "i"},
-    {"TOLVEX:ambrix:cdflib:badPutAttrEntryDatatype", "tt"},
-    {"TOLVEX:ambrix:cdflib:badVarianceDatatype", ""},
-    {"TOLVEX:ambrix:cdflib:cannotOmitDimSpec", ""},
-    {"TOLVEX:ambrix:cdflib:datatypeMismatch", "tt"},
-    {"TOLVEX:ambrix:cdflib:dimSizeTooLarge", ""},
-    {"TOLVEX:ambrix:cdflib:fileCreateError", ""},
-    {"TOLVEX:ambrix:cdflib:fileOpenError", ""},
-    {"TOLVEX:ambrix:cdflib:illegalEpochValue", ""},
-    {"TOLVEX:ambrix:cdflib:invalidCharError", ""},
-    {"TOLVEX:ambrix:cdflib:invalidCompressionParameter", "it"},
-    {"TOLVEX:ambrix:cdflib:invalidFileId", ""},
-    {"TOLVEX:ambrix:cdflib:invalidOperation", "t"},
-    {"TOLVEX:ambrix:cdflib:libraryFailure", "tt"},
-    {"TOLVEX:ambrix:cdflib:mismatchedVarianceSize", "ii"},
-    {"TOLVEX:ambrix:cdflib:unrecognizedConstantName", "t"},
-    {"TOLVEX:ambrix:cdflib:unrecognizedValue", "it"},
-    {"TOLVEX:ambrix:cdflib:unspecifiedGzipCompressionLevel", ""},
-    {"TOLVEX:ambrix:cdflib:varCacheSizeOpInappropriate", ""},
-    {"TOLVEX:ambrix:cdflib:wrongNumberOfHyperPutVarDataElements", "titi"},
-    {"TOLVEX:ambrix:cdflib:wrongNumberOfPadValueElements", "ti"},
-    {"TOLVEX:ambrix:cdflib:wrongNumberOfPutVarDataElements", "ti"},
-    {"TOLVEX:ambrix:cdflib:wrongNumberOfPutVarRecordDataElements", "ti"},
-    {"TOLVEX:ambrix:cdflib:closingFileHandle", ""},
-    {"TOLVEX:ambrix:validate:argumentNotDoublePrecision", "t"},
-    {"TOLVEX:ambrix:validate:argumentNotDoubleScalar", "t"},
-    {"TOLVEX:ambrix:validate:argumentNotUint64Scalar", "t"},
-    {"TOLVEX:ambrix:validate:argumentOutOfBounds", ""},
-    {"TOLVEX:ambrix:validate:wrongNumberOfInputs", ""},
-    {"TOLVEX:host:badDimension", ""},
-    {"TOLVEX:host:outOfMemory", ""},
-    {"not text", ""},
-};
-static_assert(std::size(kErrors) <= kMostErrors);
 
 constexpr std::size_t kMostDimensions = 10;
 constexpr std::size_t kMostStatusText = 200;
@@ -66,6 +22,27 @@ std::string kindsOf(const std::vector<ambrix::MessageArg>& values) {
   for (const ambrix::MessageArg& value : values)
     kinds += "itu"[value.index()];
   return kinds;
+}
+
+/// An identifier and the kinds of its values: i for integer, t for narrow text.
+struct KnownError {
+  std::string identifier;
+  std::string values;
+};
+
+/// The last one stands for the exception without identifier.
+const std::vector<KnownError>& errors() {
+  static const auto kErrors = [] {
+    std::vector<KnownError> known;
+    for (const auto& message : ambrix_test::knownMessages()) {
+      // What this host would not catch.
+      if (message.id.identifier == "unexpectedFailure") continue;
+      known.push_back({message.id.fullIdentifier(), kindsOf(message.id.values)});
+    }
+    known.push_back({"not text", ""});
+    return known;
+  }();
+  return kErrors;
 }
 
 bool isMatrix(ArrayView array, ClassId classId, std::size_t rows) {
@@ -159,22 +136,21 @@ std::size_t arraysIn(ArrayView array) {
 }  // namespace
 
 std::size_t knownErrors() {
-  return std::size(kErrors);
+  return errors().size();
 }
 
 const char* errorName(std::size_t place) {
-  return kErrors[place].identifier;
+  return errors()[place].identifier.c_str();
 }
 
 std::size_t placeOfNotText() {
-  return std::size(kErrors) - 1;
+  return errors().size() - 1;
 }
 
 std::size_t requireKnown(const ambrix::MessageId& error) {
   const std::string identifier = error.fullIdentifier();
-  const auto* found = std::ranges::find_if(
-      kErrors, [&identifier](const KnownError& row) { return identifier == row.identifier; });
-  if (found == std::end(kErrors)) violation("no such error: " + identifier);
+  const auto found = std::ranges::find(errors(), identifier, &KnownError::identifier);
+  if (found == errors().end()) violation("no such error: " + identifier);
   const std::string kinds = kindsOf(error.values);
   if (kinds != found->values) violation(identifier + " with values of kinds " + kinds);
   if (identifier.ends_with("libraryFailure")) {
@@ -183,7 +159,7 @@ std::size_t requireKnown(const ambrix::MessageId& error) {
     const bool sane = routine.starts_with("CDF") && text.size() <= kMostStatusText;
     if (!sane) violation("libraryFailure of " + routine + ": " + text);
   }
-  return static_cast<std::size_t>(found - kErrors);
+  return static_cast<std::size_t>(found - errors().begin());
 }
 
 void requireSane(const ambrix_test::Command& command, const std::vector<Array>& results,

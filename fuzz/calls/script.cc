@@ -42,12 +42,6 @@ long oddNumber(Choices& choices) {
   return choices.pick(kOddNumbers);
 }
 
-long valueBytes(long datatype) {
-  constexpr long kOtherBytes = 8;  // of the datatypes that only the library knows
-  const std::size_t known = bytesOfDatatype(datatype);
-  return known == 0 ? kOtherBytes : static_cast<long>(known);
-}
-
 }  // namespace
 
 Script& script() {
@@ -141,11 +135,9 @@ double Script::epoch() {
 }
 
 std::size_t bytesOf(const Description& variable, long values) {
-  long bytes = 0;
-  const bool wraps = __builtin_mul_overflow(values, variable.elements, &bytes) ||
-                     __builtin_mul_overflow(bytes, valueBytes(variable.datatype), &bytes);
-  if (wraps) violation("the library would be asked for more than it can count");
-  return bytes < 0 ? 0 : static_cast<std::size_t>(bytes);
+  const auto bytes = ambrix_test::bytesOf(variable, values);
+  if (!bytes) violation("the library would be asked for more than it can count");
+  return *bytes;
 }
 
 void readAll(const void* memory, std::size_t bytes) {

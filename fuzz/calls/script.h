@@ -2,28 +2,17 @@
 // CDF library: it reads and writes exactly as much as its own description of a variable says.
 #pragma once
 
-#include <array>
 #include <cstddef>
 #include <string>
 
 #include "fuzz/calls/choices.h"
 #include "fuzz/calls/world.h"
+#include "tests/support/library_variable.h"
 
 namespace ambrix_fuzz {
 
-inline constexpr std::size_t kLibraryDimensions = 10;
-using Slots = std::array<long, kLibraryDimensions>;
-
 /// A variable as the library tells of it, which may be nonsense.
-struct Description {
-  long datatype = 22;
-  long elements = 1;
-  long dimensions = 0;
-  Slots sizes{};
-  long recordVariance = -1;
-  Slots variances{};
-  long majority = 2;
-};
+using Description = ambrix_test::LibraryVariable;
 
 class Script {
  public:
@@ -63,7 +52,7 @@ class Script {
 
 Script& script();
 
-/// How many bytes `values` values of the description take; 0 for what the library would refuse.
+/// How many bytes `values` values of the description take; more than can be counted is a violation.
 std::size_t bytesOf(const Description& variable, long values);
 
 /// Reads or writes memory as the library would, so that the sanitizers see whether it is there.

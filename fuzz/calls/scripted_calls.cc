@@ -1,24 +1,22 @@
-// CDFlib of the scripted library: takes an argument list apart as the CDF library does, and touches
-// all the memory that it would touch.
+// CDFlib of the scripted library: touches all the memory that the CDF library would touch.
 #include <cdf.h>
 
 #include <algorithm>
-#include <array>
-#include <cstdarg>
 #include <cstring>
 #include <string>
+#include <string_view>
 
 #include "fuzz/calls/call_log.h"
 #include "fuzz/calls/script.h"
-#include "tests/support/fake_cdflib_items.h"
+#include "tests/support/library_call.h"
 
 namespace {
 
 using ambrix_fuzz::Description;
 using ambrix_fuzz::requireFitting;
 using ambrix_fuzz::Script;
-using ambrix_fuzz::Slots;
 using ambrix_test::Item;
+using ambrix_test::Slots;
 
 constexpr std::size_t kLongestName = 256;
 constexpr std::size_t kLongestPath = 512;
@@ -29,141 +27,55 @@ bool numbersNoVariable(long number) {
   return number < 0 || number == 2147483647;
 }
 
-/// The hyperslab that a list has selected.
-struct Selection {
-  long recordCount = 1;
-  long recordInterval = 1;
-  Slots start{};
-  Slots count{};
-  Slots interval{};
-};
-
-/// The values of the selection; 0 if the library refuses it.
-long valuesOf(const Selection& slab, const Description& variable) {
-  long values = std::max(slab.recordCount, 0L);
-  for (std::size_t i = 0; i < static_cast<std::size_t>(variable.dimensions); ++i) {
-    const bool sound = slab.count[i] >= 1 && slab.interval[i] >= 1 && slab.start[i] >= 0;
-    const long last = slab.start[i] + (slab.count[i] - 1) * slab.interval[i];
-    if (!sound || last >= variable.sizes[i]) return 0;
-    if (__builtin_mul_overflow(values, slab.count[i], &values)) return 0;
-  }
-  return values;
-}
-
-/// What the library reads of it: of a variable whose records do not vary it reads whole records
-/// with all those between them.
-long valuesReadOf(const Selection& slab, const Description& variable) {
-  const long values = valuesOf(slab, variable);
-  bool whole = variable.recordVariance == NOVARY;
-  for (std::size_t i = 0; i < static_cast<std::size_t>(variable.dimensions); ++i)
-    whole = whole && slab.count[i] == (variable.variances[i] == NOVARY ? 1 : variable.sizes[i]);
-  if (!whole || values == 0) return values;
-  return values / slab.recordCount * (slab.recordInterval * (slab.recordCount - 1) + 1);
-}
-
-class ArgumentList {
+class ScriptedCall : public ambrix_test::LibraryCall {
  public:
-  ArgumentList(std::va_list list, bool silent) : silent_(silent) { va_copy(list_, list); }
-  ~ArgumentList() { va_end(list_); }
-  ArgumentList(const ArgumentList&) = delete;
-  ArgumentList& operator=(const ArgumentList&) = delete;
-
-  void read(long operation) {
-    while (operation != NULL_) {
-      operation_ = operation;
-      for (next_ = va_arg(list_, long); next_ < NULL_; next_ = va_arg(list_, long))
-        readItem();
-      operation = next_;
-    }
-  }
+  /// A silent one touches none of the caller's memory, but for texts of a status.
+  ScriptedCall(std::va_list list, bool silent) : LibraryCall(list), silent_(silent) {}
 
   [[nodiscard]] bool refused() const { return refused_; }
 
  private:
-  void readItem() {
-    const Item* item = ambrix_test::findItem(operation_, next_);
-    if (item == nullptr) ambrix_fuzz::violation("the library would not understand an item");
-    for (const char* kind = item->arguments; *kind != '\0'; ++kind)
-      readArgument(*item, *kind);
-  }
+  [[nodiscard]] bool touchesNothing() const { return silent_ || refused_; }
 
-  void readArgument(const Item& item, char kind) {
-    if (kind == 'n') return takeNumber(item.name);
-    void* const place = va_arg(list_, void*);
-    if (kind >= 'a') return take(item.name, kind, place);
-    if (!(silent_ || refused_) || kind == 'T') fill(item.name, kind, place);
+  void takeNumber(const Item& item, long number) override {
+    const std::string_view name = item.name;
+    if (name != "CDF_STATUS_") requireFitting(number);
+    if (name == "zVAR_" && numbersNoVariable(number)) refused_ = true;
   }
-
-  void takeNumber(const std::string& item) {
-    const long number = va_arg(list_, long);
-    if (item != "CDF_STATUS_") requireFitting(number);
-    lastNumber_ = number;
-    if (item == "zVAR_" && numbersNoVariable(number)) refused_ = true;
-    if (item == "zVAR_RECCOUNT_") slab_.recordCount = number;
-    if (item == "zVAR_RECINTERVAL_") slab_.recordInterval = number;
+  void takeText(const char* text) override { ambrix_fuzz::readAll(text, std::strlen(text) + 1); }
+  void takeParameters(const long* parameters) override {
+    ambrix_fuzz::readAll(parameters, sizeof(long));
   }
-
-  void take(const std::string& item, char kind, void* place) {
-    switch (kind) {
-      case 's':
-        return ambrix_fuzz::readAll(place, std::strlen(static_cast<char*>(place)) + 1);
-      case 'p':
-        return ambrix_fuzz::readAll(place, sizeof(long));
-      case 'v':
-        return takeVector(item, static_cast<const long*>(place));
-      case 'd':
-        return silent_ || refused_ ? void() : ambrix_fuzz::readAll(place, bytesOfData(item));
-      default:
-        break;  // a handle, which is not followed
-    }
+  void takeVector(const Slots& entries) override { std::ranges::for_each(entries, requireFitting); }
+  void takeData(const void* data, long values) override {
+    if (!touchesNothing()) ambrix_fuzz::readAll(data, ambrix_fuzz::bytesOf(variable(), values));
   }
-
-  void takeVector(const std::string& item, const long* numbers) {
-    if (operation_ == CREATE_) {  // as many as the variable will have dimensions
-      const long count = lastNumber_ <= CDF_MAX_DIMS ? std::max(lastNumber_, 0L) : 0;
-      std::for_each(numbers, numbers + count, requireFitting);
-      return;
-    }
-    Slots entries{};
-    std::copy_n(numbers, entries.size(), entries.begin());
-    std::ranges::for_each(entries, requireFitting);
-    if (item == "zVAR_DIMINDICES_") slab_.start = entries;
-    if (item == "zVAR_DIMCOUNTS_") slab_.count = entries;
-    if (item == "zVAR_DIMINTERVALS_") slab_.interval = entries;
+  void fillData(void* data, long values) override {
+    if (!touchesNothing()) ambrix_fuzz::writeAll(data, ambrix_fuzz::bytesOf(variable(), values));
   }
+  [[nodiscard]] Description variable() const override { return script_.variable(); }
 
-  [[nodiscard]] std::size_t bytesOfData(const std::string& item) const {
-    const Description& variable = script_.variable();
-    const bool hyper = item == "zVAR_HYPERDATA_";
-    const auto values = operation_ == GET_ ? valuesReadOf : valuesOf;
-    return ambrix_fuzz::bytesOf(variable, hyper ? values(slab_, variable) : 1);
-  }
-
-  void fill(const std::string& item, char kind, void* place) {
+  void fill(const Item& item, char kind, std::size_t, void* place) override {
+    if (kind == 'T') return fillText(place, kLongestStatusText);
+    if (touchesNothing()) return;
     switch (kind) {
       case 'N':
-        *static_cast<long*>(place) = script_.number(item);
+        *static_cast<long*>(place) = script_.number(item.name);
         break;
       case 'P':
         fillParameters(static_cast<long*>(place));
         break;
       case 'V':
-        fillVector(item, static_cast<long*>(place));
+        fillVector(item.name, static_cast<long*>(place));
         break;
       case 'S':
-        fillText(place, item == "CDF_NAME_" ? kLongestPath : kLongestName);
-        break;
-      case 'T':
-        fillText(place, kLongestStatusText);
+        fillText(place, item.name == std::string_view("CDF_NAME_") ? kLongestPath : kLongestName);
         break;
       case 'C':
         *static_cast<char*>(place) = ' ';
         break;
-      case 'H':
-        *static_cast<CDFid*>(place) = reinterpret_cast<CDFid>(script_.handle());
-        break;
       default:
-        ambrix_fuzz::writeAll(place, bytesOfData(item));
+        *static_cast<CDFid*>(place) = reinterpret_cast<CDFid>(script_.handle());
     }
   }
 
@@ -177,7 +89,7 @@ class ArgumentList {
     std::fill_n(parameters, script_.choices().oneIn(2) ? CDF_MAX_PARMS : 1, parameter);
   }
 
-  void fillVector(const std::string& item, long* place) {
+  void fillVector(std::string_view item, long* place) {
     const Description& variable = script_.variable();
     const Slots& from = item == "zVAR_DIMVARYS_" ? variable.variances : variable.sizes;
     const bool of = item == "zVAR_DIMVARYS_" || item == "zVAR_DIMSIZES_";
@@ -186,13 +98,8 @@ class ArgumentList {
   }
 
   Script& script_ = ambrix_fuzz::script();
-  std::va_list list_;
   bool silent_;
-  long operation_ = 0;
-  long next_ = 0;
-  long lastNumber_ = 0;
   bool refused_ = false;
-  Selection slab_;
 };
 
 }  // namespace
@@ -200,9 +107,9 @@ class ArgumentList {
 extern "C" CDFstatus CDFlib(long operation, ...) {
   std::va_list arguments;
   va_start(arguments, operation);
-  ArgumentList list(arguments, ambrix_fuzz::script().stopsEarly());
+  ScriptedCall call(arguments, ambrix_fuzz::script().stopsEarly());
   va_end(arguments);
-  list.read(operation);
+  if (!call.read(operation)) ambrix_fuzz::violation("the library would not understand a call");
   const long status = ambrix_fuzz::script().nextStatus();
-  return list.refused() ? BAD_VAR_NUM : status;
+  return call.refused() ? BAD_VAR_NUM : status;
 }

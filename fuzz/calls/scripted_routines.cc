@@ -30,14 +30,9 @@ long finish(std::initializer_list<long> numbers) {
   return script().nextStatus();
 }
 
-/// What a whole record takes: along a dimension that does not vary, one value.
 std::size_t bytesOfRecord() {
   const Description& variable = script().variable();
-  long values = 1;
-  for (std::size_t i = 0; i < static_cast<std::size_t>(variable.dimensions); ++i) {
-    if (variable.variances[i] != NOVARY) values *= variable.sizes[i];
-  }
-  return ambrix_fuzz::bytesOf(variable, values);
+  return ambrix_fuzz::bytesOf(variable, ambrix_test::valuesOfRecord(variable));
 }
 
 std::size_t bytesOfEntry(long datatype, long elements) {

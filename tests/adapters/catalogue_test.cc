@@ -7,6 +7,7 @@
 
 #include "adapters/catalogue/message_catalogue.h"
 #include "adapters/catalogue/unicode.h"
+#include "tests/support/known_messages.h"
 
 namespace {
 
@@ -18,58 +19,9 @@ using TOLVEX::ambrix::MessageId;
 
 constexpr const char* kCdflib = "TOLVEX:ambrix:cdflib";
 constexpr const char* kValidate = "TOLVEX:ambrix:validate";
-constexpr const char* kHost = "TOLVEX:host";
-
-struct Case {
-  MessageId id;
-  std::vector<std::string> shown;  // values as they must stand in the text, in this order
-};
-
-// Identifiers, kinds and order of the values as the module carries them.
-const std::vector<Case>& allMessages() {
-  static const std::vector<Case> kAll = {
-      {{kCdflib, "badDimSpec", {7, "Var"}}, {"\"Var\"", "has 7 dimensions"}},
-      {{kCdflib, "badDimensionExtent", {"Var", 7}}, {"\"Var\"", "has 7 dimensions"}},
-      {{kCdflib, "badEpoch16Modulus"}, {}},
-      {{kCdflib, "badEpochVector", {7}}, {"takes 7 components", "multiple of 7"}},
-      {{kCdflib, "badPutAttrEntryDatatype", {"double", "CDF_INT4"}}, {"double", "CDF_INT4"}},
-      {{kCdflib, "badVarianceDatatype"}, {}},
-      {{kCdflib, "cannotOmitDimSpec"}, {}},
-      {{kCdflib, "closingFileHandle"}, {}},
-      {{kCdflib, "datatypeMismatch", {"single", "CDF_REAL8"}}, {"single", "CDF_REAL8"}},
-      {{kCdflib, "dimSizeTooLarge"}, {}},
-      {{kCdflib, "fileCreateError"}, {}},
-      {{kCdflib, "fileOpenError"}, {}},
-      {{kCdflib, "illegalEpochValue"}, {}},
-      {{kCdflib, "invalidCharError"}, {}},
-      {{kCdflib, "invalidCompressionParameter", {10, "GZIP"}}, {"GZIP", "10"}},
-      {{kCdflib, "invalidFileId"}, {}},
-      {{kCdflib, "invalidOperation", {"Open"}}, {"\"Open\""}},
-      {{kCdflib, "libraryFailure", {"CDFcloseCDF", "BAD ID"}}, {"CDFcloseCDF", "BAD ID"}},
-      {{kCdflib, "mismatchedVarianceSize", {3, 2}}, {"3 dimension variances", "2 dimensions"}},
-      {{kCdflib, "unrecognizedConstantName", {"CDF_INT3"}}, {"\"CDF_INT3\""}},
-      {{kCdflib, "unrecognizedValue", {33, "DATATYPE"}}, {"33", "DATATYPE"}},
-      {{kCdflib, "unspecifiedGzipCompressionLevel"}, {}},
-      {{kCdflib, "varCacheSizeOpInappropriate"}, {}},
-      {{kCdflib, "wrongNumberOfHyperPutVarDataElements", {"[ 2 3 ]", 5, "Var", 30}},
-       {"[ 2 3 ]", "5 records", "\"Var\"", "30 values"}},
-      {{kCdflib, "wrongNumberOfPadValueElements", {"Var", 4}}, {"\"Var\"", "4"}},
-      {{kCdflib, "wrongNumberOfPutVarDataElements", {"Var", 4}}, {"\"Var\"", "4"}},
-      {{kCdflib, "wrongNumberOfPutVarRecordDataElements", {"Var", 4}}, {"\"Var\"", "4"}},
-      {{kValidate, "argumentNotDoublePrecision", {"EPOCHTIME"}}, {"EPOCHTIME"}},
-      {{kValidate, "argumentNotDoubleScalar", {"VARNUM"}}, {"VARNUM"}},
-      {{kValidate, "argumentNotUint64Scalar", {"CDFID"}}, {"CDFID"}},
-      {{kValidate, "argumentOutOfBounds"}, {}},
-      {{kValidate, "wrongNumberOfInputs"}, {}},
-      {{kHost, "badDimension"}, {}},
-      {{kHost, "outOfMemory"}, {}},
-      {{kHost, "unexpectedFailure", {"no such text"}}, {"no such text"}},
-  };
-  return kAll;
-}
 
 TEST(CatalogueTest, EveryMessageIsASentenceWithItsValuesInPlace) {
-  for (const Case& message : allMessages()) {
+  for (const auto& message : ambrix_test::knownMessages()) {
     const std::string text = messageText(message.id);
     SCOPED_TRACE(text);
     EXPECT_THAT(text, Not(HasSubstr(message.id.identifier)));
@@ -89,7 +41,7 @@ TEST(CatalogueTest, WordsTheLibrarysFailure) {
 }
 
 TEST(CatalogueTest, MissingAndFurtherValuesDoNoHarm) {
-  for (const Case& message : allMessages()) {
+  for (const auto& message : ambrix_test::knownMessages()) {
     MessageId id = message.id;
     id.values.clear();
     const std::string bare = messageText(id);

@@ -63,11 +63,17 @@ class TableTest(unittest.TestCase):
         texts = (ROOT / "adapters/catalogue/message_texts.cc").read_text()
         worded = set(re.findall(r'\{"(TOLVEX:[\w:]+)",', texts))
         self.assertEqual({name for name in worded if ":host:" not in name}, listed)
-        tests = (ROOT / "tests/adapters/catalogue_test.cc").read_text()
+        tests = (ROOT / "tests/support/known_messages.cc").read_text()
         components = dict(re.findall(r'(k\w+) = "(TOLVEX:[\w:]+)"', tests))
         tried = {f"{components[kind]}:{name}"
                  for kind, name in re.findall(r'\{\{(k\w+), "(\w+)"', tests)}
         self.assertEqual(tried, worded)
+
+    def test_each_message_of_a_host_has_a_text(self):
+        raised = {f"TOLVEX:host:{name}" for path in (ROOT / "adapters").rglob("*.cc")
+                  for name in re.findall(r'"TOLVEX:host", "(\w+)"', path.read_text())}
+        texts = (ROOT / "adapters/catalogue/message_texts.cc").read_text()
+        self.assertEqual(raised, set(re.findall(r'\{"(TOLVEX:host:\w+)",', texts)))
 
     def test_has_each_identifier_once_with_as_many_values(self):
         text = (ROOT / "gateway" / "errors.h").read_text()

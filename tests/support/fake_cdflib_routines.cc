@@ -12,8 +12,11 @@
 namespace {
 
 using ambrix_test::bytesOfEntry;
-using ambrix_test::bytesOfRecord;
 using ambrix_test::fakeCdflib;
+
+std::size_t bytesOfRecord() {
+  return ambrix_test::bytesOfValues(ambrix_test::valuesOfRecord(ambrix_test::describedVariable()));
+}
 
 std::string textOf(const char* routine, CDFid id, std::initializer_list<long> numbers) {
   std::string text =

@@ -2,56 +2,43 @@
 
 #include <gtest/gtest.h>
 
-#include "tests/support/datatypes.h"
+#include <algorithm>
+
 #include "tests/support/fake_cdflib.h"
 
 namespace ambrix_test {
 namespace {
 
-std::size_t counted(double bytes) {
+std::size_t counted(std::optional<std::size_t> bytes) {
   if (!fakeCdflib().movesExactly()) return 0;  // nobody needs it
-  if (bytes >= 0 && bytes <= kMostBytes) return static_cast<std::size_t>(bytes);
-  ADD_FAILURE() << "the library would move " << bytes << " bytes";
+  if (bytes && *bytes <= kMostBytes) return *bytes;
+  ADD_FAILURE() << "the library would move too much";
   return 0;
-}
-
-double datatypeBytes(long code) {
-  return static_cast<double>(libraryBytes(code));
-}
-
-double valueBytes() {
-  const FakeCdflib& fake = fakeCdflib();
-  return static_cast<double>(fake.number("zVAR_NUMELEMS_")) *
-         datatypeBytes(fake.number("zVAR_DATATYPE_"));
 }
 
 }  // namespace
 
-std::size_t bytesOfValue() {
-  return counted(valueBytes());
-}
-
-std::size_t bytesOfRecord() {
+LibraryVariable describedVariable() {
   const FakeCdflib& fake = fakeCdflib();
-  double bytes = valueBytes();
-  for (std::size_t i = 0; i < fake.numbers("zVAR_DIMSIZES_").size(); ++i) {
-    if (fake.number("zVAR_DIMVARYS_", i) != 0)
-      bytes *= static_cast<double>(fake.number("zVAR_DIMSIZES_", i));
+  const Numbers& sizes = fake.numbers("zVAR_DIMSIZES_");
+  const std::size_t dimensions = std::min(sizes.size(), kLibraryDimensions);
+  LibraryVariable variable{.datatype = fake.number("zVAR_DATATYPE_"),
+                           .elements = fake.number("zVAR_NUMELEMS_"),
+                           .dimensions = static_cast<long>(dimensions),
+                           .recordVariance = fake.number("zVAR_RECVARY_")};
+  for (std::size_t i = 0; i < dimensions; ++i) {
+    variable.sizes[i] = sizes[i];
+    variable.variances[i] = fake.number("zVAR_DIMVARYS_", i);
   }
-  return counted(bytes);
+  return variable;
 }
 
-std::size_t bytesOfHyperslab(long records, std::span<const long> counts) {
-  double bytes = valueBytes() * static_cast<double>(records);
-  for (const long count : counts) {
-    if (count < 1) return 0;
-    bytes *= static_cast<double>(count);
-  }
-  return records < 1 ? 0 : counted(bytes);
+std::size_t bytesOfValues(long values) {
+  return counted(bytesOf(describedVariable(), values));
 }
 
 std::size_t bytesOfEntry(long datatype, long elements) {
-  return counted(datatypeBytes(datatype) * static_cast<double>(elements));
+  return counted(bytesOf({.datatype = datatype, .elements = elements}, 1));
 }
 
 }  // namespace ambrix_test

@@ -2,10 +2,10 @@
 #include <functional>
 #include <new>
 
-#include "gateway/errors.h"
 #include "gateway/open_file_registry.h"
 #include "tests/scripted/commands/command_test.h"
 #include "tests/support/failing_new.h"
+#include "tests/support/raised_errors.h"
 
 namespace ambrix_test {
 namespace {
@@ -100,41 +100,15 @@ TEST_P(MemoryExhaustionTest, WhileAFailureIsReportedIsAnErrorLikewise) {
 
 INSTANTIATE_TEST_SUITE_P(Commands, MemoryExhaustionTest, testing::ValuesIn(commands()), nameOf);
 
-/// Each error, with texts too long to fit into a string itself.
-std::vector<std::function<TOLVEX::ambrix::MessageId()>> errors() {
-  namespace cdflib = TOLVEX::ambrix::cdflib;
-  namespace validate = TOLVEX::ambrix::validate;
-  static const std::string kText(100, 't');
-  return {[] { return cdflib::badDimSpec(1, kText); },
-          [] { return cdflib::badDimensionExtent(kText, 1); },
-          [] { return cdflib::badEpoch16Modulus(); },
-          [] { return cdflib::badEpochVector(7); },
-          [] { return cdflib::badPutAttrEntryDatatype(kText, kText); },
-          [] { return cdflib::datatypeMismatch(kText, kText); },
-          [] { return cdflib::invalidCompressionParameter(1, kText); },
-          [] { return cdflib::invalidOperation(kText); },
-          [] { return cdflib::libraryFailure(kText, kText); },
-          [] { return cdflib::mismatchedVarianceSize(1, 2); },
-          [] { return cdflib::unrecognizedConstantName(kText); },
-          [] { return cdflib::unrecognizedValue(1, kText); },
-          [] { return cdflib::wrongNumberOfHyperPutVarDataElements(kText, 1, kText, 2); },
-          [] { return cdflib::wrongNumberOfPadValueElements(kText, 1); },
-          [] { return cdflib::wrongNumberOfPutVarDataElements(kText, 1); },
-          [] { return cdflib::wrongNumberOfPutVarRecordDataElements(kText, 1); },
-          [] { return validate::argumentNotDoublePrecision(kText); },
-          [] { return validate::argumentNotDoubleScalar(kText); },
-          [] { return validate::argumentNotUint64Scalar(kText); },
-          [] { return validate::wrongNumberOfInputs(); }};
-}
-
 TEST(ErrorsAndMemoryTest, AnErrorThatCannotBeMadeLeavesNothingBehind) {
-  for (const auto& make : errors()) {
-    const std::string usual = messageText(make());
+  const std::string text(100, 't');  // too long to fit into a string itself
+  for (const ErrorMaker& make : errorMakers()) {
+    const std::string usual = messageText(make(text, text));
     std::uint64_t n = 0;
     for (bool made = false; !made;) {
       failNew(++n);
       try {
-        const TOLVEX::ambrix::MessageId error = make();
+        const TOLVEX::ambrix::MessageId error = make(text, text);
         failNew(0);
         made = true;
         EXPECT_EQ(messageText(error), usual);

@@ -1,4 +1,4 @@
-#include "tests/support/fake_cdflib_items.h"
+#include "tests/support/library_items.h"
 
 #include <algorithm>
 #include <iterator>
