@@ -60,6 +60,10 @@ function seconds = read_gzip (column)
   seconds = read_slab (column, "gzip.cdf", column.records, [10, 100], [1, 1]);
 endfunction
 
+function seconds = read_gzip_file (column)
+  seconds = read_slab (column, "gzip_file.cdf", column.records, [10, 100], [1, 1]);
+endfunction
+
 function seconds = read_text (column)
   seconds = read_slab (column, "text.cdf", column.texts, [], []);
 endfunction

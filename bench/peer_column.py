@@ -49,6 +49,9 @@ class SpacePy(Peer):
     def read_gzip(self):
         return self.read("gzip.cdf")
 
+    def read_gzip_file(self):
+        return self.read("gzip_file.cdf")
+
     def read_text(self):
         return self.read("text.cdf", "text")
 
@@ -106,6 +109,9 @@ class Pycdfpp(Peer):
     def read_gzip(self):
         return self.read("gzip.cdf")
 
+    def read_gzip_file(self):
+        return self.read("gzip_file.cdf")
+
     def read_text(self):
         return self.pycdfpp.load(self.file("text.cdf"))["text"].values_encoded
 
@@ -158,6 +164,9 @@ class Cdflib(Peer):
 
     def read_gzip(self):
         return self.read("gzip.cdf")
+
+    def read_gzip_file(self):
+        return self.read("gzip_file.cdf")
 
     def walk_metadata(self):
         file = self.cdflib.CDF(self.file("metadata.cdf"))

@@ -11,6 +11,7 @@ WORKLOADS = (
     Workload("read", "read 51 MB of doubles, row-major", None),
     Workload("read_column_major", "read the same, column-major", None),
     Workload("read_gzip", "read the same, gzip", None),
+    Workload("read_gzip_file", "read the same, the whole file gzip", None),
     Workload("write", "write 51 MB of doubles, row-major", None),
     Workload("write_column_major", "write the same, column-major", None),
     Workload("write_gzip", "write the same, gzip", None),

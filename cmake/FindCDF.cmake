@@ -9,7 +9,8 @@
 # AMBRIX_CDF=provision skips 1 to 3; AMBRIX_CDF=source does too, and builds 3.6.3.
 #
 # Targets: CDF::headers (the header only) and CDF::cdf (header and library).
-# Variables: CDF_VERSION, CDF_SAMPLES_DIR (the distribution's sample files; empty if not known).
+# Variables: CDF_VERSION, CDF_SAMPLES_DIR (the distribution's sample files; empty if not known),
+# CDF_IS_SHARED.
 
 include("${CMAKE_CURRENT_LIST_DIR}/CdfSearch.cmake")
 include("${CMAKE_CURRENT_LIST_DIR}/CdfProvision.cmake")
@@ -37,5 +38,11 @@ target_link_libraries(CDF::cdf INTERFACE CDF::headers ${cdf_link})
 set(CDF_SAMPLES_DIR "${cdf_samples}" CACHE PATH "Sample files of the CDF distribution" FORCE)
 set(CDF_VERSION "${cdf_version}" CACHE STRING "Version of the CDF library" FORCE)
 mark_as_advanced(CDF_SAMPLES_DIR CDF_VERSION)
+list(GET cdf_link 0 cdf_target)
+get_target_property(cdf_type ${cdf_target} TYPE)
+set(CDF_IS_SHARED FALSE)
+if(cdf_type STREQUAL "SHARED_LIBRARY")
+  set(CDF_IS_SHARED TRUE)
+endif()
 set(CDF_FOUND TRUE)
 message(STATUS "CDF ${CDF_VERSION}: ${cdf_place}")

@@ -1,6 +1,5 @@
 // The command-line tool.
 #include <algorithm>
-#include <cmath>
 #include <cstdio>
 #include <cstdlib>
 #include <optional>
@@ -9,12 +8,12 @@
 #include <string_view>
 
 #include "ambrix/embedded.h"
-#include "ambrix_version.h"
 #include "tool/content/failure.h"
 #include "tool/output/text.h"
 #include "tool/program/commands.h"
 #include "tool/program/exit_status.h"
 #include "tool/program/man_page.h"
+#include "tool/program/versions.h"
 
 namespace ambrix::tool {
 namespace {
@@ -25,17 +24,9 @@ void forgetLibrarySettings() {
     ::unsetenv(name);
 }
 
-void printVersions(StandardOutput& output) {
-  Module module;
-  std::string library;
-  for (const Array& part : module.call("getLibraryVersion"))
-    library += (library.empty() ? "" : ".") + std::to_string(std::lround(part.data<double>()[0]));
-  output.write("ambrix " + std::string(kAmbrixVersion) + "\nCDF library " + library + "\n");
-}
-
 int run(const CLI::App& parser, const Arguments& arguments, StandardOutput& output) {
   const bool answered = arguments.version || arguments.manual;
-  if (arguments.version) printVersions(output);
+  if (arguments.version) output.write(versions());
   if (arguments.manual) output.write(manualPage(parser));
   if (answered) return EXIT_SUCCESS;
   if (parser.get_subcommands().empty()) throw UsageError("which command?");

@@ -84,6 +84,9 @@ double readColumn(const Setup& setup) {
 double readGzip(const Setup& setup) {
   return readNumbers(setup, "gzip.cdf");
 }
+double readGzipFile(const Setup& setup) {
+  return readNumbers(setup, "gzip_file.cdf");
+}
 
 double writeRow(const Setup& setup) {
   return writeNumbers(setup, ROW_MAJOR, false);

@@ -20,6 +20,7 @@ std::vector<double> measurements(std::size_t count) {
 struct Storage {
   long majority = ROW_MAJOR;
   long gzipLevel = 0;
+  long fileGzipLevel = 0;
   long blockingFactor = 0;
   long checksum = NO_CHECKSUM;
 };
@@ -28,6 +29,10 @@ void writeNumbers(const Setup& setup, const char* name, const Storage& storage) 
   std::vector<double> data = measurements(setup.records() * kRecordValues);
   CDFid file = createFile(setup.file(name), storage.majority);
   check(CDFlib(SELECT_, CDF_, file, PUT_, CDF_CHECKSUM_, storage.checksum, NULL_));
+  long fileLevel = storage.fileGzipLevel;
+  if (fileLevel > 0) {
+    check(CDFlib(SELECT_, CDF_, file, PUT_, CDF_COMPRESSION_, GZIP_COMPRESSION, &fileLevel, NULL_));
+  }
   const long variable = createVariable(file, {"values", CDF_REAL8, 1, kRecordSizes});
   long level = storage.gzipLevel;
   if (level > 0) {
@@ -84,6 +89,7 @@ double prepareFiles(const Setup& setup) {
   writeNumbers(setup, "row", {});
   writeNumbers(setup, "column", {.majority = COLUMN_MAJOR});
   writeNumbers(setup, "gzip", {.gzipLevel = 6});
+  writeNumbers(setup, "gzip_file", {.fileGzipLevel = 6});
   writeNumbers(setup, "checksum", {.checksum = MD5_CHECKSUM});
   writeSeries(setup, "series", {});
   writeSeries(setup, "series_gzip", {.gzipLevel = 6});

@@ -7,6 +7,7 @@ int main(int argumentCount, char** arguments) {
       {"read", readRow},
       {"read_column_major", readColumn},
       {"read_gzip", readGzip},
+      {"read_gzip_file", readGzipFile},
       {"read_checksum", readWithChecksum},
       {"write", writeRow},
       {"write_column_major", writeColumn},

@@ -48,6 +48,7 @@ Array readSlab(const Array& file, const Slab& slab);
 double readRow(const Setup& setup);
 double readColumn(const Setup& setup);
 double readGzip(const Setup& setup);
+double readGzipFile(const Setup& setup);
 double readWithChecksum(const Setup& setup);
 double readText(const Setup& setup);
 double readStrided(const Setup& setup);

@@ -30,6 +30,9 @@ double readColumn(const Setup& setup) {
 double readGzip(const Setup& setup) {
   return readNumbers(setup, "gzip.cdf");
 }
+double readGzipFile(const Setup& setup) {
+  return readNumbers(setup, "gzip_file.cdf");
+}
 double readWithChecksum(const Setup& setup) {
   return readNumbers(setup, "checksum.cdf");
 }

@@ -2,12 +2,14 @@
 
 usage: module_binary_test.py MODULE
 """
+import pathlib
 import re
 import subprocess
 import sys
 import unittest
 
 MODULE = sys.argv.pop()
+INFLATER = pathlib.Path(MODULE).with_name("libambrix_inflate.so")
 
 
 def output(*command):
@@ -28,6 +30,21 @@ class ModuleBinaryTest(unittest.TestCase):
         needed = re.findall(r"\(NEEDED\).*\[(.*)\]", output("readelf", "-d", "-W", MODULE))
         self.assertIn("libc.so.6", needed)
         self.assertEqual([name for name in needed if "/" in name], [])
+
+    def test_needs_the_inflater_before_the_library_that_it_stands_before(self):
+        if not INFLATER.exists():
+            self.skipTest("the inflater is not built here")
+        needed = re.findall(r"\(NEEDED\).*\[(.*)\]", output("readelf", "-d", "-W", MODULE))
+        self.assertLess(needed.index(INFLATER.name), needed.index("libcdf.so"))
+        symbols = output("nm", "-D", "--defined-only", "--format=posix", INFLATER)
+        names = sorted(line.split()[0] for line in symbols.splitlines())
+        self.assertEqual(names,
+                         ["ambrixInflater", "z_inflate", "z_inflateEnd", "z_inflateInit2_"])
+
+    def test_the_inflater_can_do_without_isa_l(self):
+        if not INFLATER.exists():
+            self.skipTest("the inflater is not built here")
+        self.assertNotIn("libisal", output("readelf", "-d", "-W", INFLATER))
 
     def test_looks_beside_itself_first_and_never_in_the_current_folder(self):
         paths = re.findall(r"\((?:RUNPATH|RPATH)\).*\[(.*)\]", output("readelf", "-d", "-W", MODULE))

@@ -72,6 +72,8 @@ class PackageTest(TreeChecks, unittest.TestCase):
         self.assertRegex(field("Depends"), r"\blibc6 \(>= ")
         self.assertRegex(field("Depends"), r"\blibstdc\+\+6 \(>= ")
         self.assertNotIn("-dev", field("Depends"))
+        faster = (tree / "lib/ambrix/libambrix_inflate.so").exists()
+        self.assertEqual(field("Recommends"), "libisal2" if faster else "")
         self.assertEqual(field("Package"), "ambrix")
         self.assertEqual(field("Maintainer"), "Ada Packer <ada@debian.org>")
         bundled = (tree / "share/doc/ambrix/CDF_copyright.txt").exists()

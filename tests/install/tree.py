@@ -58,7 +58,9 @@ class TreeChecks:
         readme = "README.md"
         self.assertEqual((tree / "share/doc/ambrix" / readme).exists(), (SOURCE / readme).exists())
         bundled = (BUILD / "lib/ambrix/libcdf.so").exists()
-        self.assertEqual((tree / "lib/ambrix/libcdf.so").exists(), bundled)
+        for library in ("libcdf.so", "libambrix_inflate.so"):
+            self.assertEqual((tree / "lib/ambrix" / library).exists(),
+                             (BUILD / "lib/ambrix" / library).exists())
         if bundled:
             self.assertTrue((tree / "share/doc/ambrix/CDF_copyright.txt").is_file())
 
@@ -71,7 +73,9 @@ class TreeChecks:
 
     def check_tool(self, tree):
         tool = tree / "bin/ambrix"
-        self.assertIn(f"ambrix {VERSION}\n", run(tool, "--version", env={}))
+        versions = run(tool, "--version", env={})
+        self.assertIn(f"ambrix {VERSION}\n", versions)
+        self.assertEqual(versions, run(BUILD / "bin/ambrix", "--version", env={}))
         told = run(tool, "info", SAMPLES / "example2.cdf", env={})
         self.assertRegex(told, r"\bTemperature +cdf_real4 +1 +2x2 +24\b")
 

@@ -64,6 +64,7 @@ class PackageTest(unittest.TestCase):
             members = {member.name.partition("/")[2]: member for member in tar}
         for name in ("DESCRIPTION", "COPYING", "NEWS", "INDEX", "src/configure", "src/Makefile",
                      "src/gateway/entry/entry_point.cc", "src/adapters/octave/__ambrix__.cc",
+                     "src/inflate/exports.cc",
                      "inst/ambrix_read.m", "inst/ambrix_hyperGetVarData.m"):
             self.assertIn(name, members)
         kinds = {pathlib.Path(name).suffix for name, member in members.items() if member.isfile()}
@@ -134,6 +135,11 @@ class PackageTest(unittest.TestCase):
         if library:
             self.assertEqual(pathlib.Path(library[1]).resolve().parents[2],
                              octfile.resolve().parents[2])
+        inflater = octfile.with_name("libambrix_inflate.so")
+        if inflater in files:
+            self.assertRegex(loaded.stdout, rf"libambrix_inflate.so => {octfile.parent}\S*/")
+        elif library and pathlib.Path("/usr/include/isa-l/igzip_lib.h").exists():
+            self.fail("the inflater was not built")
         provided = ROOT / "build/cdf/cdf-3.9.1/CDF_copyright.txt"
         if library and provided.exists():
             self.assertIn("CDF_copyright.txt", [path.name for path in files])
