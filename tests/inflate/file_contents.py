@@ -8,9 +8,11 @@ MOST_VALUES = 1 << 17  # of one read
 
 
 class Reader:
-    """A session that is started anew when a file has brought it down."""
+    """A session that is started anew when a file has brought it down. It works in a folder, where
+    the CDF library leaves scratch files when it cannot decompress a file."""
 
-    def __init__(self, inflater):
+    def __init__(self, inflater, folder):
+        self.folder = folder
         self.environment = dict(os.environ, AMBRIX_INFLATER=inflater)
         self.session = None
 
@@ -21,7 +23,7 @@ class Reader:
 
     def contents(self, path):
         """What each request was answered, or how the session has ended."""
-        self.session = self.session or Session(env=self.environment)
+        self.session = self.session or Session(env=self.environment, cwd=self.folder)
         told = []
         try:
             self._read(path, told)

@@ -33,7 +33,7 @@ class SameContentsTest(unittest.TestCase):
         folder = tempfile.TemporaryDirectory(prefix="ambrix-inflate-")
         self.addCleanup(folder.cleanup)
         self.folder = pathlib.Path(folder.name)
-        self.readers = [Reader(""), Reader("cdf")]
+        self.readers = [Reader("", self.folder), Reader("cdf", self.folder)]
         for reader in self.readers:
             self.addCleanup(reader.close)
 
