@@ -8,6 +8,7 @@
 #include <utility>
 
 #include "adapters/common/class_names.h"
+#include "adapters/common/host_errors.h"
 #include "adapters/common/narrow_text.h"
 #include "adapters/common/shape.h"
 #include "adapters/octave/class_of.h"
@@ -194,6 +195,7 @@ void qvArray::create(const dim_vector& dims, Content content) {
           elements_.emplace<Characters>(std::make_unique_for_overwrite<char16_t[]>(count)).get();
       return;
     case qvCELL_CLASS:
+      if (count > Cells().max_size()) ambrix::raiseOutOfMemory();  // which a vector tells otherwise
       elements_.emplace<Cells>(count);
       return;
     case qvUNKNOWN_CLASS:

@@ -77,18 +77,6 @@ function testNewArraysAreZeroAndShapedAsOctaveDoes ()
   endfor
 endfunction
 
-function testArraysThatCannotBeAreRefused ()
-  refused = @(varargin) raised (@() __ambrix__ ("zeros", varargin{:})).identifier;
-  assert (refused (-1, 6, 0), "TOLVEX:host:badDimension");
-  assert (refused ([0, -1], 8, 0), "TOLVEX:host:badDimension");
-  assert (refused ([2 ^ 32, 2 ^ 32], 8, 0), "TOLVEX:host:outOfMemory");
-  assert (refused (2 ^ 61, 6, 0), "TOLVEX:host:outOfMemory");
-  for classId = [0, 1, 2, 3, 4, 5]
-    assert (refused (1, classId, 0), "TOLVEX:host:unexpectedFailure");
-  endfor
-  assert (refused (1, 6, 1), "TOLVEX:host:unexpectedFailure");
-endfunction
-
 function testAsManyResultsAsThereAreSlots ()
   all = cell (1, 8);
   [all{:}] = __ambrix__ ("many");
@@ -142,10 +130,9 @@ endfunction
 tests = {@testEveryClassHasItsNumberAndName, @testSizesAreOctaves, ...
          @testClassesWithoutPlainElementsHaveNoData, @testCharactersAreBytesWidened, ...
          @testFileNamesAreBytesOfUtf8, @testCellsAreReached, @testCellsAreMade, ...
-         @testNewArraysAreZeroAndShapedAsOctaveDoes, @testArraysThatCannotBeAreRefused, ...
-         @testAsManyResultsAsThereAreSlots, @testWarningsGoOnAndCanBeTurnedOff, ...
-         @testErrorsTellTheValuesOfTheirMessage, @testForeignExceptionsBecomeErrors, ...
-         @testMemoryThatTheModuleLeavesIsReclaimed};
+         @testNewArraysAreZeroAndShapedAsOctaveDoes, @testAsManyResultsAsThereAreSlots, ...
+         @testWarningsGoOnAndCanBeTurnedOff, @testErrorsTellTheValuesOfTheirMessage, ...
+         @testForeignExceptionsBecomeErrors, @testMemoryThatTheModuleLeavesIsReclaimed};
 for k = 1:numel (tests)
   printf ("%s\n", func2str (tests{k}));
   tests{k} ();

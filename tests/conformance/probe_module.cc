@@ -1,5 +1,6 @@
-// A module that shows its host from the inside: what arguments look like there, and what becomes of
-// results, messages and exceptions that the real module has no use for.
+// A module that shows its host from the inside. Every host runs its checks, its refusals and its
+// samples (see probe.h); the other commands are for what differs from host to host: what arguments
+// look like, and what becomes of results, messages and exceptions.
 #include <algorithm>
 #include <cstdint>
 #include <new>
@@ -9,20 +10,13 @@
 #include <vector>
 
 #include "host/qvh.h"
+#include "tests/conformance/probe.h"
 
 namespace {
 
+using probe::Call;
+using probe::doubles;
 using TOLVEX::ambrix::MessageId;
-
-struct Call {
-  int outputCount;
-  qvArray** outputs;
-  std::span<const qvArray*> arguments;
-};
-
-std::span<const double> doubles(const qvArray* array) {
-  return {static_cast<const double*>(qvGetReadOnlyData(array)), qvGetNumberOfElements(array)};
-}
 
 std::vector<std::size_t> sizesOf(const qvArray* array) {
   std::vector<std::size_t> sizes;
@@ -163,10 +157,26 @@ struct Command {
 };
 
 constexpr Command kCommands[] = {
-    {"inspect", inspect}, {"units", units},      {"cells", cells},   {"zeros", zeros},
-    {"falses", falses},   {"text", text},        {"narrow", narrow}, {"nested", nested},
-    {"outside", outside}, {"many", manyResults}, {"warns", warns},   {"raises", raises},
-    {"throws", throws},   {"litters", litters},
+    {"inspect", inspect},
+    {"units", units},
+    {"cells", cells},
+    {"zeros", zeros},
+    {"falses", falses},
+    {"text", text},
+    {"narrow", narrow},
+    {"nested", nested},
+    {"outside", outside},
+    {"many", manyResults},
+    {"warns", warns},
+    {"raises", raises},
+    {"throws", throws},
+    {"litters", litters},
+    {"conformance", probe::runChecks},
+    {"refusals", probe::nameRefusals},
+    {"refuse", probe::refuse},
+    {"samples", probe::nameSamples},
+    {"sample", probe::makeSample},
+    {"recognise", probe::recogniseSample},
 };
 
 }  // namespace
