@@ -1,7 +1,7 @@
 #include "tool/call/call.h"
 
-#include "tool/content/cdf_file.h"
 #include "tool/content/failure.h"
+#include "tool/content/open_file.h"
 #include "tool/json/value.h"
 
 namespace ambrix::tool {
@@ -29,11 +29,10 @@ std::vector<Array> readWords(std::span<const std::string> words) {
   return arrays;
 }
 
-std::vector<Array> callOnFile(CdfFile file, const std::string& command,
+std::vector<Array> callOnFile(File file, const std::string& command,
                               const std::vector<Array>& arguments) {
   const std::vector<ArrayView> views(arguments.begin(), arguments.end());
   std::vector<Array> results = file.call(command, views);
-  if (command == "close" || command == "delete") file.forget();
   file.close();
   return results;
 }
@@ -45,8 +44,9 @@ void runCall(Module& module, const CallOptions& options, StandardOutput& output)
   const std::string& command = options.words.front();
   const std::vector<Array> arguments = readWords(std::span(options.words).subspan(1));
   const std::vector<Array> results =
-      options.file.empty() ? module.call(Array::fromUtf8(command), arguments)
-                           : callOnFile(CdfFile::open(module, options.file), command, arguments);
+      options.file.empty()
+          ? module.call(Array::fromUtf8(command), arguments)
+          : callOnFile(openFile(module, options.file, Access::kWrite), command, arguments);
   for (const Array& result : results) {
     std::string line;
     appendValue(line, result);

@@ -6,8 +6,8 @@
 #include <string_view>
 #include <variant>
 
+#include "ambrix/file.h"
 #include "tool/check/check.h"
-#include "tool/content/variable.h"
 #include "tool/supervision/scarcity.h"
 
 namespace ambrix::tool {

@@ -51,6 +51,9 @@ int examine(const std::string& path) try {
 } catch (const ToolError& error) {
   reportUnread({"", error.identifier(), error.what()});
   return EXIT_SUCCESS;
+} catch (const FileError& error) {
+  reportUnread({"", error.identifier(), error.reason()});
+  return EXIT_SUCCESS;
 } catch (const LoadError& error) {
   reportUnread({"", "ambrix:moduleNotLoaded", error.what()});
   return EXIT_SUCCESS;

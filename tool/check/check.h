@@ -7,7 +7,7 @@
 #include <vector>
 
 #include "ambrix/error.h"
-#include "tool/content/cdf_file.h"
+#include "ambrix/file.h"
 #include "tool/content/failure.h"
 #include "tool/output/standard_output.h"
 #include "tool/supervision/supervision.h"

@@ -6,10 +6,8 @@
 #include <system_error>
 
 #include "tool/check/check.h"
-#include "tool/content/attributes.h"
-#include "tool/content/facts.h"
 #include "tool/content/failure.h"
-#include "tool/content/slabs.h"
+#include "tool/content/open_file.h"
 #include "tool/format/open_failure.h"
 #include "tool/format/record_index.h"
 #include "tool/output/text.h"
@@ -38,16 +36,16 @@ class Examination {
   Examination(Module& module, const std::string& path) : module_(module), path_(path) { open(); }
 
   void run() {
-    attempt("", [&] { facts_ = readFileFacts(*file_); });
-    double variables = 0;
-    double attributes = 0;
+    attempt("", [&] { facts_ = file_->facts(); });
+    std::size_t variables = 0;
+    std::size_t attributes = 0;
     attempt("", [&] {
-      variables = countVariables(*file_);
-      attributes = countAttributes(*file_);
+      variables = file_->variableCount();
+      attributes = file_->attributeCount();
     });
-    for (double number = 0; number < variables; ++number)
+    for (std::size_t number = 0; number < variables; ++number)
       readVariable(number);
-    for (double number = 0; number < attributes; ++number)
+    for (std::size_t number = 0; number < attributes; ++number)
       readAttribute(number);
     attempt("", [&] { file_->close(); });
   }
@@ -56,14 +54,14 @@ class Examination {
   void open();
   void recover();
   void attempt(const std::string& place, const std::function<void()>& read);
-  void readVariable(double number);
-  void readValues(const VariableFacts& facts);
-  void readAttribute(double number);
-  void requireRoomFor(const VariableFacts& facts) const;
+  void readVariable(std::size_t number);
+  void readValues(const VariableDescription& facts);
+  void readAttribute(std::size_t number);
+  void requireRoomFor(const VariableDescription& facts) const;
 
   Module& module_;
   std::string path_;
-  std::optional<CdfFile> file_;
+  std::optional<File> file_;
   FileFacts facts_;
 };
 
@@ -76,11 +74,12 @@ void Examination::attempt(const std::string& place, const std::function<void()>&
   reportProblem({place, error.identifier(), error.what()});
 } catch (const ToolError& error) {
   reportUnread({place, error.identifier(), error.what()});
+} catch (const FileError& error) {
+  reportUnread({place, error.identifier(), error.reason()});
 }
 
 void Examination::open() {
-  file_.emplace(CdfFile::open(module_, path_));
-  setReadOnly(*file_);
+  file_.emplace(openFile(module_, path_));
 }
 
 /// After some failures the library refuses everything until the file is opened anew.
@@ -91,32 +90,33 @@ void Examination::recover() try {
   open();
 }
 
-void Examination::readVariable(double number) {
-  std::string place = "variable " + std::to_string(static_cast<long>(number));
+void Examination::readVariable(std::size_t number) {
+  std::string place = "variable " + std::to_string(number);
   attempt(place, [&] {
-    place = quoted("variable", file_->text("getVarName", {number}));
-    const VariableFacts facts = readVariableFacts(module_, *file_, number);
+    place = quoted("variable", file_->text("getVarName", {static_cast<double>(number)}));
+    const VariableDescription facts = file_->describeVariable(number);
     if (facts.definition.supported) return readValues(facts);
-    reportUnsupported(place + " (" + facts.definition.datatype + ")");
+    reportUnsupported(place + " (" + datatypeName(facts.definition.datatype) + ")");
   });
 }
 
-void Examination::readValues(const VariableFacts& facts) {
-  requireIndexed(*file_, facts.definition, facts.records);
+void Examination::readValues(const VariableDescription& facts) {
+  requireIndexed(*file_, facts.definition, static_cast<double>(facts.records));
   requireRoomFor(facts);
-  const auto records = static_cast<std::size_t>(std::max(facts.records, 0.0));
+  const auto records = static_cast<std::size_t>(std::max<std::int64_t>(facts.records, 0));
   SlabPlan plan(facts.definition, 0, records);
   while (const auto slab = plan.next())
-    readSlab(*file_, facts.definition, *slab);
+    file_->read(facts.definition, *slab);
 }
 
 /// A file whose counts are damaged may claim to hold more than there is in the world; reading all
 /// of it would take just as long.
-void Examination::requireRoomFor(const VariableFacts& facts) const {
+void Examination::requireRoomFor(const VariableDescription& facts) const {
   std::error_code error;
-  const auto bytes = static_cast<double>(fs::file_size(fileOf(path_), error));
+  const auto bytes = static_cast<double>(fs::file_size(fileOnDisk(path_), error));
   if (error || facts_.format != "SINGLE_FILE") return;
-  double claimed = facts.written * static_cast<double>(facts.definition.elements);
+  double claimed =
+      static_cast<double>(facts.written) * static_cast<double>(facts.definition.elements);
   for (std::size_t i = 0; i < facts.definition.sizes.size(); ++i)
     claimed *= facts.definition.varies.at(i) ? static_cast<double>(facts.definition.sizes[i]) : 1;
   // Compressed values may be compressed once more, with the file.
@@ -124,14 +124,14 @@ void Examination::requireRoomFor(const VariableFacts& facts) const {
   throw DamagedCounts("the file is too small for the records that it lists");
 }
 
-void Examination::readAttribute(double number) {
-  std::string place = "attribute " + std::to_string(static_cast<long>(number));
+void Examination::readAttribute(std::size_t number) {
+  std::string place = "attribute " + std::to_string(number);
   attempt(place, [&] {
-    place = quoted("attribute", inquireAttribute(*file_, number).name);
-    for (const EntryFacts& entry : readAttributeFacts(module_, *file_, number).entries) {
+    place = quoted("attribute", file_->attribute(number).name);
+    for (const auto& [entry, value] : file_->describeAttribute(number).entries) {
       if (entry.supported) continue;
-      reportUnsupported("entry " + std::to_string(static_cast<long>(entry.number)) + " of " +
-                        place + " (" + entry.datatype + ")");
+      reportUnsupported("entry " + std::to_string(entry.number) + " of " + place + " (" +
+                        datatypeName(entry.datatype) + ")");
     }
   });
 }

@@ -32,9 +32,9 @@ class OpenError : public ToolError {
 };
 
 /// Any error, told of the file whose name is put before its text.
-class FileError : public ToolError {
+class NamedError : public ToolError {
  public:
-  FileError(const std::string& file, std::string identifier, const std::string& message)
+  NamedError(const std::string& file, std::string identifier, const std::string& message)
       : ToolError(Whole(), std::move(identifier), file + ": " + message) {}
 };
 

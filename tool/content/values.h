@@ -3,9 +3,9 @@
 
 #include <cstddef>
 #include <string>
-#include <string_view>
 #include <vector>
 
+#include "ambrix/datatype.h"
 #include "ambrix/module.h"
 
 namespace ambrix::tool {
@@ -16,14 +16,9 @@ struct ValueText {
   bool isText = false;
 };
 
-/// Whether the values of a datatype, named as the module names it, are texts.
-bool isCharacterType(std::string_view datatype);
-/// The host elements that make one value: `elements` characters, two doubles of an epoch16, or one.
-std::size_t hostElements(std::string_view datatype, std::size_t elements);
-
 /// The values in an array that the module has read. Times become ISO 8601; numbers are written
 /// with as many digits as tell them apart. `elements` is the number of characters in a text.
-std::vector<ValueText> formatValues(Module& module, ArrayView array, std::string_view datatype,
+std::vector<ValueText> formatValues(Module& module, ArrayView array, Datatype datatype,
                                     std::size_t elements);
 
 /// Values on one line.

@@ -1,27 +1,23 @@
 // Attributes and their entries.
-#include "tool/content/attributes.h"
-
 #include <algorithm>
-#include <cstdint>
 #include <utility>
 
-#include "tool/content/values.h"
 #include "tool/convert/convert.h"
 
 namespace ambrix::tool {
 namespace {
 
 /// Numbers of variables move down by the number of those before them that are left out.
-double targetEntry(const Conversion& conversion, const Attribute& attribute, double entry) {
+std::size_t targetEntry(const Conversion& conversion, const Attribute& attribute,
+                        std::size_t entry) {
   if (attribute.global) return entry;
   for (const Copied& variable : conversion.variables)
     if (variable.source.number == entry) return variable.target.number;
-  const double all = countVariables(conversion.input);
-  return entry - (all - static_cast<double>(conversion.variables.size()));
+  return entry - (conversion.input.variableCount() - conversion.variables.size());
 }
 
-bool isLeftOut(const Conversion& conversion, const Attribute& attribute, double entry) {
-  if (attribute.global || entry >= countVariables(conversion.input)) return false;
+bool isLeftOut(const Conversion& conversion, const Attribute& attribute, std::size_t entry) {
+  if (attribute.global || entry >= conversion.input.variableCount()) return false;
   return std::ranges::none_of(conversion.variables, [&](const Copied& variable) {
     return variable.source.number == entry;
   });
@@ -36,41 +32,32 @@ Array completeText(Array value, std::size_t elements) {
 }
 
 /// Whether anything but zeros was behind the end of a text that came back short.
-bool hasLostText(const Conversion& conversion, double attribute, double entry) {
+bool hasLostText(const Conversion& conversion, std::size_t attribute, std::size_t entry) {
   if (!conversion.hiddenTexts) return true;  // it may have
-  return conversion.hiddenTexts->contains(
-      {static_cast<std::uint64_t>(attribute), static_cast<std::uint64_t>(entry)});
+  return conversion.hiddenTexts->contains({attribute, entry});
 }
 
-void copyEntry(Conversion& conversion, const Attribute& attribute, const EntryHeader& entry) {
-  const auto elements = static_cast<std::size_t>(entry.elements);
-  Array given = readEntry(conversion.input, attribute, entry.number);
+void copyEntry(Conversion& conversion, const Attribute& attribute, const Attribute& target,
+               const Entry& entry) {
+  Array given = conversion.input.value(attribute, entry.number);
   const std::size_t length = given.elementCount();
-  const Array value = completeText(std::move(given), elements);
+  const Array value = completeText(std::move(given), entry.elements);
   const bool isShort = value.elementCount() > length;
   if (isShort && hasLostText(conversion, attribute.number, entry.number)) ++conversion.cutTexts;
-  const Array number = Array::scalar(attribute.number);
-  const Array target = Array::scalar(targetEntry(conversion, attribute, entry.number));
-  const Array datatype = Array::scalar(datatypeCode(conversion.module, entry.datatype));
-  const ArrayView arguments[] = {number, target, datatype, value};
-  conversion.output.call("putAttrEntry", arguments);
+  const std::size_t number = targetEntry(conversion, attribute, entry.number);
+  conversion.output.putEntry(target, number, entry.datatype, value);
 }
 
 }  // namespace
 
 void copyAttributes(Conversion& conversion) {
-  const double scopes[] = {constantValue(conversion.module, "VARIABLE_SCOPE"),
-                           constantValue(conversion.module, "GLOBAL_SCOPE")};
-  const double count = countAttributes(conversion.input);
-  for (double number = 0; number < count; ++number) {
-    const Attribute attribute = inquireAttribute(conversion.input, number);
-    const Array name = Array::fromNarrow(attribute.name);
-    const Array scope = Array::scalar(scopes[attribute.global ? 1 : 0]);
-    const ArrayView arguments[] = {name, scope};
-    conversion.output.call("createAttr", arguments);
-    forEachEntry(conversion.input, attribute, [&](const EntryHeader& entry) {
+  const std::size_t count = conversion.input.attributeCount();
+  for (std::size_t number = 0; number < count; ++number) {
+    const Attribute attribute = conversion.input.attribute(number);
+    const Attribute target = conversion.output.createAttribute(attribute.name, attribute.global);
+    conversion.input.forEachEntry(attribute, [&](const Entry& entry) {
       if (!entry.supported || isLeftOut(conversion, attribute, entry.number)) return;
-      copyEntry(conversion, attribute, entry);
+      copyEntry(conversion, attribute, target, entry);
     });
   }
 }

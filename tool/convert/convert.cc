@@ -7,8 +7,8 @@
 #include <filesystem>
 #include <system_error>
 
-#include "tool/content/attributes.h"
 #include "tool/content/failure.h"
+#include "tool/content/open_file.h"
 #include "tool/format/file_header.h"
 #include "tool/format/open_failure.h"
 #include "tool/output/output_file.h"
@@ -20,17 +20,17 @@ namespace {
 
 namespace fs = std::filesystem;
 
-std::vector<std::string> unsupportedEntries(CdfFile& input, const Attribute& attribute) {
+std::vector<std::string> unsupportedEntries(File& input, const Attribute& attribute) {
   std::vector<std::string> lines;
-  forEachEntry(input, attribute, [&](const EntryHeader& entry) {
+  input.forEachEntry(attribute, [&](const Entry& entry) {
     if (entry.supported) return;
-    lines.push_back("entry " + std::to_string(static_cast<long>(entry.number)) +
-                    " of attribute \"" + printable(attribute.name) + "\" (" + entry.datatype + ")");
+    lines.push_back("entry " + std::to_string(entry.number) + " of attribute \"" +
+                    printable(attribute.name) + "\" (" + datatypeName(entry.datatype) + ")");
   });
   return lines;
 }
 
-void reportUnsupported(CdfFile& input, bool skip) {
+void reportUnsupported(File& input, bool skip) {
   const std::vector<std::string> lines = listUnsupported(input);
   for (const std::string& line : lines)
     std::fprintf(stderr, "ambrix: %s: %s\n", skip ? "skipped" : "not supported", line.c_str());
@@ -84,7 +84,7 @@ std::string describeGrowth(const Conversion& conversion, const fs::path& input,
 
 /// Tells on one line what of the input was not carried over as it is.
 void reportChanges(const Conversion& conversion, const fs::path& output) {
-  const fs::path input = fileOf(conversion.options.input);
+  const fs::path input = fileOnDisk(conversion.options.input);
   std::vector<std::string> changes = {describeVariables(input), describeTexts(conversion),
                                       describeGrowth(conversion, input, output)};
   std::erase(changes, "");
@@ -93,10 +93,11 @@ void reportChanges(const Conversion& conversion, const fs::path& output) {
                fmt::format("{}", fmt::join(changes, "; ")).c_str());
 }
 
-void writeCopy(Module& module, const ConvertOptions& options, CdfFile& input,
+void writeCopy(Module& module, const ConvertOptions& options, File& input,
                const std::string& name) {
-  CdfFile output = CdfFile::create(module, name, options.output);
-  Conversion conversion{module, options, input, output, findHiddenTexts(fileOf(options.input))};
+  CreatedFileObserver observer(options.output);
+  File output = File::create(module, name, {.observer = &observer});
+  Conversion conversion{module, options, input, output, findHiddenTexts(fileOnDisk(options.input))};
   copySettings(conversion);
   createVariables(conversion);
   copyAttributes(conversion);
@@ -117,25 +118,23 @@ fs::path chooseOutput(const std::string& wanted) {
   return path;
 }
 
-std::vector<std::string> listUnsupported(CdfFile& input) {
+std::vector<std::string> listUnsupported(File& input) {
   std::vector<std::string> lines;
-  const double variables = countVariables(input);
-  for (double number = 0; number < variables; ++number) {
-    const Variable variable = inquireVariable(input, number);
+  for (const Variable& variable : input.variables()) {
     if (variable.supported) continue;
-    lines.push_back("variable \"" + printable(variable.name) + "\" (" + variable.datatype + ")");
+    lines.push_back("variable \"" + printable(variable.name) + "\" (" +
+                    datatypeName(variable.datatype) + ")");
   }
-  const double attributes = countAttributes(input);
-  for (double number = 0; number < attributes; ++number) {
-    const auto more = unsupportedEntries(input, inquireAttribute(input, number));
+  const std::size_t attributes = input.attributeCount();
+  for (std::size_t number = 0; number < attributes; ++number) {
+    const auto more = unsupportedEntries(input, input.attribute(number));
     lines.insert(lines.end(), more.begin(), more.end());
   }
   return lines;
 }
 
 void runConvert(Module& module, const ConvertOptions& options, const std::string& output) {
-  CdfFile input = CdfFile::open(module, options.input);
-  setReadOnly(input);
+  File input = openFile(module, options.input);
   reportUnsupported(input, options.skipUnsupported);
   writeCopy(module, options, input, output);
 }

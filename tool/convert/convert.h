@@ -8,8 +8,7 @@
 #include <string>
 #include <vector>
 
-#include "tool/content/cdf_file.h"
-#include "tool/content/variable.h"
+#include "ambrix/file.h"
 #include "tool/format/hidden_texts.h"
 
 namespace ambrix::tool {
@@ -39,8 +38,8 @@ struct Copied {
 struct Conversion {
   Module& module;
   const ConvertOptions& options;
-  CdfFile& input;
-  CdfFile& output;
+  File& input;
+  File& output;
   std::optional<std::set<EntryNumbers>> hiddenTexts;  // of the input, if they can be known
   bool transposes = false;                            // the files differ in majority
   std::vector<Copied> variables = {};                 // those that are copied
@@ -48,7 +47,7 @@ struct Conversion {
 };
 
 /// What the module cannot carry over, one line each.
-std::vector<std::string> listUnsupported(CdfFile& input);
+std::vector<std::string> listUnsupported(File& input);
 
 /// Throws `UsageError` when the settings asked for are none that there are.
 void checkOptions(const ConvertOptions& options);
@@ -57,8 +56,5 @@ void copySettings(Conversion& conversion);
 void createVariables(Conversion& conversion);
 void copyAttributes(Conversion& conversion);
 void copyData(Conversion& conversion);
-
-/// The number of a datatype that is named as the module names it.
-double datatypeCode(Module& module, std::string name);
 
 }  // namespace ambrix::tool

@@ -3,8 +3,6 @@
 #include <cstring>
 #include <utility>
 
-#include "tool/content/slabs.h"
-#include "tool/content/values.h"
 #include "tool/convert/convert.h"
 #include "tool/format/record_index.h"
 #include "tool/output/progress.h"
@@ -56,10 +54,10 @@ Slab reversed(Slab slab) {
 /// read as they are anyway.
 class SparseFilter {
  public:
-  SparseFilter(CdfFile& input, const Variable& variable, std::size_t records)
-      : mode_(input.text("getVarSparseRecords", {variable.number})), last_(records - 1) {
+  SparseFilter(File& input, const Variable& variable, std::size_t records)
+      : mode_(input.sparseRecords(variable)), last_(records - 1) {
     if (!active()) return;
-    const Array pad = std::move(input.call("getVarPadValue", {variable.number}).at(0));
+    const Array pad = input.padValue(variable);
     const auto value = pad.bytes();
     const std::size_t values = variable.recordElements() / pad.elementCount();
     for (std::size_t i = 0; i < values; ++i)
@@ -82,7 +80,7 @@ class SparseFilter {
 };
 
 /// Writes the records of a slab that have to be stored, as few blocks.
-void writeStored(CdfFile& output, const Variable& variable, const Slab& slab, const Array& data,
+void writeStored(File& output, const Variable& variable, const Slab& slab, const Array& data,
                  SparseFilter& filter) {
   const std::size_t recordBytes = data.bytes().size() / slab.records;
   const std::size_t elements = data.elementCount() / slab.records;
@@ -92,8 +90,8 @@ void writeStored(CdfFile& output, const Variable& variable, const Slab& slab, co
     block.firstRecord += first;
     block.records = end - first;
     const auto bytes = data.bytes().subspan(first * recordBytes, block.records * recordBytes);
-    writeSlab(output, variable, block,
-              Array::fromBytes(data.classId(), {elements, block.records}, bytes));
+    output.write(variable, block,
+                 Array::fromBytes(data.classId(), {elements, block.records}, bytes));
   };
   std::size_t first = 0;
   for (std::size_t i = 0; i < slab.records; ++i) {
@@ -104,14 +102,18 @@ void writeStored(CdfFile& output, const Variable& variable, const Slab& slab, co
   write(first, slab.records);
 }
 
+std::size_t countRecords(const Conversion& conversion, const Copied& variable) {
+  return static_cast<std::size_t>(conversion.input.recordCount(variable.source));
+}
+
 void copyVariable(Conversion& conversion, const Copied& variable, Progress& progress) {
-  const std::size_t records = countRecords(conversion.input, variable.source);
+  const std::size_t records = countRecords(conversion, variable);
   requireIndexed(conversion.input, variable.source, static_cast<double>(records));
   SparseFilter filter(conversion.input, variable.source, records);
   SlabPlan plan(variable.source, 0, records);
   const bool transposes = conversion.transposes && variable.source.sizes.size() > 1;
   while (const auto slab = plan.next()) {
-    Array data = readSlab(conversion.input, variable.source, *slab);
+    Array data = conversion.input.read(variable.source, *slab);
     progress.advance(data.elementCount());
     const bool whole = slab->count == variable.source.sizes;
     const std::size_t count = data.elementCount();
@@ -120,7 +122,7 @@ void copyVariable(Conversion& conversion, const Copied& variable, Progress& prog
     if (filter.active() && whole && count > 0) {
       writeStored(conversion.output, variable.target, target, data, filter);
     } else {
-      writeSlab(conversion.output, variable.target, target, data);
+      conversion.output.write(variable.target, target, data);
     }
   }
 }
@@ -130,7 +132,7 @@ void copyVariable(Conversion& conversion, const Copied& variable, Progress& prog
 void copyData(Conversion& conversion) {
   std::size_t total = 0;
   for (const Copied& variable : conversion.variables)
-    total += countRecords(conversion.input, variable.source) * variable.source.recordElements();
+    total += countRecords(conversion, variable) * variable.source.recordElements();
   Progress progress("Converting", total, errorIsTerminal());
   for (const Copied& variable : conversion.variables)
     copyVariable(conversion, variable, progress);

@@ -7,8 +7,8 @@
 #include <limits>
 #include <optional>
 
-#include "tool/content/attributes.h"
 #include "tool/content/failure.h"
+#include "tool/content/open_file.h"
 #include "tool/format/record_index.h"
 #include "tool/output/progress.h"
 #include "tool/output/text.h"
@@ -23,18 +23,10 @@ std::optional<std::size_t> parseCount(std::string_view text) {
   return number;
 }
 
-double findVariable(CdfFile& file, const std::string& name) {
-  try {
-    const Array text = Array::fromNarrow(name);
-    const ArrayView arguments[] = {text};
-    return file.call("getVarNum", arguments).at(0).data<double>().front();
-  } catch (const Error& error) {
-    if (!isLibraryFailure(error)) throw;
-  }
+std::size_t findVariable(File& file, const std::string& name) {
+  if (const auto number = file.findVariable(name)) return *number;
   const auto number = parseCount(name);
-  if (number && static_cast<double>(*number) < countVariables(file)) {
-    return static_cast<double>(*number);
-  }
+  if (number && *number < file.variableCount()) return *number;
   throw ToolError("noSuchVariable", "there is no variable \"" + printable(name) +
                                         "\"; 'ambrix info' lists those there are");
 }
@@ -119,17 +111,17 @@ void requireSupported(const Variable& variable) {
   if (variable.supported) return;
   throw ToolError("unsupportedDatatype",
                   fmt::format("variable \"{}\" has the datatype {}, which is not supported",
-                              printable(variable.name), variable.datatype));
+                              printable(variable.name), datatypeName(variable.datatype)));
 }
 
 }  // namespace
 
 void runDump(Module& module, const DumpOptions& options, StandardOutput& output) {
-  CdfFile file = CdfFile::open(module, options.file);
-  setReadOnly(file);
-  const Variable variable = inquireVariable(file, findVariable(file, options.variable));
+  File file = openFile(module, options.file);
+  const Variable variable = file.variable(findVariable(file, options.variable));
   requireSupported(variable);
-  const RecordRange range = parseRange(options.records, countRecords(file, variable));
+  const RecordRange range =
+      parseRange(options.records, static_cast<std::size_t>(file.recordCount(variable)));
   requireIndexed(file, variable, static_cast<double>(range.end));
   const auto format = makeFormat(options, variable, range, output.isTerminal());
   SlabPlan plan(variable, range.first, range.end);
@@ -137,7 +129,7 @@ void runDump(Module& module, const DumpOptions& options, StandardOutput& output)
                     errorIsTerminal() && !output.isTerminal());
   output.write(format->begin());
   while (const auto slab = plan.next()) {
-    const Array data = readSlab(file, variable, *slab);
+    const Array data = file.read(variable, *slab);
     const auto values = formatValues(module, data, variable.datatype, variable.elements);
     printSlab(*slab, values, *format, output);
     progress.advance(data.elementCount());

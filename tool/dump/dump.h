@@ -4,7 +4,7 @@
 #include <memory>
 #include <string>
 
-#include "tool/content/slabs.h"
+#include "ambrix/file.h"
 #include "tool/content/values.h"
 #include "tool/output/standard_output.h"
 

@@ -23,8 +23,8 @@ class JsonFormat : public DumpFormat {
     return fmt::format(
         "{{\n  \"variable\": {},\n  \"datatype\": \"{}\",\n  \"dimensions\": [{}],\n"
         "  \"firstRecord\": {},\n  \"records\": {},\n  \"data\": [",
-        asJsonText(variable_.name), variable_.datatype, fmt::join(variable_.sizes, ", "),
-        range_.first, range_.end - range_.first);
+        asJsonText(variable_.name), datatypeName(variable_.datatype),
+        fmt::join(variable_.sizes, ", "), range_.first, range_.end - range_.first);
   }
 
   /// Opens a list for each dimension that begins with the value, and closes those that end.

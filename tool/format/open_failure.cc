@@ -8,6 +8,7 @@
 #include <filesystem>
 #include <system_error>
 
+#include "ambrix/file.h"
 #include "tool/content/failure.h"
 #include "tool/format/file_header.h"
 
@@ -89,15 +90,8 @@ std::string explainContent(Module& module, const FileHeader& header, std::uint64
 
 }  // namespace
 
-fs::path fileOf(const std::string& path) {
-  std::error_code ignored;
-  for (const char* const extension : {"", ".cdf", ".CDF"})
-    if (fs::is_regular_file(path + extension, ignored)) return path + extension;
-  return path;
-}
-
 void requireOpenable(const std::string& path) {
-  const fs::path file = fileOf(path);
+  const fs::path file = fileOnDisk(path);
   if (file.native().size() > kLongestPath) {
     throw OpenError(
         fmt::format("the path has {} bytes, and the CDF library takes {} at most; go to "
@@ -112,7 +106,7 @@ void requireOpenable(const std::string& path) {
 }
 
 std::string explainRefusal(Module& module, const std::string& path) {
-  const fs::path file = fileOf(path);
+  const fs::path file = fileOnDisk(path);
   if (::access(file.c_str(), F_OK) != 0 && errno == ENOENT) return "there is no such file";
   if (::access(file.c_str(), R_OK) != 0) {
     return "it cannot be read: " + std::generic_category().message(errno);

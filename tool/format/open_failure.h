@@ -8,9 +8,6 @@
 
 namespace ambrix::tool {
 
-/// The file that the library looks for, which may have an extension that was not given.
-std::filesystem::path fileOf(const std::string& path);
-
 /// Throws `OpenError` for a path with which the library would wait for ever, or go on with another
 /// file.
 void requireOpenable(const std::string& path);

@@ -8,13 +8,14 @@
 
 namespace ambrix::tool {
 
-double countIndexedRecords(CdfFile& file, const Variable& variable) {
-  const double highest = file.number("getVarMaxAllocRecNum", {variable.number}) + 1;
-  if (file.text("getVarSparseRecords", {variable.number}) != "NO_SPARSERECORDS") return highest;
-  return std::min(highest, file.number("getVarAllocRecords", {variable.number}));
+double countIndexedRecords(File& file, const Variable& variable) {
+  const auto number = static_cast<double>(variable.number);
+  const double highest = file.number("getVarMaxAllocRecNum", {number}) + 1;
+  if (file.sparseRecords(variable) != "NO_SPARSERECORDS") return highest;
+  return std::min(highest, file.number("getVarAllocRecords", {number}));
 }
 
-void requireIndexed(CdfFile& file, const Variable& variable, double records) {
+void requireIndexed(File& file, const Variable& variable, double records) {
   if (records <= 0) return;
   const double indexed = countIndexedRecords(file, variable);
   if (records <= indexed) return;

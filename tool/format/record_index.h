@@ -1,8 +1,8 @@
 // Whether a file can hold the records that it claims to hold.
 #pragma once
 
+#include "ambrix/file.h"
 #include "tool/content/failure.h"
-#include "tool/content/variable.h"
 
 namespace ambrix::tool {
 
@@ -14,9 +14,9 @@ class DamagedCounts : public ToolError {
 
 /// The records from the first on that a variable's index has room for. The library keeps room for
 /// all records of a variable that is not sparse, and for the last one of any variable.
-double countIndexedRecords(CdfFile& file, const Variable& variable);
+double countIndexedRecords(File& file, const Variable& variable);
 
 /// Throws `DamagedCounts` when a variable's index has no room for that many records.
-void requireIndexed(CdfFile& file, const Variable& variable, double records);
+void requireIndexed(File& file, const Variable& variable, double records);
 
 }  // namespace ambrix::tool

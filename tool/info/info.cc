@@ -1,16 +1,29 @@
 #include "tool/info/info.h"
 
-#include "tool/content/attributes.h"
+#include <utility>
+
+#include "tool/content/open_file.h"
 
 namespace ambrix::tool {
+namespace {
+
+FileDescription describe(File& file, bool withAttributes) {
+  if (withAttributes) return file.describe();
+  FileDescription description;
+  description.facts = file.facts();
+  const std::size_t variables = file.variableCount();
+  for (std::size_t number = 0; number < variables; ++number)
+    description.variables.push_back(file.describeVariable(number));
+  return description;
+}
+
+}  // namespace
 
 void runInfo(Module& module, const InfoOptions& options, StandardOutput& output) {
-  CdfFile file = CdfFile::open(module, options.file);
-  setReadOnly(file);
-  const FileFacts facts = readFacts(module, file, options.attributes);
+  File file = openFile(module, options.file);
+  const Info info{module, options, describe(file, options.attributes)};
   file.close();
-  output.write(options.json ? factsAsJson(facts, options)
-                            : factsAsTables(facts, options, Style(output.isTerminal())));
+  output.write(options.json ? infoAsJson(info) : infoAsTables(info, Style(output.isTerminal())));
 }
 
 }  // namespace ambrix::tool

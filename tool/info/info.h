@@ -3,7 +3,7 @@
 
 #include <string>
 
-#include "tool/content/facts.h"
+#include "ambrix/file.h"
 #include "tool/output/standard_output.h"
 #include "tool/output/text.h"
 
@@ -17,8 +17,15 @@ struct InfoOptions {
 
 void runInfo(Module& module, const InfoOptions& options, StandardOutput& output);
 
-/// The facts as tables or as a JSON object.
-std::string factsAsTables(const FileFacts& facts, const InfoOptions& options, const Style& style);
-std::string factsAsJson(const FileFacts& facts, const InfoOptions& options);
+/// What there is to tell, and the module that makes texts of times.
+struct Info {
+  Module& module;
+  const InfoOptions& options;
+  FileDescription file;
+};
+
+/// As tables or as a JSON object.
+std::string infoAsTables(const Info& info, const Style& style);
+std::string infoAsJson(const Info& info);
 
 }  // namespace ambrix::tool

@@ -1,11 +1,13 @@
 #include <fmt/format.h>
 
+#include "tool/content/values.h"
 #include "tool/info/info.h"
 
 namespace ambrix::tool {
 namespace {
 
-std::string numberText(double value) {
+template <typename T>
+std::string numberText(T value) {
   return fmt::format("{}", value);
 }
 
@@ -37,31 +39,35 @@ std::string sparseText(const std::string& mode) {
   return mode == "NO_SPARSERECORDS" ? "" : mode.substr(0, mode.find('_'));
 }
 
-std::string padText(const VariableFacts& facts) {
-  return facts.definition.supported ? joinValues(facts.padValue) : "";
+std::string padText(const Info& info, const VariableDescription& facts) {
+  const Variable& variable = facts.definition;
+  if (!variable.supported) return "";
+  return joinValues(
+      formatValues(info.module, facts.padValue, variable.datatype, variable.elements));
 }
 
-std::string recordsText(const VariableFacts& facts) {
+std::string recordsText(const VariableDescription& facts) {
   if (facts.written == facts.records) return numberText(facts.records);
   return fmt::format("{} ({} stored)", facts.records, facts.written);
 }
 
-std::vector<std::string> variableRow(const VariableFacts& facts) {
+std::vector<std::string> variableRow(const Info& info, const VariableDescription& facts) {
   const Variable& variable = facts.definition;
   const bool known = variable.supported;
+  const std::string datatype = datatypeName(variable.datatype);
   return {numberText(variable.number),
           printable(variable.name),
-          known ? variable.datatype : variable.datatype + " (not supported)",
+          known ? datatype : datatype + " (not supported)",
           known ? fmt::format("{}", variable.elements) : "?",
           known ? sizesText(variable) : "?",
           recordsText(facts),
           known ? variancesText(variable) : "?",
           compressionText(facts.compression),
           sparseText(facts.sparseRecords),
-          padText(facts)};
+          padText(info, facts)};
 }
 
-std::string variableTable(const FileFacts& facts, const Style& style) {
+std::string variableTable(const Info& info, const Style& style) {
   TextTable table({{"No.", true},
                    {"Name"},
                    {"Datatype"},
@@ -72,17 +78,18 @@ std::string variableTable(const FileFacts& facts, const Style& style) {
                    {"Compression"},
                    {"Sparse"},
                    {"Pad value"}});
-  for (const VariableFacts& variable : facts.variables)
-    table.addRow(variableRow(variable));
+  for (const VariableDescription& variable : info.file.variables)
+    table.addRow(variableRow(info, variable));
   return table.render(style);
 }
 
-std::string summary(const FileFacts& facts, const InfoOptions& options, const Style& style) {
+std::string summary(const Info& info, const Style& style) {
+  const FileFacts& facts = info.file.facts;
   std::string text;
   const auto line = [&](const char* label, const std::string& value) {
     text += style.bold(fmt::format("{:<12}", label)) + value + '\n';
   };
-  line("File", printable(options.file));
+  line("File", printable(info.options.file));
   line("Version", facts.version);
   line("Format", facts.format);
   line("Encoding", facts.encoding);
@@ -90,27 +97,35 @@ std::string summary(const FileFacts& facts, const InfoOptions& options, const St
   line("Compression", compressionText(facts.compression));
   line("Checksum", facts.checksum);
   line("Records", numberText(facts.records));
-  line("Variables", fmt::format("{}", facts.variables.size()));
+  line("Variables", numberText(info.file.variables.size()));
   line("Attributes",
        fmt::format("{} global, {} variable", facts.globalAttributes, facts.variableAttributes));
   return text;
 }
 
-std::string entryOwner(const FileFacts& facts, const AttributeFacts& attribute, double number) {
-  const auto index = static_cast<std::size_t>(number);
-  if (attribute.global || index >= facts.variables.size()) return numberText(number);
-  return printable(facts.variables[index].definition.name);
+std::string entryOwner(const Info& info, const Attribute& attribute, std::size_t number) {
+  const auto& variables = info.file.variables;
+  if (attribute.global || number >= variables.size()) return numberText(number);
+  return printable(variables[number].definition.name);
 }
 
-std::string attributeTable(const FileFacts& facts, bool global, const Style& style) {
+std::string valueText(const Info& info, const EntryDescription& described) {
+  if (!described.entry.supported) return "(not supported)";
+  const ArrayView value = described.value;
+  return joinValues(
+      formatValues(info.module, value, described.entry.datatype, value.elementCount()));
+}
+
+std::string attributeTable(const Info& info, bool global, const Style& style) {
   TextTable table({{"Attribute"}, {global ? "Entry" : "Variable"}, {"Datatype"}, {"Value"}});
-  for (const AttributeFacts& attribute : facts.attributes) {
+  for (const auto& [attribute, entries] : info.file.attributes) {
     if (attribute.global != global) continue;
     const std::string name = printable(attribute.name);
-    if (attribute.entries.empty()) table.addRow({name, "", "", "(no entries)"});
-    for (const EntryFacts& entry : attribute.entries) {
-      const std::string value = entry.supported ? joinValues(entry.values) : "(not supported)";
-      table.addRow({name, entryOwner(facts, attribute, entry.number), entry.datatype, value});
+    if (entries.empty()) table.addRow({name, "", "", "(no entries)"});
+    for (const EntryDescription& described : entries) {
+      const Entry& entry = described.entry;
+      table.addRow({name, entryOwner(info, attribute, entry.number), datatypeName(entry.datatype),
+                    valueText(info, described)});
     }
   }
   return table.render(style);
@@ -118,14 +133,16 @@ std::string attributeTable(const FileFacts& facts, bool global, const Style& sty
 
 }  // namespace
 
-std::string factsAsTables(const FileFacts& facts, const InfoOptions& options, const Style& style) {
-  std::string text = summary(facts, options, style);
-  if (!facts.variables.empty()) text += '\n' + variableTable(facts, style);
-  if (options.attributes && facts.globalAttributes > 0) {
-    text += "\n" + style.bold("Global attributes") + "\n" + attributeTable(facts, true, style);
+std::string infoAsTables(const Info& info, const Style& style) {
+  const FileFacts& facts = info.file.facts;
+  const bool attributes = info.options.attributes;
+  std::string text = summary(info, style);
+  if (!info.file.variables.empty()) text += '\n' + variableTable(info, style);
+  if (attributes && facts.globalAttributes > 0) {
+    text += "\n" + style.bold("Global attributes") + "\n" + attributeTable(info, true, style);
   }
-  if (options.attributes && facts.variableAttributes > 0) {
-    text += "\n" + style.bold("Variable attributes") + "\n" + attributeTable(facts, false, style);
+  if (attributes && facts.variableAttributes > 0) {
+    text += "\n" + style.bold("Variable attributes") + "\n" + attributeTable(info, false, style);
   }
   return text;
 }

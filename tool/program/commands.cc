@@ -7,6 +7,7 @@
 #include <optional>
 #include <string>
 
+#include "ambrix/file_error.h"
 #include "tool/check/check.h"
 #include "tool/content/failure.h"
 #include "tool/format/open_failure.h"
@@ -32,15 +33,17 @@ struct Context {
 void readNamed(const std::string& file, const std::function<void()>& read) try {
   requireOpenable(file);
   read();
-} catch (const FileError&) {
+} catch (const NamedError&) {
   throw;
 } catch (const ToolError& error) {
-  throw FileError(file, error.identifier(), error.what());
+  throw NamedError(file, error.identifier(), error.what());
+} catch (const FileError& error) {
+  throw NamedError(file, error.identifier(), error.reason());
 } catch (const Error& error) {
-  throw FileError(file, error.identifier(), error.what());
+  throw NamedError(file, error.identifier(), error.what());
 } catch (const std::bad_alloc&) {
-  throw FileError(file, "TOLVEX:host:outOfMemory",
-                  "there is not enough memory; --memory-limit may allow more");
+  throw NamedError(file, "TOLVEX:host:outOfMemory",
+                   "there is not enough memory; --memory-limit may allow more");
 }
 
 /// A worker that crashed for want of something says nothing of its file.
@@ -49,7 +52,7 @@ void requirePlenty(const WorkerEnd& end, const std::string& file) {
   takeFindings(end.reports, found);
   if (end.kind == WorkerEnd::Kind::kDone || found.unread.empty()) return;
   const Problem& want = found.unread.front();
-  throw FileError(file, want.identifier, want.message);
+  throw NamedError(file, want.identifier, want.message);
 }
 
 /// Reads the file in a worker, which writes to the output as this process would.

@@ -1,27 +1,36 @@
-#include "tool/content/slabs.h"
-
 #include <algorithm>
 #include <functional>
 #include <numeric>
 
-#include "tool/content/values.h"
-#include "tool/output/text.h"
-#include "tool/supervision/steps.h"
+#include "ambrix/variable.h"
 
-namespace ambrix::tool {
+namespace ambrix {
 namespace {
 
 constexpr std::size_t kElementsAtOnce = 1 << 20;
 
-Array rowOf(const std::vector<std::size_t>& numbers) {
-  const std::vector<double> values(numbers.begin(), numbers.end());
-  return Array::row(std::span<const double>(values));
-}
-
 }  // namespace
 
-std::size_t Slab::values() const {
+std::size_t Variable::valueElements() const noexcept {
+  return elementsPerValue(datatype, elements);
+}
+
+std::size_t Variable::recordElements() const noexcept {
+  return std::accumulate(sizes.begin(), sizes.end(), valueElements(), std::multiplies<>());
+}
+
+Slab Slab::ofRecords(const Variable& variable, std::size_t first, std::size_t records,
+                     std::size_t recordStep) {
+  return {first, records, std::vector<std::size_t>(variable.sizes.size()), variable.sizes,
+          recordStep};
+}
+
+std::size_t Slab::values() const noexcept {
   return std::accumulate(count.begin(), count.end(), records, std::multiplies<>());
+}
+
+std::size_t Slab::elements(const Variable& variable) const noexcept {
+  return values() * variable.valueElements();
 }
 
 SlabPlan::SlabPlan(const Variable& variable, std::size_t firstRecord, std::size_t endRecord)
@@ -34,7 +43,7 @@ SlabPlan::SlabPlan(const Variable& variable, std::size_t firstRecord, std::size_
 }
 
 void SlabPlan::planRecord(const Variable& variable) {
-  std::size_t span = hostElements(variable.datatype, variable.elements);
+  std::size_t span = variable.valueElements();
   while (splitDimension_ + 1 < sizes_.size() && span * sizes_[splitDimension_] <= kElementsAtOnce)
     span *= sizes_[splitDimension_++];
   step_ = std::max<std::size_t>(kElementsAtOnce / span, 1);
@@ -75,35 +84,4 @@ void SlabPlan::advance() {
   }
 }
 
-std::vector<Array> slabArguments(const Variable& variable, const Slab& slab) {
-  std::vector<Array> arguments;
-  const double records[] = {variable.number, static_cast<double>(slab.firstRecord),
-                            static_cast<double>(slab.records), 1};
-  for (const double number : records)
-    arguments.push_back(Array::scalar(number));
-  arguments.push_back(rowOf(slab.start));
-  arguments.push_back(rowOf(slab.count));
-  arguments.push_back(rowOf(std::vector<std::size_t>(slab.count.size(), 1)));
-  return arguments;
-}
-
-Array readSlab(CdfFile& file, const Variable& variable, const Slab& slab) {
-  beginStep("reading variable \"" + printable(variable.name) + '"');
-  const std::vector<Array> arguments = slabArguments(variable, slab);
-  const std::vector<ArrayView> views(arguments.begin(), arguments.end());
-  return std::move(file.call("hyperGetVarData", views).at(0));
-}
-
-void writeSlab(CdfFile& file, const Variable& variable, const Slab& slab, ArrayView data) {
-  const std::vector<Array> arguments = slabArguments(variable, slab);
-  std::vector<ArrayView> views(arguments.begin(), arguments.end());
-  views.push_back(data);
-  file.call("hyperPutVarData", views);
-}
-
-std::size_t countRecords(CdfFile& file, const Variable& variable) {
-  const double last = file.number("getVarMaxWrittenRecNum", {variable.number});
-  return static_cast<std::size_t>(last + 1);
-}
-
-}  // namespace ambrix::tool
+}  // namespace ambrix

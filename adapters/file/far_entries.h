@@ -1,18 +1,18 @@
 // Entries whose numbers lie far apart.
 #pragma once
 
+#include <cstddef>
 #include <vector>
 
-#include "tool/content/attributes.h"
+#include "ambrix/file.h"
 
-namespace ambrix::tool {
+namespace ambrix {
 
 /// The numbers, from `first` on, of an attribute's entries in rising order, but not more than
 /// `count`. The commands tell the highest number only. So the entries are found from the top, by
 /// deleting one after the other in a scratch copy of the file: what this takes depends on how many
-/// there are, not on how high their numbers are. Throws `ToolError` when there is no room for a
-/// copy.
-std::vector<double> entryNumbersFrom(CdfFile& file, const Attribute& attribute, double first,
-                                     double count);
+/// there are, not on how high their numbers are. Throws `FileError` when there can be no copy.
+std::vector<std::size_t> farEntries(File& file, const Attribute& attribute, std::size_t first,
+                                    std::size_t count, const FileOptions& options);
 
-}  // namespace ambrix::tool
+}  // namespace ambrix

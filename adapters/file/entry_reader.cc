@@ -1,0 +1,51 @@
+#include "adapters/file/entry_reader.h"
+
+#include <utility>
+
+#include "adapters/file/numbers.h"
+#include "ambrix/texts.h"
+
+namespace ambrix {
+
+EntryReader::EntryReader(File& file, const Attribute& attribute)
+    : file_(file),
+      attribute_(attribute),
+      inquireCommand_(
+          Array::fromNarrow(attribute.global ? "inquireAttrgEntry" : "inquireAttrEntry")),
+      valueCommand_(Array::fromNarrow(attribute.global ? "getAttrgEntry" : "getAttrEntry")),
+      attributeNumber_(Array::scalar(numberOf(attribute))),
+      entryNumber_(Array::scalar(0.0)) {}
+
+std::vector<Array> EntryReader::call(const Array& command, std::size_t number) {
+  entryNumber_.mutableData<double>().front() = static_cast<double>(number);
+  const ArrayView arguments[] = {file_.id(), attributeNumber_, entryNumber_};
+  return file_.module().call(command, arguments);
+}
+
+Entry EntryReader::inquire(std::size_t number) try {
+  const std::vector<Array> facts = call(inquireCommand_, number);
+  const auto datatype = datatypeNamed(bytesOf(facts.at(0)));
+  return {number, datatype.value_or(Datatype{}), true, sizeOf(facts.at(1).data<double>().front())};
+} catch (const Error& error) {
+  const auto datatype = unsupportedDatatype(error);
+  if (!datatype) throw;
+  return {number, *datatype, false, 0};
+}
+
+Array EntryReader::value(std::size_t number) {
+  return std::move(call(valueCommand_, number).at(0));
+}
+
+std::size_t EntryReader::count() {
+  return sizeOf(file_.number(attribute_.global ? "getNumAttrgEntries" : "getNumAttrEntries",
+                             {numberOf(attribute_)}));
+}
+
+std::optional<Entry> EntryReader::find(std::size_t number, std::exception_ptr& failure) try {
+  return inquire(number);
+} catch (const Error&) {
+  failure = std::current_exception();
+  return std::nullopt;
+}
+
+}  // namespace ambrix

@@ -1,0 +1,41 @@
+// Times in arrays, as calendar texts and as nanoseconds.
+#pragma once
+
+#include <cstdint>
+#include <limits>
+#include <span>
+#include <string>
+#include <vector>
+
+#include "ambrix/array.h"
+#include "ambrix/datatype.h"
+#include "ambrix/export.h"
+#include "ambrix/module.h"
+
+namespace ambrix {
+
+/// Stands for a value that is no time, such as a fill value, or that 64 bits of nanoseconds since
+/// 1970 cannot hold: they reach from 1677 to 2262. It is NumPy's "not a time".
+inline constexpr std::int64_t kNoTime = std::numeric_limits<std::int64_t>::min();
+
+/// The times in an array of a datatype as ISO 8601, such as "2004-05-13T15:08:11.022": in
+/// milliseconds, and those of `CDF_EPOCH16` in picoseconds. The text is empty where the value is no
+/// time of the years 0 to 9999. Throws std::invalid_argument for a datatype without times.
+AMBRIX_EXPORT std::vector<std::string> timesAsText(Module& module, ArrayView times,
+                                                   Datatype datatype);
+
+/// The same as nanoseconds since 1970-01-01T00:00:00, each rounded to the nearest one; `kNoTime`
+/// where there is none. Days have 86,400 seconds, as in all epochs of these datatypes.
+AMBRIX_EXPORT std::vector<std::int64_t> timesAsNanoseconds(ArrayView times, Datatype datatype);
+
+/// The array of a datatype with these times, one record each. Today's times of `CDF_EPOCH` are
+/// multiples of 1/128 millisecond. `kNoTime` becomes the usual fill value, -1e31.
+AMBRIX_EXPORT Array timesFromNanoseconds(std::span<const std::int64_t> times, Datatype datatype);
+
+/// The same from ISO 8601: a date, or date and time with up to twelve digits behind the second, and
+/// "Z" or nothing. An empty text becomes the fill value. Throws std::invalid_argument for a text
+/// that is no time, and the module's `Error` for one like "2004-13-01".
+AMBRIX_EXPORT Array timesFromText(Module& module, std::span<const std::string> times,
+                                  Datatype datatype);
+
+}  // namespace ambrix

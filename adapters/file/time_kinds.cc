@@ -1,0 +1,135 @@
+#include "adapters/file/time_kinds.h"
+
+#include <algorithm>
+#include <array>
+#include <cmath>
+#include <stdexcept>
+
+#include "ambrix/times.h"
+
+namespace ambrix {
+namespace {
+
+constexpr double kFill = -1e31;
+constexpr std::int64_t kEpochOf1970 = 62167219200;  // seconds from the year 0 on
+constexpr double kEndOfTime = 315569520000;         // the year 10000
+constexpr double kSpan = 9.2e9;                     // seconds that nanoseconds can hold, about
+constexpr std::int64_t kSecond = 1'000'000'000;     // in nanoseconds
+constexpr std::int64_t kMillisecond = 1'000'000;
+constexpr double kPicosecondsPerSecond = 1e12;
+
+/// Comparisons with a number that is none are false.
+bool isWithin(double value, double end) {
+  return value >= 0 && value < end;
+}
+
+std::vector<bool> validEpochs(ArrayView times) {
+  std::vector<bool> valid;
+  for (const double value : times.data<double>())
+    valid.push_back(isWithin(value, kEndOfTime * 1000));
+  return valid;
+}
+
+/// Seconds since the year 0 and a fraction in nanoseconds, as nanoseconds since 1970.
+std::int64_t since1970(double seconds, double fraction) {
+  const double from1970 = seconds - static_cast<double>(kEpochOf1970);
+  if (!(std::abs(from1970) < kSpan)) return kNoTime;
+  return static_cast<std::int64_t>(from1970) * kSecond + std::llround(fraction);
+}
+
+/// The division of a time of milliseconds is exact, as is its remainder.
+std::int64_t nanosecondsOfEpoch(double value) {
+  const double seconds = std::floor(value / 1000);
+  return since1970(seconds, (value - seconds * 1000) * 1e6);
+}
+
+std::vector<std::int64_t> nanosecondsOfEpochs(ArrayView times) {
+  const std::span<const double> values = times.data<double>();
+  std::vector<std::int64_t> nanoseconds(values.size());
+  std::ranges::transform(values, nanoseconds.begin(), nanosecondsOfEpoch);
+  return nanoseconds;
+}
+
+Array epochsOfNanoseconds(std::span<const std::int64_t> times) {
+  Array array = Array::uninitialized(ClassId::kDouble, {1, times.size()});
+  std::ranges::transform(times, array.mutableData<double>().begin(), [](std::int64_t time) {
+    const std::int64_t whole = time / kMillisecond;
+    const auto fraction = static_cast<double>(time % kMillisecond) / kMillisecond;
+    return time == kNoTime ? kFill : static_cast<double>(whole + kEpochOf1970 * 1000) + fraction;
+  });
+  return array;
+}
+
+void addToEpoch(Array& times, std::size_t index, double picoseconds) {
+  times.mutableData<double>()[index] += picoseconds / 1e9;
+}
+
+void fillEpoch(Array& times, std::size_t index) {
+  times.mutableData<double>()[index] = kFill;
+}
+
+std::vector<bool> validEpochs16(ArrayView times) {
+  const std::span<const double> values = times.data<double>();
+  std::vector<bool> valid;
+  for (std::size_t i = 0; i + 1 < values.size(); i += 2)
+    valid.push_back(isWithin(values[i], kEndOfTime) &&
+                    isWithin(values[i + 1], kPicosecondsPerSecond));
+  return valid;
+}
+
+std::vector<std::int64_t> nanosecondsOfEpochs16(ArrayView times) {
+  const std::span<const double> values = times.data<double>();
+  std::vector<std::int64_t> nanoseconds;
+  nanoseconds.reserve(values.size() / 2);
+  for (std::size_t i = 0; i + 1 < values.size(); i += 2) {
+    const bool whole = isWithin(values[i + 1], kPicosecondsPerSecond);
+    nanoseconds.push_back(whole ? since1970(values[i], values[i + 1] / 1000) : kNoTime);
+  }
+  return nanoseconds;
+}
+
+/// Rounds down, also before 1970.
+std::int64_t secondsOf(std::int64_t time) {
+  return time / kSecond - (time % kSecond < 0 ? 1 : 0);
+}
+
+Array epochs16OfNanoseconds(std::span<const std::int64_t> times) {
+  Array array = Array::uninitialized(ClassId::kDouble, {2, times.size()});
+  auto value = array.mutableData<double>().begin();
+  for (const std::int64_t time : times) {
+    const std::int64_t seconds = secondsOf(time);
+    const auto fraction = static_cast<double>(time - seconds * kSecond);
+    *value++ = time == kNoTime ? kFill : static_cast<double>(seconds + kEpochOf1970);
+    *value++ = time == kNoTime ? kFill : fraction * 1000;
+  }
+  return array;
+}
+
+void addToEpoch16(Array& times, std::size_t index, double picoseconds) {
+  times.mutableData<double>()[2 * index + 1] += picoseconds;
+}
+
+void fillEpoch16(Array& times, std::size_t index) {
+  const std::span<double> values = times.mutableData<double>();
+  values[2 * index] = kFill;
+  values[2 * index + 1] = kFill;
+}
+
+constexpr std::array<TimeKind, 2> kTimeKinds = {{
+    {Datatype::kEpoch, "epochBreakdown", "computeEpoch", 7, validEpochs, nanosecondsOfEpochs,
+     epochsOfNanoseconds, addToEpoch, fillEpoch},
+    {Datatype::kEpoch16, "epoch16Breakdown", "computeEpoch16", 10, validEpochs16,
+     nanosecondsOfEpochs16, epochs16OfNanoseconds, addToEpoch16, fillEpoch16},
+}};
+
+}  // namespace
+
+const TimeKind& timeKindOf(Datatype datatype) {
+  const auto* const found = std::ranges::find(kTimeKinds, datatype, &TimeKind::datatype);
+  if (found == kTimeKinds.end()) {
+    throw std::invalid_argument("values of " + datatypeName(datatype) + " are no times here");
+  }
+  return *found;
+}
+
+}  // namespace ambrix
