@@ -10,6 +10,11 @@ write_basic_package_version_file("${CMAKE_BINARY_DIR}/generated/ambrixConfigVers
 install(FILES "${CMAKE_BINARY_DIR}/generated/ambrixConfigVersion.cmake"
   DESTINATION "${ambrix_package}")
 
+# For those who build without CMake. The library lies in a folder of its own, where programs look.
+configure_file(cmake/ambrix.pc.in "${CMAKE_BINARY_DIR}/generated/ambrix.pc" @ONLY)
+install(FILES "${CMAKE_BINARY_DIR}/generated/ambrix.pc"
+  DESTINATION "${CMAKE_INSTALL_LIBDIR}/pkgconfig")
+
 install(FILES LICENSE NOTICE CHANGELOG.md DESTINATION "${CMAKE_INSTALL_DOCDIR}")
 install(FILES README.md DESTINATION "${CMAKE_INSTALL_DOCDIR}" OPTIONAL)
 install(DIRECTORY docs DESTINATION "${CMAKE_INSTALL_DOCDIR}"

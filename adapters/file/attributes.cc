@@ -2,6 +2,7 @@
 #include <exception>
 #include <utility>
 
+#include "adapters/file/entry_finder.h"
 #include "adapters/file/entry_reader.h"
 #include "adapters/file/far_entries.h"
 #include "adapters/file/names.h"
@@ -130,12 +131,17 @@ void File::deleteEntry(const Attribute& attribute, std::size_t entry) {
 }
 
 AttributeDescription File::describeAttribute(std::size_t number) {
+  EntryFinder finder(*this);
+  return describeAttribute(number, finder);
+}
+
+AttributeDescription File::describeAttribute(std::size_t number, EntryFinder& finder) {
   AttributeDescription description{attribute(number), {}};
   EntryReader reader(*this, description.attribute);
-  forEachEntry(description.attribute, [&](const Entry& entry) {
+  for (const Entry& entry : finder.find(description.attribute)) {
     Array value = entry.supported ? reader.value(entry.number) : Array();
     description.entries.push_back({entry, std::move(value)});
-  });
+  }
   return description;
 }
 
@@ -146,8 +152,9 @@ FileDescription File::describe() {
   for (std::size_t number = 0; number < variables; ++number)
     description.variables.push_back(describeVariable(number));
   const std::size_t attributes = attributeCount();
+  EntryFinder finder(*this);
   for (std::size_t number = 0; number < attributes; ++number)
-    description.attributes.push_back(describeAttribute(number));
+    description.attributes.push_back(describeAttribute(number, finder));
   return description;
 }
 

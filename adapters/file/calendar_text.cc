@@ -1,6 +1,7 @@
 #include "adapters/file/calendar_text.h"
 
 #include <algorithm>
+#include <chrono>
 #include <cmath>
 #include <cstdlib>
 #include <optional>
@@ -13,9 +14,10 @@ constexpr std::size_t kSeconds = 5;          // the place of the seconds among t
 constexpr std::size_t kFractionDigits = 12;  // three for each part behind the seconds
 
 void appendPadded(std::string& text, double part, std::size_t width) {
-  const std::string digits = std::to_string(std::lround(part));
-  if (digits.size() < width) text.append(width - digits.size(), '0');
-  text += digits;
+  text.append(width, '0');
+  auto rest = static_cast<int>(part);
+  for (auto digit = text.rbegin(); rest > 0 && width > 0; ++digit, --width, rest /= 10)
+    *digit = static_cast<char>('0' + rest % 10);
 }
 
 /// Takes fixed forms from the front of a text.
@@ -85,11 +87,20 @@ bool scanParts(Scanner& scanner, CalendarTime& time) {
   return !scanner.take('.') || scanFraction(scanner, time);
 }
 
+/// The CDF library would count months beyond the twelfth into the next year.
+bool isTime(const CalendarTime& time) {
+  const auto part = [&](std::size_t i) { return static_cast<unsigned>(time.parts[i]); };
+  const std::chrono::year_month_day date(std::chrono::year(static_cast<int>(part(0))),
+                                         std::chrono::month(part(1)), std::chrono::day(part(2)));
+  return date.ok() && part(3) < 24 && part(4) < 60 && part(kSeconds) < 60;
+}
+
 }  // namespace
 
 std::string calendarText(std::span<const double> parts) {
   constexpr std::array<char, 6> kSeparators = {'-', '-', 'T', ':', ':', '.'};
   std::string text;
+  text.reserve(sizeof "2004-05-13T15:08:11.022033044055");
   for (std::size_t i = 0; i < parts.size(); ++i) {
     const std::size_t width = i > kSeconds ? 3 : i == 0 ? 4 : 2;
     appendPadded(text, parts[i], width);
@@ -103,7 +114,7 @@ CalendarTime parseCalendarTime(std::string_view text) {
   if (text.empty()) return time;
   const std::string_view local = text.ends_with('Z') ? text.substr(0, text.size() - 1) : text;
   Scanner scanner(local);
-  if (!scanParts(scanner, time) || !scanner.atEnd()) {
+  if (!scanParts(scanner, time) || !scanner.atEnd() || !isTime(time)) {
     throw std::invalid_argument("\"" + std::string(text) +
                                 "\" is no time; expected one like 2004-05-13T15:08:11.022");
   }

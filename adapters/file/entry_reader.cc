@@ -6,6 +6,14 @@
 #include "ambrix/texts.h"
 
 namespace ambrix {
+namespace {
+
+Entry found(std::size_t number, const std::vector<Array>& facts) {
+  const auto datatype = datatypeNamed(bytesOf(facts.at(0)));
+  return {number, datatype.value_or(Datatype{}), true, sizeOf(facts.at(1).data<double>().front())};
+}
+
+}  // namespace
 
 EntryReader::EntryReader(File& file, const Attribute& attribute)
     : file_(file),
@@ -22,14 +30,11 @@ std::vector<Array> EntryReader::call(const Array& command, std::size_t number) {
   return file_.module().call(command, arguments);
 }
 
-Entry EntryReader::inquire(std::size_t number) try {
-  const std::vector<Array> facts = call(inquireCommand_, number);
-  const auto datatype = datatypeNamed(bytesOf(facts.at(0)));
-  return {number, datatype.value_or(Datatype{}), true, sizeOf(facts.at(1).data<double>().front())};
-} catch (const Error& error) {
-  const auto datatype = unsupportedDatatype(error);
-  if (!datatype) throw;
-  return {number, *datatype, false, 0};
+Entry EntryReader::inquire(std::size_t number) {
+  std::exception_ptr failure;
+  const auto entry = find(number, failure);
+  if (!entry) std::rethrow_exception(failure);
+  return *entry;
 }
 
 Array EntryReader::value(std::size_t number) {
@@ -42,8 +47,10 @@ std::size_t EntryReader::count() {
 }
 
 std::optional<Entry> EntryReader::find(std::size_t number, std::exception_ptr& failure) try {
-  return inquire(number);
-} catch (const Error&) {
+  return found(number, call(inquireCommand_, number));
+} catch (const Error& error) {
+  const auto datatype = unsupportedDatatype(error);
+  if (datatype) return Entry{number, *datatype, false, 0};
   failure = std::current_exception();
   return std::nullopt;
 }

@@ -30,17 +30,21 @@ std::vector<bool> validEpochs(ArrayView times) {
   return valid;
 }
 
-/// Seconds since the year 0 and a fraction in nanoseconds, as nanoseconds since 1970.
-std::int64_t since1970(double seconds, double fraction) {
-  const double from1970 = seconds - static_cast<double>(kEpochOf1970);
-  if (!(std::abs(from1970) < kSpan)) return kNoTime;
-  return static_cast<std::int64_t>(from1970) * kSecond + std::llround(fraction);
+/// Of times from 1677 to 2262, all of them after the year 0, so that whole numbers are below.
+std::int64_t nanosecondsOfEpoch(double value) {
+  const double from1970 = value - static_cast<double>(kEpochOf1970 * 1000);
+  if (!(std::abs(from1970) < kSpan * 1000)) return kNoTime;
+  const auto whole = static_cast<std::int64_t>(value);
+  const double fraction = (value - static_cast<double>(whole)) * kMillisecond;
+  return (whole - kEpochOf1970 * 1000) * kMillisecond + static_cast<std::int64_t>(fraction + 0.5);
 }
 
-/// The division of a time of milliseconds is exact, as is its remainder.
-std::int64_t nanosecondsOfEpoch(double value) {
-  const double seconds = std::floor(value / 1000);
-  return since1970(seconds, (value - seconds * 1000) * 1e6);
+std::int64_t nanosecondsOfEpoch16(double seconds, double picoseconds) {
+  const double from1970 = seconds - static_cast<double>(kEpochOf1970);
+  const bool isTime = std::abs(from1970) < kSpan && isWithin(picoseconds, kPicosecondsPerSecond);
+  if (!isTime) return kNoTime;
+  const auto fraction = static_cast<std::int64_t>(picoseconds / 1000 + 0.5);
+  return static_cast<std::int64_t>(from1970) * kSecond + fraction;
 }
 
 std::vector<std::int64_t> nanosecondsOfEpochs(ArrayView times) {
@@ -81,10 +85,8 @@ std::vector<std::int64_t> nanosecondsOfEpochs16(ArrayView times) {
   const std::span<const double> values = times.data<double>();
   std::vector<std::int64_t> nanoseconds;
   nanoseconds.reserve(values.size() / 2);
-  for (std::size_t i = 0; i + 1 < values.size(); i += 2) {
-    const bool whole = isWithin(values[i + 1], kPicosecondsPerSecond);
-    nanoseconds.push_back(whole ? since1970(values[i], values[i + 1] / 1000) : kNoTime);
-  }
+  for (std::size_t i = 0; i + 1 < values.size(); i += 2)
+    nanoseconds.push_back(nanosecondsOfEpoch16(values[i], values[i + 1]));
   return nanoseconds;
 }
 

@@ -24,14 +24,16 @@ class InstallTest(TreeChecks, unittest.TestCase):
     def test_nothing_private_is_laid_out(self):
         headers = {path.relative_to(self.tree / "include").as_posix()
                    for path in (self.tree / "include").rglob("*.h")}
-        public = {path.relative_to(SOURCE / "adapters/embedded/include").as_posix()
-                  for path in (SOURCE / "adapters/embedded/include").rglob("*.h")}
+        public = {path.relative_to(folder).as_posix()
+                  for folder in (SOURCE / "adapters").glob("*/include")
+                  for path in folder.rglob("*.h")}
         self.assertEqual(headers, public | {"ambrix/host/message_id.h"})
         self.assertEqual(list(self.tree.rglob("*.a")), [])
 
     def test_texts_do_not_know_where_they_were_made(self):
         for path in self.tree.rglob("*"):
-            if path.is_dir() or path.suffix not in (".cmake", ".h", ".1", ".md"):
+            is_text = path.suffix in (".cmake", ".h", ".1", ".md", ".pc")
+            if path.is_dir() or ".so." in path.name or not is_text:
                 continue
             for place in (self.prefix, BUILD, SOURCE):
                 self.assertNotIn(str(place), path.read_text(), path)
@@ -44,6 +46,12 @@ class InstallTest(TreeChecks, unittest.TestCase):
 
     def test_the_example_is_built_and_runs(self):
         self.check_example(self.tree, self.folder / "example")
+
+    def test_a_program_is_built_with_pkg_config(self):
+        self.check_pkg_config(self.tree, self.folder)
+
+    def test_the_library_has_a_version(self):
+        self.check_soname(self.tree)
 
     def test_another_version_is_not_found(self):
         wanted = self.tree / "share/doc/ambrix/examples/CMakeLists.txt"

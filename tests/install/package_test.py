@@ -36,6 +36,7 @@ class PackageTest(TreeChecks, unittest.TestCase):
         self.check_libraries(tree)
         self.check_tool(tree)
         self.check_example(tree, self.folder / "example")
+        self.check_soname(tree)
 
     def test_archive(self):
         package = self.make("TGZ", "*.tar.gz")

@@ -31,6 +31,8 @@
 
 namespace ambrix {
 
+class EntryFinder;
+
 /// An open file. The module must stay where it is, and loaded, until its files are closed. Members
 /// throw what the module raises, `Error`, and `FileError`. Numbers of variables and attributes
 /// change when one before them is deleted: what was found earlier is to be found anew then.
@@ -159,6 +161,7 @@ class AMBRIX_EXPORT File {
   void announce(Step::Kind kind, std::size_t number, std::string_view name = {}) const;
   void setReadOnly();
   std::optional<std::size_t> find(std::string_view command, std::string_view name);
+  AttributeDescription describeAttribute(std::size_t number, EntryFinder& finder);
   Attribute attributeFor(std::string_view name, bool global);
 
   Module* module_;

@@ -34,7 +34,7 @@ AMBRIX_EXPORT Array timesFromNanoseconds(std::span<const std::int64_t> times, Da
 
 /// The same from ISO 8601: a date, or date and time with up to twelve digits behind the second, and
 /// "Z" or nothing. An empty text becomes the fill value. Throws std::invalid_argument for a text
-/// that is no time, and the module's `Error` for one like "2004-13-01".
+/// that is no time.
 AMBRIX_EXPORT Array timesFromText(Module& module, std::span<const std::string> times,
                                   Datatype datatype);
 

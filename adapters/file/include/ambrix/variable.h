@@ -32,7 +32,7 @@ struct AMBRIX_EXPORT Variable {
 /// How a file or a variable is compressed, in the words of the commands.
 struct Compression {
   std::string type = "NO_COMPRESSION";
-  std::string parameter = {};  // "6" (the level of GZIP), "RLE_OF_ZEROS", ...
+  std::string parameter = {};  // "6" (the level of GZIP), "RLE_OF_ZEROs", ...
   double percentage = 100;     // of the uncompressed size, as of the last closing
 };
 
