@@ -10,6 +10,7 @@ function column = given (folder, divisor)
   column.singles = floor (100000 / divisor);
   column.texts = floor (100000 / divisor);
   column.images = floor (2000 / divisor);
+  column.smallFiles = floor (1000 / divisor);
   column.times = floor (1000000 / divisor);
   column.calls = floor (20000 / divisor);
 endfunction
@@ -62,6 +63,13 @@ endfunction
 
 function seconds = read_gzip_file (column)
   seconds = read_slab (column, "gzip_file.cdf", column.records, [10, 100], [1, 1]);
+endfunction
+
+function seconds = read_small_files (column)
+  seconds = 0;
+  for i = 1:column.smallFiles
+    seconds += read_slab (column, "small_gzip.cdf", 100, [], []);
+  endfor
 endfunction
 
 function seconds = read_text (column)

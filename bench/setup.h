@@ -19,6 +19,7 @@ struct Setup {
   [[nodiscard]] std::size_t singles() const { return 100'000 / divisor; }
   [[nodiscard]] std::size_t texts() const { return 100'000 / divisor; }
   [[nodiscard]] std::size_t images() const { return 2000 / divisor; }
+  [[nodiscard]] std::size_t smallFiles() const { return 1000 / divisor; }
   [[nodiscard]] std::size_t times() const { return 1'000'000 / divisor; }
   [[nodiscard]] std::size_t calls() const { return 20'000 / divisor; }
 

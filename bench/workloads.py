@@ -12,6 +12,7 @@ WORKLOADS = (
     Workload("read_column_major", "read the same, column-major", None),
     Workload("read_gzip", "read the same, gzip", None),
     Workload("read_gzip_file", "read the same, the whole file gzip", None),
+    Workload("read_small_files", "read a compressed file of 100 doubles", 1000),
     Workload("write", "write 51 MB of doubles, row-major", None),
     Workload("write_column_major", "write the same, column-major", None),
     Workload("write_gzip", "write the same, gzip", None),

@@ -76,5 +76,6 @@ int guardedMain(int count, const char* const* words) {
 
 int main(int count, char** words) {
   ambrix::tool::forgetLibrarySettings();
+  ambrix::keepFreedMemory();
   return ambrix::tool::guardedMain(count, words);
 }

@@ -87,6 +87,12 @@ double readGzip(const Setup& setup) {
 double readGzipFile(const Setup& setup) {
   return readNumbers(setup, "gzip_file.cdf");
 }
+double readSmallFiles(const Setup& setup) {
+  double seconds = 0;
+  for (std::size_t i = 0; i < setup.smallFiles(); ++i)
+    seconds += readSlab<double>(setup.file("small_gzip.cdf"), wholeSlab(100, {}), 100);
+  return seconds;
+}
 
 double writeRow(const Setup& setup) {
   return writeNumbers(setup, ROW_MAJOR, false);

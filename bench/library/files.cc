@@ -63,6 +63,18 @@ void writeSeries(const Setup& setup, const char* name, const Storage& storage) {
   closeFile(file);
 }
 
+/// A hundred doubles in a compressed file.
+void writeSmall(const Setup& setup) {
+  std::vector<double> data = measurements(100);
+  CDFid file = createFile(setup.file("small_gzip"));
+  long level = 6;
+  check(CDFlib(SELECT_, CDF_, file, PUT_, CDF_COMPRESSION_, GZIP_COMPRESSION, &level, NULL_));
+  const long variable = createVariable(file, {"series", CDF_REAL8});
+  Slab slab = wholeSlab(data.size(), {});
+  moveSlab(file, variable, slab, PUT_, data.data());
+  closeFile(file);
+}
+
 void writeTexts(const Setup& setup) {
   std::vector<char> data(setup.texts() * kTextLength + 1, 'a');
   data.back() = '\0';
@@ -94,6 +106,7 @@ double prepareFiles(const Setup& setup) {
   writeSeries(setup, "series", {});
   writeSeries(setup, "series_gzip", {.gzipLevel = 6});
   writeSeries(setup, "series_gzip_100", {.gzipLevel = 6, .blockingFactor = 100});
+  writeSmall(setup);
   writeTexts(setup);
   writeImages(setup);
   writeMetadata(setup);

@@ -9,6 +9,7 @@ int main(int argumentCount, char** arguments) {
       {"read_column_major", readColumn},
       {"read_gzip", readGzip},
       {"read_gzip_file", readGzipFile},
+      {"read_small_files", readSmallFiles},
       {"write", writeRow},
       {"write_column_major", writeColumn},
       {"write_gzip", writeGzip},

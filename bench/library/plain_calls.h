@@ -105,6 +105,7 @@ double readRow(const Setup& setup);
 double readColumn(const Setup& setup);
 double readGzip(const Setup& setup);
 double readGzipFile(const Setup& setup);
+double readSmallFiles(const Setup& setup);
 double writeRow(const Setup& setup);
 double writeColumn(const Setup& setup);
 double writeGzip(const Setup& setup);

@@ -8,6 +8,8 @@ int main(int argumentCount, char** arguments) {
       {"read_column_major", readColumn},
       {"read_gzip", readGzip},
       {"read_gzip_file", readGzipFile},
+      {"read_small_files", readSmallFiles},
+      {"read_small_files_keeping_memory", readSmallFilesKeepingMemory},
       {"read_checksum", readWithChecksum},
       {"write", writeRow},
       {"write_column_major", writeColumn},

@@ -49,6 +49,8 @@ double readRow(const Setup& setup);
 double readColumn(const Setup& setup);
 double readGzip(const Setup& setup);
 double readGzipFile(const Setup& setup);
+double readSmallFiles(const Setup& setup);
+double readSmallFilesKeepingMemory(const Setup& setup);
 double readWithChecksum(const Setup& setup);
 double readText(const Setup& setup);
 double readStrided(const Setup& setup);

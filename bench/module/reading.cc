@@ -33,6 +33,16 @@ double readGzip(const Setup& setup) {
 double readGzipFile(const Setup& setup) {
   return readNumbers(setup, "gzip_file.cdf");
 }
+double readSmallFiles(const Setup& setup) {
+  double seconds = 0;
+  for (std::size_t i = 0; i < setup.smallFiles(); ++i)
+    seconds += read(setup, "small_gzip.cdf", wholeSlab(100, {}));
+  return seconds;
+}
+double readSmallFilesKeepingMemory(const Setup& setup) {
+  ambrix::keepFreedMemory();
+  return readSmallFiles(setup);
+}
 double readWithChecksum(const Setup& setup) {
   return readNumbers(setup, "checksum.cdf");
 }

@@ -1,6 +1,7 @@
 // Limits on memory, and failures of allocation that tests ask for.
 #include <ambrix/embedded.h>
 #include <gtest/gtest.h>
+#include <sys/resource.h>
 
 #include <algorithm>
 #include <cstddef>
@@ -8,7 +9,9 @@
 #include <cstring>
 #include <functional>
 #include <limits>
+#include <memory>
 #include <string>
+#include <vector>
 
 #include "host/qvh.h"
 
@@ -150,5 +153,33 @@ TEST_F(EmbeddedMemoryTest, ACallThatRunsOutOfMemoryAtAnyPointLeavesNothing) {
   EXPECT_TRUE(ambrix::failurePending());
   EXPECT_EQ(module.leaks(), ambrix::LiveCounts{});
 }
+
+#ifdef __GLIBC__
+long pageFaults() {
+  rusage usage{};
+  getrusage(RUSAGE_SELF, &usage);
+  return usage.ru_minflt;
+}
+
+/// Takes as much in small pieces as the library does for a compressed file, and frees it.
+void takeAndFree() {
+  std::vector<std::unique_ptr<char[]>> pieces(200);
+  for (auto& piece : pieces) {
+    piece = std::make_unique<char[]>(10'000);
+  }
+}
+
+TEST_F(EmbeddedMemoryTest, FreedMemoryIsKeptWhereThatIsAskedFor) {
+#ifdef __SANITIZE_ADDRESS__
+  GTEST_SKIP() << "the sanitizer has an allocator of its own";
+#endif
+  ASSERT_TRUE(ambrix::keepFreedMemory());
+  takeAndFree();
+  const long before = pageFaults();
+  for (int i = 0; i < 20; ++i)
+    takeAndFree();
+  EXPECT_LT(pageFaults() - before, 20);
+}
+#endif
 
 }  // namespace

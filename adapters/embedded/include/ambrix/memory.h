@@ -23,6 +23,11 @@ AMBRIX_EXPORT LiveCounts liveCounts() noexcept;
 AMBRIX_EXPORT void setByteLimit(std::size_t bytes) noexcept;
 AMBRIX_EXPORT std::size_t byteLimit() noexcept;
 
+/// Has this process keep up to 16 MiB of what it frees, for good. By default the C library gives
+/// memory back to the system when a compressed file is closed, and takes as much again for the next
+/// one. Returns false where the C library knows no such setting.
+AMBRIX_EXPORT bool keepFreedMemory() noexcept;
+
 /// For tests: the n-th allocation from now fails, once, as if memory had run out; 0 takes it back.
 /// Small arrays, arrays over borrowed memory and scratch buffers are one allocation, larger arrays
 /// two.
