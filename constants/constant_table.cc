@@ -1,11 +1,15 @@
 #include "constants/constant_table.h"
 
+#include <algorithm>
 #include <boost/assign/list_of.hpp>
 #include <cctype>
 #include <cstddef>
+#include <string_view>
+#include <vector>
 
 #include "gateway/arguments.h"
 #include "gateway/errors.h"
+#include "gateway/extension.h"
 #include "gateway/raise_error.h"
 
 namespace TOLVEX::ambrix {
@@ -72,13 +76,34 @@ const std::map<std::string, double> ConstantNameTable =
     ("BACKWARDFILEOFF", 0)                                 //
     ("BACKWARDFILEON", 1);
 
+namespace {
+
+/// Those of the table and of the host's extension, in byte-wise order; each ends with a zero.
+std::vector<std::string_view> namesOfConstants() {
+  std::vector<std::string_view> names;
+  for (const auto& [name, value] : ConstantNameTable)
+    names.emplace_back(name);
+  for (const NamedConstant& added : extension().constants)
+    names.emplace(std::ranges::lower_bound(names, added.name), added.name);
+  return names;
+}
+
+double extendedConstant(const std::string& name) {
+  for (const NamedConstant& added : extension().constants) {
+    if (added.name == name) return added.value;
+  }
+  raiseError(cdflib::unrecognizedConstantName(name));
+}
+
+}  // namespace
+
 void getConstantNames(int, qvArray* outputs[], std::int32_t, const qvArray*[],
                       const CommandEntry*) {
-  qvArray* names = qvCreateCellMatrix(ConstantNameTable.size(), 1);
+  const std::vector<std::string_view> sorted = namesOfConstants();
+  qvArray* names = qvCreateCellMatrix(sorted.size(), 1);
   std::size_t row = 0;
-  for (const auto& [name, value] : ConstantNameTable) {
-    qvSetCell(names, row++, qvCreateString(name.c_str()));
-  }
+  for (const std::string_view name : sorted)
+    qvSetCell(names, row++, qvCreateString(name.data()));
   outputs[0] = names;
 }
 
@@ -88,8 +113,8 @@ void getConstantValue(int, qvArray* outputs[], std::int32_t, const qvArray* argu
   for (char& c : name)
     c = static_cast<char>(std::toupper(static_cast<unsigned char>(c)));
   const auto found = ConstantNameTable.find(name);
-  if (found == ConstantNameTable.end()) raiseError(cdflib::unrecognizedConstantName(name));
-  outputs[0] = qvCreateDoubleScalar(found->second);
+  const double value = found != ConstantNameTable.end() ? found->second : extendedConstant(name);
+  outputs[0] = qvCreateDoubleScalar(value);
 }
 
 }  // namespace TOLVEX::ambrix

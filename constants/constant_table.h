@@ -13,7 +13,7 @@ namespace TOLVEX::ambrix {
 /// loaded.
 extern const std::map<std::string, double> ConstantNameTable;
 
-/// "getConstantNames" (): a 57-by-1 cell array of the names.
+/// "getConstantNames" (): the names as a column of cells.
 void getConstantNames(int, qvArray* outputs[], std::int32_t, const qvArray* arguments[],
                       const CommandEntry*);
 

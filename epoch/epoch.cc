@@ -7,6 +7,7 @@
 #include <span>
 #include <vector>
 
+#include "epoch/time_components.h"
 #include "gateway/arguments.h"
 #include "gateway/errors.h"
 #include "gateway/raise_error.h"
@@ -16,16 +17,6 @@ namespace {
 
 constexpr std::size_t kEpochComponents = 7;
 constexpr std::size_t kEpoch16Components = 10;
-
-/// Number of groups; raises `badEpochVector` for a wrong number of elements and for a wrong class
-/// alike.
-std::size_t requireGroups(const qvArray* components, std::size_t size) {
-  const std::size_t elements = qvGetNumberOfElements(components);
-  if (elements % size != 0 || qvGetClassID(components) != qvDOUBLE_CLASS) {
-    raiseError(cdflib::badEpochVector(static_cast<std::int64_t>(size)));
-  }
-  return elements / size;
-}
 
 qvArray* createDoubles(const std::vector<std::size_t>& sizes) {
   return qvCreateUninitNumericArray(sizes.size(), sizes.data(), qvDOUBLE_CLASS, qvREAL);
@@ -37,19 +28,6 @@ double* doublesOf(qvArray* array) {
 
 const double* doublesOf(const qvArray* array) {
   return static_cast<const double*>(qvGetReadOnlyData(array));
-}
-
-std::span<const double> componentsOf(const qvArray* times) {
-  return {doublesOf(times), qvGetNumberOfElements(times)};
-}
-
-/// Reports an illegal time, unless a component is out of range in this or a later time: all
-/// components are converted before the first time is computed. `later` are the components that are
-/// not converted yet.
-void requireLegal(double epoch, std::span<const double> later) {
-  if (epoch != ILLEGAL_EPOCH_VALUE) return;
-  requireInRange(later);
-  raiseError(cdflib::illegalEpochValue());
 }
 
 /// 10, then the further dimensions of a 2-by-... input, else the number of pairs.
@@ -76,7 +54,7 @@ void computeEpoch(int, qvArray* outputs[], std::int32_t, const qvArray* argument
     long c[kEpochComponents];
     std::ranges::transform(components.first<kEpochComponents>(), c, truncateToLong);
     *epoch = computeEPOCH(c[0], c[1], c[2], c[3], c[4], c[5], c[6]);
-    requireLegal(*epoch, components);
+    if (*epoch == ILLEGAL_EPOCH_VALUE) raiseIllegalTime(components);
   }
   outputs[0] = epochs;
 }
@@ -90,8 +68,9 @@ void computeEpoch16(int, qvArray* outputs[], std::int32_t, const qvArray* argume
   for (; !components.empty(); components = components.subspan(kEpoch16Components), epoch += 2) {
     long c[kEpoch16Components];
     std::ranges::transform(components.first<kEpoch16Components>(), c, truncateToLong);
-    requireLegal(computeEPOCH16(c[0], c[1], c[2], c[3], c[4], c[5], c[6], c[7], c[8], c[9], epoch),
-                 components);
+    const double status =
+        computeEPOCH16(c[0], c[1], c[2], c[3], c[4], c[5], c[6], c[7], c[8], c[9], epoch);
+    if (status == ILLEGAL_EPOCH_VALUE) raiseIllegalTime(components);
   }
   outputs[0] = epochs;
 }

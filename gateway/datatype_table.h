@@ -1,5 +1,5 @@
 // The table of CDF datatypes: all that the module knows of each. A code that is not in it, also one
-// that the library knows (8, 33), is not supported.
+// that the library knows (8, 33), is not supported unless the host offers extended datatypes.
 #pragma once
 
 #include <cdf.h>
@@ -48,10 +48,14 @@ inline constexpr auto kDatatypeOfCode = [] {
   return rows;
 }();
 
+/// The row of a datatype that only the host's extension has, or null.
+const Datatype* findExtendedDatatype(long code);
+
 /// The row of the datatype, or null if it is not supported.
 inline const Datatype* findDatatype(long code) {
   const auto index = static_cast<std::size_t>(code);  // a negative code becomes a large one
-  return index < kDatatypeOfCode.size() ? kDatatypeOfCode[index] : nullptr;
+  const Datatype* row = index < kDatatypeOfCode.size() ? kDatatypeOfCode[index] : nullptr;
+  return row != nullptr ? row : findExtendedDatatype(code);
 }
 
 /// Whether values of the datatype are texts.

@@ -102,6 +102,12 @@ char* qvArrayToString(const qvArray* array);
 /// `qvFree`; null when a character has no narrow form.
 char* qvUtf16ToNarrow(const char16_t* text, std::size_t length);
 
+// --- Extended datatypes ---------------------------------------------------------------------
+
+/// Whether the call under way may use the datatypes and commands of docs/extended.md. A host need
+/// not have this function; without it they do not exist.
+[[gnu::weak]] bool qvOffersExtendedDatatypes();
+
 // --- Messages -------------------------------------------------------------------------------
 
 /// Raises the error; does not return.

@@ -1,5 +1,6 @@
 #include "adapters/common/call_frame.h"
 
+#include "adapters/common/exported_interface.h"
 #include "adapters/common/scratch.h"
 
 namespace ambrix {
@@ -9,7 +10,7 @@ thread_local CallFrame* innermost = nullptr;
 
 }  // namespace
 
-CallFrame::CallFrame() noexcept : outer_(innermost) {
+CallFrame::CallFrame(bool extended) noexcept : outer_(innermost), extended_(extended) {
   innermost = this;
 }
 
@@ -24,3 +25,8 @@ CallFrame* CallFrame::current() noexcept {
 }
 
 }  // namespace ambrix
+
+bool qvOffersExtendedDatatypes() {
+  const ambrix::CallFrame* const frame = ambrix::CallFrame::current();
+  return frame != nullptr && frame->isExtended();
+}

@@ -11,7 +11,8 @@ namespace ambrix {
 /// is left in the end is freed. Frames nest when a warning leads to another call.
 class CallFrame {
  public:
-  CallFrame() noexcept;
+  /// `extended`: whether the call may use the extended datatypes.
+  explicit CallFrame(bool extended = false) noexcept;
   CallFrame(const CallFrame&) = delete;
   CallFrame& operator=(const CallFrame&) = delete;
   ~CallFrame();
@@ -19,6 +20,7 @@ class CallFrame {
   /// The innermost frame of this thread; null outside any call.
   static CallFrame* current() noexcept;
 
+  [[nodiscard]] bool isExtended() const noexcept { return extended_; }
   void trackArray(Tracked& array) noexcept { arrays_.push_back(array); }
   void trackScratch(Tracked& buffer) noexcept { scratch_.push_back(buffer); }
 
@@ -27,6 +29,7 @@ class CallFrame {
 
  private:
   CallFrame* outer_;
+  bool extended_;
   TrackedList arrays_;
   TrackedList scratch_;
 };

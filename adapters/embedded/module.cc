@@ -166,6 +166,14 @@ const std::vector<MessageId>& Module::lastWarnings() const noexcept {
   return state_ ? state_->record.warnings : kNone;
 }
 
+void Module::setExtended(bool extended) {
+  if (state_) state_->record.extended = extended;
+}
+
+bool Module::extended() const noexcept {
+  return state_ && state_->record.extended;
+}
+
 LiveCounts Module::leaks() const noexcept {
   return state_ ? state_->leaks : LiveCounts{};
 }

@@ -17,13 +17,17 @@ struct ModuleRecord {
   std::function<void(const MessageId&)> warningHandler;
   std::vector<MessageId> warnings;  // those that no handler has taken
   bool unloading = false;
-  int depth = 0;  // calls under way
+  bool extended = false;  // whether its calls may use the extended datatypes
+  int depth = 0;          // calls under way
 };
 
 /// Every frame of this host is one of these.
 class ModuleFrame : public CallFrame {
  public:
-  explicit ModuleFrame(ModuleRecord& record) noexcept : record_(record) { ++record_.depth; }
+  explicit ModuleFrame(ModuleRecord& record) noexcept
+      : CallFrame(record.extended), record_(record) {
+    ++record_.depth;
+  }
   ~ModuleFrame() { --record_.depth; }
 
   /// The module that this thread is in; null outside any call.

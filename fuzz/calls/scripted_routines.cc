@@ -2,6 +2,7 @@
 #include <cdf.h>
 
 #include <algorithm>
+#include <cstdarg>
 #include <cstring>
 #include <initializer_list>
 #include <string>
@@ -153,6 +154,20 @@ void EPOCH16breakdown(double* epoch, long* year, long* month, long* day, long* h
   for (long* part :
        {year, month, day, hour, minute, second, millisecond, microsecond, nanosecond, picosecond})
     *part = number("EPOCH16breakdown");
+}
+
+long long computeTT2000(double, double, double, ...) {
+  return number("computeTT2000");
+}
+
+void breakdownTT2000(long long, double* year, double* month, double* day, ...) {
+  for (double* part : {year, month, day})
+    *part = static_cast<double>(number("breakdownTT2000"));
+  va_list rest;
+  va_start(rest, day);
+  for (int i = 0; i < 6; ++i)
+    *va_arg(rest, double*) = static_cast<double>(number("breakdownTT2000"));
+  va_end(rest);
 }
 
 }  // extern "C"

@@ -17,6 +17,7 @@
 #include "file/library_modes.h"
 #include "file/read_only_mode.h"
 #include "gateway/errors.h"
+#include "gateway/extension.h"
 #include "gateway/raise_error.h"
 #include "variables/pad_values.h"
 #include "variables/read_data.h"
@@ -132,6 +133,14 @@ constexpr auto kNames = [] {
   return names;
 }();
 
+/// Raises `invalidOperation` unless the host's extension has the command.
+const CommandEntry& extendedCommand(std::string_view name) {
+  for (const CommandEntry& entry : extension().commands) {
+    if (entry.name == name) return entry;
+  }
+  raiseError(cdflib::invalidOperation(std::string(name)));
+}
+
 }  // namespace
 
 std::span<const CommandEntry> commandTable() {
@@ -140,8 +149,8 @@ std::span<const CommandEntry> commandTable() {
 
 const CommandEntry& lookupCommand(std::string_view name, std::int32_t argumentCount) {
   const auto found = std::ranges::find(kNames, name);
-  if (found == kNames.end()) raiseError(cdflib::invalidOperation(std::string(name)));
-  const CommandEntry& entry = CommandTable[found - kNames.begin()];
+  const CommandEntry& entry =
+      found != kNames.end() ? CommandTable[found - kNames.begin()] : extendedCommand(name);
   const bool suits =
       argumentCount >= entry.minimumArguments && argumentCount <= entry.maximumArguments;
   if (!suits) raiseError(validate::wrongNumberOfInputs());

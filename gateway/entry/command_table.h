@@ -12,8 +12,8 @@ namespace TOLVEX::ambrix {
 /// All 91 rows, in table order.
 std::span<const CommandEntry> commandTable();
 
-/// The row of exactly this name, if the number of arguments after the name suits it; else raises
-/// `invalidOperation` or `wrongNumberOfInputs`.
+/// The row of exactly this name, also one of the host's extension, if the number of arguments after
+/// the name suits it; else raises `invalidOperation` or `wrongNumberOfInputs`.
 const CommandEntry& lookupCommand(std::string_view name, std::int32_t argumentCount);
 
 }  // namespace TOLVEX::ambrix

@@ -21,6 +21,7 @@ MAY_SEE = {
     "attributes": {"host", "gateway", "constants", "variables", "attributes"},
     "file": {"host", "gateway", "constants", "file"},
     "epoch": {"host", "gateway", "epoch"},
+    "extended": {"host", "gateway", "epoch", "extended"},
     "gateway/entry": {"host", "gateway", "constants", "variables", "attributes", "file", "epoch",
                       "gateway/entry"},
     "inflate": {"inflate"},

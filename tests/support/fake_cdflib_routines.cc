@@ -1,6 +1,7 @@
 // The routines of the stand-in beside CDFlib.
 #include <cdf.h>
 
+#include <cstdarg>
 #include <cstdint>
 #include <initializer_list>
 #include <sstream>
@@ -170,6 +171,31 @@ void EPOCH16breakdown(double* epoch, long* year, long* month, long* day, long* h
   breakDown("EPOCH16breakdown", {year, month, day, hour, minute, second, millisecond, microsecond,
                                  nanosecond, picosecond});
   fakeCdflib().finish(epochText("EPOCH16breakdown", {epoch[0], epoch[1]}));
+}
+
+// The rest of the components is read as the library reads them: six of the same kind.
+long long computeTT2000(double year, double month, double day, ...) {
+  std::ostringstream text;
+  text << "computeTT2000 " << year << ' ' << month << ' ' << day;
+  va_list rest;
+  va_start(rest, day);
+  for (int i = 0; i < 6; ++i)
+    text << ' ' << va_arg(rest, double);
+  va_end(rest);
+  fakeCdflib().finish(text.str());
+  return fakeCdflib().number("computeTT2000");
+}
+
+void breakdownTT2000(long long time, double* year, double* month, double* day, ...) {
+  std::size_t next = 0;
+  for (double* component : {year, month, day})
+    *component = static_cast<double>(fakeCdflib().number("breakdownTT2000", next++));
+  va_list rest;
+  va_start(rest, day);
+  for (int i = 0; i < 6; ++i)
+    *va_arg(rest, double*) = static_cast<double>(fakeCdflib().number("breakdownTT2000", next++));
+  va_end(rest);
+  fakeCdflib().finish("breakdownTT2000 " + std::to_string(time));
 }
 
 }  // extern "C"

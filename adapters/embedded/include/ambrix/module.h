@@ -69,6 +69,11 @@ class AMBRIX_EXPORT Module {
   /// The warnings of the last call, failed or not, or of unloading, that no handler has taken.
   [[nodiscard]] const std::vector<MessageId>& lastWarnings() const noexcept;
 
+  /// Whether calls from now on may use the extended datatypes, CDF_INT8 and CDF_TIME_TT2000, and
+  /// their commands. Off in a new module.
+  void setExtended(bool extended);
+  [[nodiscard]] bool extended() const noexcept;
+
   /// What successful calls have left behind until now: always none for a module without leaks.
   [[nodiscard]] LiveCounts leaks() const noexcept;
 
