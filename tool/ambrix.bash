@@ -7,9 +7,9 @@ _ambrix() {
     [info]="--attributes --json --time-limit --memory-limit --help"
     [dump]="--records --format --output --defuse-formulas --time-limit --memory-limit --help"
     [check]="--json --quiet --time-limit --memory-limit --help"
-    [call]="--file --help"
+    [call]="--file --extended --help"
     [convert]="--compression --majority --checksum --skip-unsupported --time-limit --memory-limit --help"
-    [session]="--max-array-bytes --max-line-bytes --help"
+    [session]="--extended --max-array-bytes --max-line-bytes --help"
   )
   declare -A values=(
     [--format]="table csv json"

@@ -41,6 +41,7 @@ std::vector<Array> callOnFile(File file, const std::string& command,
 
 void runCall(Module& module, const CallOptions& options, StandardOutput& output) {
   if (options.words.empty()) throw UsageError("call: which command?");
+  module.setExtended(options.extended);
   const std::string& command = options.words.front();
   const std::vector<Array> arguments = readWords(std::span(options.words).subspan(1));
   const std::vector<Array> results =

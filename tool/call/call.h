@@ -11,6 +11,7 @@ namespace ambrix::tool {
 
 struct CallOptions {
   std::string file;
+  bool extended = false;
   std::vector<std::string> words;  // the command and its arguments
 };
 

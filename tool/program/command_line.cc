@@ -140,17 +140,24 @@ void addConvert(CLI::App& app, Arguments& arguments) {
   addLimits(convert, arguments);
 }
 
+void addExtended(CLI::App& command, bool& extended) {
+  command.add_flag("--extended", extended,
+                   "Support CDF_INT8 and CDF_TIME_TT2000, too\n(docs/extended.md)");
+}
+
 void addCall(CLI::App& app, Arguments& arguments) {
   CLI::App& call = addCommand(app, kCallHelp);
   call.add_option("--file", arguments.call.file,
                   "Open this file, pass it as the first argument, and\nclose it afterwards")
       ->type_name("FILE");
+  addExtended(call, arguments.call.extended);
   call.prefix_command();  // what follows may begin with a minus sign
   call.callback([&call, &arguments] { arguments.call.words = call.remaining(); });
 }
 
 void addSession(CLI::App& app, Arguments& arguments) {
   CLI::App& session = addCommand(app, kSessionHelp);
+  addExtended(session, arguments.session.extended);
   addBytes(session, "--max-array-bytes", arguments.session.arrayBytes,
            "The most bytes one array or scratch buffer may take\n(default: 4 GiB)");
   addBytes(session, "--max-line-bytes", arguments.session.lineBytes,

@@ -23,7 +23,7 @@ struct Arguments {
   DumpOptions dump;
   InfoOptions info;
   Limits limits;
-  SessionLimits session;
+  SessionOptions session;
   bool version = false;
   bool manual = false;
 };

@@ -61,7 +61,7 @@ inline constexpr HelpText kCheckHelp = {
     "  ambrix check --json data.cdf | jq '.[].problems'\n"};
 
 inline constexpr HelpText kCallHelp = {
-    "call", "[--file FILE] COMMAND [ARGUMENT...]",
+    "call", "[--file FILE] [--extended] COMMAND [ARGUMENT...]",
     "Calls one command of the module, with JSON results",
     "Arguments are JSON: numbers, true, false, null, lists of numbers or logicals,\n"
     "and arrays as {\"class\":..., \"size\":[...], \"data\":[...]}. Whatever is not JSON\n"
@@ -73,8 +73,7 @@ inline constexpr HelpText kCallHelp = {
     "  ambrix call --file data.cdf renameVar 0 Epoch\n"};
 
 inline constexpr HelpText kSessionHelp = {
-    "session", "[--max-array-bytes BYTES] [--max-line-bytes BYTES]",
-    "Answers calls of the module through a pipe",
+    "session", "[OPTION...]", "Answers calls of the module through a pipe",
     "Each line of standard input is a request. Each line of standard output is its\n"
     "answer. Both are JSON. docs/session-protocol.md describes them.\n",
     "  printf '{\"command\":\"getLibraryVersion\"}\\n' | ambrix session\n"};

@@ -93,13 +93,14 @@ std::string answerRequest(Module& module, std::string_view line) {
   return answer += "}\n";
 }
 
-void runSession(const SessionLimits& limits, StandardOutput& output) {
+void runSession(const SessionOptions& options, StandardOutput& output) {
   Module module;
-  setByteLimit(limits.arrayBytes);
+  module.setExtended(options.extended);
+  setByteLimit(options.arrayBytes);
   std::ios::sync_with_stdio(false);
   Line line;
-  while (readLine(std::cin, limits.lineBytes, line)) {
-    output.write(line.whole ? answerRequest(module, line.text) : refuseLine(limits.lineBytes));
+  while (readLine(std::cin, options.lineBytes, line)) {
+    output.write(line.whole ? answerRequest(module, line.text) : refuseLine(options.lineBytes));
     output.flush();
   }
   module.unload();
