@@ -26,14 +26,16 @@ octave_value_list takeResults(const Slots& slots, int nargout) {
   return results;
 }
 
-/// Whether a function of the package gives up a file of its own. No command has such a name.
+// What else the functions of the package ask for has names that no command has.
+
+/// Whether a function gives up a file of its own.
 bool givesUpFile(const octave_value_list& args) {
   return args.length() == 2 && args(0).is_string() && args(0).string_value() == "-abandon" &&
          args(1).is_uint64_type();
 }
 
-octave_value_list callModule(const octave_value_list& args, int nargout) {
-  const CallFrame frame;
+octave_value_list callModule(const octave_value_list& args, int nargout, bool extended) {
+  const CallFrame frame(extended);
   std::vector<qvArray> arguments;
   std::vector<const qvArray*> inputs;
   arguments.reserve(static_cast<std::size_t>(args.length()));
@@ -43,6 +45,29 @@ octave_value_list callModule(const octave_value_list& args, int nargout) {
   Slots slots{};
   qvhFunction(nargout, slots.data(), static_cast<int>(inputs.size()), inputs.data());
   return takeResults(slots, nargout);
+}
+
+/// Whether every call may use the extended datatypes.
+bool allExtended = false;
+
+bool concernsExtension(const octave_value_list& args) {
+  return args(0).is_string() && args(0).string_value() == "-extended";
+}
+
+/// ("-extended") tells whether every call may use the extended datatypes, ("-extended", logical)
+/// sets it, and ("-extended", command, arguments...) is a call that may.
+octave_value_list useExtension(const octave_value_list& args, int nargout) {
+  if (args.length() == 1) return octave_value(allExtended);
+  if (!args(1).is_bool_scalar()) return callModule(args.slice(1, args.length() - 1), nargout, true);
+  allExtended = args(1).bool_value();
+  return {};
+}
+
+octave_value_list run(const octave_value_list& args, int nargout) {
+  if (concernsExtension(args)) return useExtension(args, nargout);
+  if (!givesUpFile(args)) return callModule(args, nargout, allExtended);
+  qvhAbandonFile(args(1).uint64_scalar_value().value());
+  return {};
 }
 
 }  // namespace
@@ -56,11 +81,7 @@ DEFUN_DLD(__ambrix__, args, nargout,
   if (args.length() == 0) print_usage();
   // Octave knows how to go on after exceptions of its own; any other would end the process.
   try {
-    if (givesUpFile(args)) {
-      qvhAbandonFile(args(1).uint64_scalar_value().value());
-      return {};
-    }
-    return callModule(args, nargout);
+    return run(args, nargout);
   } catch (const octave::execution_exception&) {
     throw;
   } catch (const octave::interrupt_exception&) {

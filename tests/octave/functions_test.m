@@ -11,7 +11,8 @@ endfunction
 function names = expectedFunctions (commands)
   names = cellfun (@(command) ["ambrix_" command.name], commands, "UniformOutput", false);
   names = sort ([names; {"ambrix"; "ambrix_info"; "ambrix_read"; "ambrix_write"; "ambrix_plot"; ...
-                        "ambrix_check"}]);
+                        "ambrix_check"; "ambrix_extended"; "ambrix_computeTT2000"; ...
+                        "ambrix_tt2000Breakdown"}]);
 endfunction
 
 function commands = table ()
