@@ -11,6 +11,10 @@ qvArray* ambrix::makeInCall(qvClassID classId, std::span<const std::size_t> size
   return array;
 }
 
+void ambrix::reclaimArray(Tracked& array) noexcept {
+  destroyArray(static_cast<qvArray*>(&array));
+}
+
 namespace {
 
 bool isCell(const qvArray* array) {

@@ -10,7 +10,6 @@
 #include <type_traits>
 #include <utility>
 
-#include "adapters/common/call_frame.h"
 #include "adapters/common/shape.h"
 #include "adapters/embedded/allocation.h"
 #include "ambrix/visit.h"
@@ -140,10 +139,6 @@ void destroyArray(qvArray* array) noexcept {
     }
     destroyWithoutCells(next);
   }
-}
-
-void reclaimArray(Tracked& array) noexcept {
-  destroyArray(static_cast<qvArray*>(&array));
 }
 
 }  // namespace ambrix
