@@ -42,6 +42,27 @@ class DumpTest(ToolCase):
         self.assertEqual(lines[3].split(), ["1", "0", "1", "0", "26"])
         self.assertEqual(len(lines), 25)
 
+    def test_numbers_have_the_digits_that_tell_them_apart(self):
+        numbers = {"double": [0.0, -0.0, 0.1, 1e15, 1e16, 123456789012345680, 1e-4, 1e-5, 1e300,
+                              5e-324, 1.7976931348623157e308, float("nan"), float("-inf")],
+                   "single": [0.1, 16777216, 1e16, 3.4028235e38, 1e-45]}
+        texts = {"double": ["0", "-0", "0.1", "1000000000000000", "1e+16", "1.2345678901234568e+17",
+                            "0.0001", "1e-05", "1e+300", "5e-324", "1.7976931348623157e+308",
+                            "NaN", "-Inf"],
+                 "single": ["0.1", "16777216", "1e+16", "3.4028235e+38", "1e-45"]}
+        session = self.session()
+        (file,) = session.call("create", "numbers")
+        for number, (class_name, values) in enumerate(numbers.items()):
+            session.call("createVar", file, class_name, (45, 44)[number], 1, [], True, [])
+            session.call("hyperPutVarData", file, number, 0, len(values), 1, [], [], [],
+                         array(class_name, values, [1, len(values)]))
+        session.call("close", file)
+        for name, expected in texts.items():
+            for form, told in (("table", [f"{i:6}  {x}" for i, x in enumerate(expected)]),
+                               ("csv", [f"{i},{x}" for i, x in enumerate(expected)])):
+                lines = self.output("dump", "numbers.cdf", name, "--format", form).splitlines()
+                self.assertEqual(lines[1:], told)
+
     def test_csv(self):
         rows = self.rows("texts")
         self.assertEqual(rows[0], ["record", "i1", "i2", "texts"])

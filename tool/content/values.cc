@@ -1,11 +1,13 @@
 #include "tool/content/values.h"
 
+#include <fmt/compile.h>
 #include <fmt/format.h>
 
+#include <array>
 #include <cmath>
 #include <span>
 #include <stdexcept>
-#include <utility>
+#include <type_traits>
 
 #include "ambrix/texts.h"
 #include "ambrix/times.h"
@@ -15,60 +17,74 @@
 namespace ambrix::tool {
 namespace {
 
+using Sink = std::function<void(const ValueView&)>;
+
 template <typename T>
-ValueText formatNumber(T value) {
+void formatNumber(T value, const Sink& sink) {
   if constexpr (std::is_floating_point_v<T>) {
-    if (std::isnan(value)) return {"NaN", true};
-    if (std::isinf(value)) return {value > 0 ? "Inf" : "-Inf", true};
-    return {fmt::format("{}", value), false};
-  } else {
-    return {fmt::format("{}", static_cast<std::int64_t>(value)), false};
+    if (std::isnan(value)) return sink({"NaN", true});
+    if (std::isinf(value)) return sink({value > 0 ? "Inf" : "-Inf", true});
   }
+  std::array<char, 32> room;
+  using Printed = std::conditional_t<std::is_floating_point_v<T>, T, std::int64_t>;
+  const char* const end =
+      fmt::format_to(room.data(), FMT_COMPILE("{}"), static_cast<Printed>(value));
+  sink({{room.data(), static_cast<std::size_t>(end - room.data())}, false});
 }
 
 template <typename T>
-std::vector<ValueText> formatNumbers(std::span<const T> values) {
-  std::vector<ValueText> texts;
-  texts.reserve(values.size());
+void formatNumbers(std::span<const T> values, const Sink& sink) {
   for (const T value : values)
-    texts.push_back(formatNumber(value));
-  return texts;
+    formatNumber(value, sink);
+}
+
+void formatNumbers(ArrayView cells, const Sink& /*sink*/) {
+  throw std::logic_error(std::string("no value is of class ") + cells.className());
 }
 
 /// What is no time is written as the numbers that it consists of.
-ValueText formatNoTime(std::span<const double> value) {
-  if (value.size() == 1) return formatNumber(value.front());
-  return {formatNumber(value[0]).text + ' ' + formatNumber(value[1]).text, true};
-}
-
-std::vector<ValueText> formatTimes(Module& module, ArrayView array, Datatype datatype) {
-  const std::size_t elements = elementsPerValue(datatype, 1);
-  std::vector<ValueText> values;
-  for (std::string& text : timesAsText(module, array, datatype)) {
-    const auto own = array.data<double>().subspan(elements * values.size(), elements);
-    values.push_back(text.empty() ? formatNoTime(own) : ValueText{std::move(text), true});
+void formatNoTime(std::span<const double> value, const Sink& sink) {
+  if (value.size() == 1) return formatNumber(value.front(), sink);
+  std::string numbers;
+  for (const double number : value) {
+    if (!numbers.empty()) numbers += ' ';
+    formatNumber(number, [&](const ValueView& text) { numbers += text.text; });
   }
-  return values;
+  sink({numbers, true});
 }
 
-std::vector<ValueText> formatTexts(ArrayView array, std::size_t length) {
-  std::vector<ValueText> values;
-  for (std::string& text : textsOf(array, length))
-    values.push_back({std::move(text), true});
-  return values;
-}
-
-std::vector<ValueText> formatNumbers(ArrayView cells) {
-  throw std::logic_error(std::string("no value is of class ") + cells.className());
+void formatTimes(Module& module, ArrayView array, Datatype datatype, const Sink& sink) {
+  const std::size_t elements = elementsPerValue(datatype, 1);
+  auto numbers = array.data<double>();
+  for (const std::string& text : timesAsText(module, array, datatype)) {
+    if (text.empty()) {
+      formatNoTime(numbers.first(elements), sink);
+    } else {
+      sink({text, true});
+    }
+    numbers = numbers.subspan(elements);
+  }
 }
 
 }  // namespace
 
+void eachValue(Module& module, ArrayView array, Datatype datatype, std::size_t elements,
+               const Sink& sink) {
+  if (isTimeType(datatype)) return formatTimes(module, array, datatype, sink);
+  if (!isCharacterType(datatype)) {
+    return visit(array, [&](auto numbers) { formatNumbers(numbers, sink); });
+  }
+  for (const std::string& text : textsOf(array, elements))
+    sink({text, true});
+}
+
 std::vector<ValueText> formatValues(Module& module, ArrayView array, Datatype datatype,
                                     std::size_t elements) {
-  if (isCharacterType(datatype)) return formatTexts(array, elements);
-  if (isTimeType(datatype)) return formatTimes(module, array, datatype);
-  return visit(array, [](auto numbers) { return formatNumbers(numbers); });
+  std::vector<ValueText> values;
+  eachValue(module, array, datatype, elements, [&](const ValueView& value) {
+    values.push_back({std::string(value.text), value.isText});
+  });
+  return values;
 }
 
 std::string joinValues(const std::vector<ValueText>& values) {

@@ -2,7 +2,9 @@
 #pragma once
 
 #include <cstddef>
+#include <functional>
 #include <string>
+#include <string_view>
 #include <vector>
 
 #include "ambrix/datatype.h"
@@ -16,8 +18,18 @@ struct ValueText {
   bool isText = false;
 };
 
-/// The values in an array that the module has read. Times become ISO 8601; numbers are written
-/// with as many digits as tell them apart. `elements` is the number of characters in a text.
+/// The same for as long as it is looked at.
+struct ValueView {
+  std::string_view text;
+  bool isText = false;
+};
+
+/// Gives the values in an array that the module has read to `sink`, one after the other. Times
+/// become ISO 8601; numbers are written with as many digits as tell them apart. `elements` is the
+/// number of characters in a text.
+void eachValue(Module& module, ArrayView array, Datatype datatype, std::size_t elements,
+               const std::function<void(const ValueView&)>& sink);
+/// All of them.
 std::vector<ValueText> formatValues(Module& module, ArrayView array, Datatype datatype,
                                     std::size_t elements);
 

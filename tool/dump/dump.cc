@@ -83,13 +83,19 @@ class IndexCounter {
   std::size_t record_;
 };
 
-void printSlab(const Slab& slab, const std::vector<ValueText>& values, DumpFormat& format,
-               StandardOutput& output) {
+void printSlab(Module& module, ArrayView data, const Variable& variable, const Slab& slab,
+               DumpFormat& format, StandardOutput& output) {
+  constexpr std::size_t kWrittenTogether = 1 << 16;
   IndexCounter counter(slab);
-  for (const ValueText& value : values) {
-    output.write(format.value(counter.record(), counter.indices(), value));
+  std::string text;
+  eachValue(module, data, variable.datatype, variable.elements, [&](const ValueView& value) {
+    format.append(text, counter.record(), counter.indices(), value);
     counter.advance();
-  }
+    if (text.size() < kWrittenTogether) return;
+    output.write(text);
+    text.clear();
+  });
+  output.write(text);
 }
 
 /// "csv" of "x.csv"; empty where there is none.
@@ -130,8 +136,7 @@ void runDump(Module& module, const DumpOptions& options, StandardOutput& output)
   output.write(format->begin());
   while (const auto slab = plan.next()) {
     const Array data = file.read(variable, *slab);
-    const auto values = formatValues(module, data, variable.datatype, variable.elements);
-    printSlab(*slab, values, *format, output);
+    printSlab(module, data, variable, *slab, *format, output);
     progress.advance(data.elementCount());
   }
   output.write(format->end());

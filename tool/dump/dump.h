@@ -33,9 +33,9 @@ class DumpFormat {
  public:
   virtual ~DumpFormat() = default;
   virtual std::string begin() { return {}; }
-  /// One value. `indices` are those within the record.
-  virtual std::string value(std::size_t record, const std::vector<std::size_t>& indices,
-                            const ValueText& value) = 0;
+  /// Appends one value to the text. `indices` are those within the record.
+  virtual void append(std::string& text, std::size_t record,
+                      const std::vector<std::size_t>& indices, const ValueView& value) = 0;
   virtual std::string end() { return {}; }
 };
 

@@ -28,16 +28,20 @@ class JsonFormat : public DumpFormat {
   }
 
   /// Opens a list for each dimension that begins with the value, and closes those that end.
-  std::string value(std::size_t record, const std::vector<std::size_t>& indices,
-                    const ValueText& value) override {
+  void append(std::string& json, std::size_t record, const std::vector<std::size_t>& indices,
+              const ValueView& value) override {
     const std::size_t opening = leading(indices, [](std::size_t, std::size_t i) { return i == 0; });
     const std::size_t closing =
         leading(indices, [](std::size_t size, std::size_t i) { return i + 1 == size; });
-    std::string json = record == range_.first && opening == indices.size() ? "" : ",";
+    if (record != range_.first || opening != indices.size()) json += ',';
     if (opening == indices.size()) json += "\n    ";
     json.append(opening, '[');
-    json += value.isText ? asJsonText(value.text) : value.text;
-    return json.append(closing, ']');
+    if (value.isText) {
+      appendMessage(json, value.text);
+    } else {
+      json += value.text;
+    }
+    json.append(closing, ']');
   }
 
   std::string end() override { return "\n  ]\n}\n"; }

@@ -12,6 +12,18 @@ std::size_t digits(std::size_t largest) {
   return fmt::formatted_size("{}", largest);
 }
 
+void appendCount(std::string& text, std::size_t count) {
+  const fmt::format_int digits(count);
+  text.append(digits.data(), digits.size());
+}
+
+/// The count with blanks before it.
+void appendRight(std::string& text, std::size_t count, std::size_t width) {
+  const fmt::format_int digits(count);
+  text.append(width - std::min(width, digits.size()), ' ');
+  text.append(digits.data(), digits.size());
+}
+
 class TableFormat : public DumpFormat {
  public:
   TableFormat(const Variable& variable, const RecordRange& range, bool terminal)
@@ -28,12 +40,20 @@ class TableFormat : public DumpFormat {
     return style_.bold(heading + "  " + printable(variable_.name)) + '\n';
   }
 
-  std::string value(std::size_t record, const std::vector<std::size_t>& indices,
-                    const ValueText& value) override {
-    std::string line = fmt::format("{:>{}}", record, widths_[0]);
-    for (std::size_t i = 0; i < indices.size(); ++i)
-      line += fmt::format("  {:>{}}", indices[i], widths_[i + 1]);
-    return line + "  " + (value.isText ? printable(trimmed(value.text)) : value.text) + '\n';
+  void append(std::string& line, std::size_t record, const std::vector<std::size_t>& indices,
+              const ValueView& value) override {
+    appendRight(line, record, widths_[0]);
+    for (std::size_t i = 0; i < indices.size(); ++i) {
+      line += "  ";
+      appendRight(line, indices[i], widths_[i + 1]);
+    }
+    line += "  ";
+    if (value.isText) {
+      line += printable(trimmed(value.text));
+    } else {
+      line += value.text;
+    }
+    line += '\n';
   }
 
  private:
@@ -66,13 +86,20 @@ class CsvFormat : public DumpFormat {
     return heading + ',' + textCell(variable_.name) + '\n';
   }
 
-  std::string value(std::size_t record, const std::vector<std::size_t>& indices,
-                    const ValueText& value) override {
-    std::string line = fmt::format("{}", record);
-    for (const std::size_t index : indices)
-      line += fmt::format(",{}", index);
-    const bool isText = isCharacterType(variable_.datatype);
-    return line + ',' + (isText ? textCell(trimmed(value.text)) : csvCell(value.text)) + '\n';
+  void append(std::string& line, std::size_t record, const std::vector<std::size_t>& indices,
+              const ValueView& value) override {
+    appendCount(line, record);
+    for (const std::size_t index : indices) {
+      line += ',';
+      appendCount(line, index);
+    }
+    line += ',';
+    if (isCharacterType(variable_.datatype)) {
+      line += textCell(trimmed(value.text));
+    } else {
+      line += value.text;
+    }
+    line += '\n';
   }
 
  private:
