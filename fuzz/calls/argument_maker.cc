@@ -31,8 +31,9 @@ const Numbers kNumbersByKind[] = {
 
 constexpr const char* kFileNames[] = {"f0", "f1", "f2", "f3.cdf", "long-name-of-a-file"};
 constexpr const char* kOddFileNames[] = {"missing", "", ".", "empty", "text.cdf", "nofolder/f"};
-constexpr const char* kConstants[] = {"VARY",       "CDF_INT4",         "cdf_epoch16",
-                                      "READONLYon", "GZIP_COMPRESSION", "RLE_OF_ZEROs"};
+constexpr const char* kConstants[] = {"VARY",           "CDF_INT4",         "cdf_epoch16",
+                                      "READONLYon",     "GZIP_COMPRESSION", "RLE_OF_ZEROs",
+                                      "CDF_TIME_TT2000"};
 
 std::string numbered(const char* stem, std::size_t number) {
   return stem + std::to_string(number);
@@ -97,6 +98,8 @@ ArgumentMaker::Maker ArgumentMaker::makerOf(std::string_view kind) {
       {"parameter", &M::compressionParameter},
       {"components", &M::timeComponents},
       {"components16", &M::time16Components},
+      {"components9", &M::timeTt2000Components},
+      {"nanoseconds", &M::timesTt2000},
       {"epochs", &M::times},
       {"epochs16", &M::times16},
   };
@@ -142,7 +145,7 @@ Array ArgumentMaker::attribute() {
 }
 
 Array ArgumentMaker::datatype() {
-  datatype_ = choices_.pick(kDatatypeCodes);
+  datatype_ = anyDatatype(choices_);
   return Array::scalar(static_cast<double>(datatype_));
 }
 

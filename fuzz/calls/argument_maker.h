@@ -52,6 +52,8 @@ class ArgumentMaker {
   Array time16Components();
   Array times();
   Array times16();
+  Array timeTt2000Components();
+  Array timesTt2000();
 
   std::size_t valueElements() const;
   Array variableData(std::size_t values);

@@ -37,6 +37,12 @@ std::size_t sizeOf(const Variable& variable, std::size_t dimension) {
   return static_cast<std::size_t>(std::clamp(variable.sizes[dimension], 1L, 256L));
 }
 
+/// Of values of a datatype that is not supported, doubles.
+ClassId classToWrite(long datatype) {
+  const ClassId known = classOfDatatype(datatype);
+  return known == ClassId::kUnknown ? ClassId::kDouble : known;
+}
+
 }  // namespace
 
 Array ArgumentMaker::indices() {
@@ -74,9 +80,7 @@ std::size_t ArgumentMaker::valueElements() const {
 }
 
 Array ArgumentMaker::variableData(std::size_t values) {
-  const ClassId known = classOfDatatype(variable_.datatype);
-  const ClassId classId = known == ClassId::kUnknown ? ClassId::kDouble : known;
-  return valuesOf(choices_, classId, limited(values, valueElements()));
+  return valuesOf(choices_, classToWrite(variable_.datatype), limited(values, valueElements()));
 }
 
 Array ArgumentMaker::value() {
@@ -91,7 +95,7 @@ Array ArgumentMaker::slab() {
 
 Array ArgumentMaker::entryValue() {
   const std::size_t values = 1 + choices_.below(6);
-  return valuesOf(choices_, classOfDatatype(datatype_), datatype_ == 32 ? 2 * values : values);
+  return valuesOf(choices_, classToWrite(datatype_), datatype_ == 32 ? 2 * values : values);
 }
 
 Array ArgumentMaker::compressionType() {
@@ -127,6 +131,22 @@ Array ArgumentMaker::times16() {
   for (double& part : times.mutableData<double>())
     part = static_cast<double>(choices_.word() >> 4);
   return times;
+}
+
+Array ArgumentMaker::timeTt2000Components() {
+  constexpr double kFirstYear = 1700;
+  Array times = Array::zeros(ClassId::kDouble, {9, choices_.below(4)});
+  std::size_t i = 0;
+  for (double& component : times.mutableData<double>()) {
+    const bool isYear = i++ % 9 == 0;
+    component = isYear ? kFirstYear + static_cast<double>(choices_.below(600))
+                       : 1.0 + static_cast<double>(choices_.below(12));
+  }
+  return times;
+}
+
+Array ArgumentMaker::timesTt2000() {
+  return valuesOf(choices_, ClassId::kInt64, choices_.below(5));
 }
 
 }  // namespace ambrix_fuzz

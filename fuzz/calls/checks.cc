@@ -7,6 +7,7 @@
 #include <variant>
 
 #include "fuzz/calls/call_log.h"
+#include "fuzz/calls/mode.h"
 #include "fuzz/calls/values.h"
 #include "gateway/open_file_registry.h"
 #include "tests/support/known_messages.h"
@@ -67,8 +68,9 @@ bool isPerDimension(ArrayView array, ClassId classId) {
 }
 
 bool isNames(ArrayView array) {
-  if (!isMatrix(array, ClassId::kCell, 57) || array.elementCount() != 57) return false;
-  for (std::size_t i = 0; i < 57; ++i) {
+  const std::size_t count = isExtended() ? 59 : 57;
+  if (!isMatrix(array, ClassId::kCell, count) || array.elementCount() != count) return false;
+  for (std::size_t i = 0; i < count; ++i) {
     if (!array.element(i) || !isLine(array.element(i))) return false;
   }
   return true;
@@ -76,7 +78,8 @@ bool isNames(ArrayView array) {
 
 bool isValue(ArrayView array) {
   constexpr ClassId kNever[] = {ClassId::kUnknown, ClassId::kCell, ClassId::kLogical,
-                                ClassId::kInt64, ClassId::kUint64};
+                                ClassId::kUint64};
+  if (array.classId() == ClassId::kInt64) return isExtended();
   return std::ranges::find(kNever, array.classId()) == std::end(kNever);
 }
 
@@ -104,6 +107,8 @@ constexpr Kind kKinds[] = {
     {"epochs", [](ArrayView array) { return isMatrix(array, ClassId::kDouble, 1); }},
     {"epochs16", [](ArrayView array) { return isMatrix(array, ClassId::kDouble, 2); }},
     {"components", [](ArrayView array) { return isMatrix(array, ClassId::kDouble, 7); }},
+    {"nanoseconds", [](ArrayView array) { return isMatrix(array, ClassId::kInt64, 1); }},
+    {"components9", [](ArrayView array) { return isMatrix(array, ClassId::kDouble, 9); }},
     {"components16",  // over any further dimensions
      [](ArrayView array) { return array.classId() == ClassId::kDouble && array.size()[0] == 10; }},
 };

@@ -5,12 +5,14 @@
 #include <unistd.h>
 
 #include <CLI/CLI.hpp>
+#include <algorithm>
 #include <chrono>
 #include <csignal>
 #include <cstdio>
 #include <cstdlib>
 #include <cstring>
 #include <filesystem>
+#include <iterator>
 #include <new>
 #include <random>
 #include <string>
@@ -19,7 +21,9 @@
 
 #include "fuzz/calls/call_log.h"
 #include "fuzz/calls/checks.h"
+#include "fuzz/calls/mode.h"
 #include "fuzz/calls/sequence.h"
+#include "fuzz/calls/transcript.h"
 
 namespace ambrix_fuzz {
 namespace {
@@ -37,6 +41,8 @@ struct Options {
   std::uint64_t calls = 100000;
   std::uint64_t seed = 1;
   std::int64_t replay = -1;
+  bool extended = false;
+  std::string transcript;
 };
 
 std::vector<std::uint8_t> bytesOf(std::uint64_t seed, std::uint64_t sequence) {
@@ -89,6 +95,7 @@ class Run {
  public:
   explicit Run(const Options& options) : options_(options), log_(sharedLog()) {
     setCallLog(log_);
+    setExtended(options.extended);
     confineProcess();
   }
 
@@ -108,7 +115,11 @@ class Run {
   CallLog& log_;
 };
 
+/// A transcript is in parts: one of each child, because no file may be large.
 void Run::runSequences() {
+  if (!options_.transcript.empty()) {
+    openTranscript(options_.transcript + '.' + std::to_string(log_.sequence));
+  }
   const std::uint64_t end = log_.sequence + kSequencesPerChild;
   for (; log_.sequence < end && log_.calls < options_.calls; ++log_.sequence) {
     runSequence(bytesOf(options_.seed, log_.sequence));
@@ -152,15 +163,18 @@ void Run::tellBroken(int status) const {
   }
   for (const std::string& line : log_.lastLines())
     std::printf("  %s\n", line.c_str());
-  std::printf("Again: --seed %llu --replay %llu\n", static_cast<unsigned long long>(options_.seed),
-              static_cast<unsigned long long>(log_.sequence));
+  std::printf("Again: --seed %llu --replay %llu%s\n",
+              static_cast<unsigned long long>(options_.seed),
+              static_cast<unsigned long long>(log_.sequence), isExtended() ? " --extended" : "");
 }
 
 /// A run that is long enough must have made every command succeed, or it shows nothing of it.
 bool Run::reachedAll() const {
   if (log_.calls < kCallsThatReachAll) return true;
   bool all = true;
-  const std::vector<ambrix_test::Command>& commands = ambrix_test::commands();
+  std::vector<ambrix_test::Command> commands = ambrix_test::commands();
+  if (isExtended())
+    std::ranges::copy(ambrix_test::extendedCommands(), std::back_inserter(commands));
   for (std::size_t i = 0; i < commands.size(); ++i) {
     if (log_.succeeded[i] > 0) continue;
     std::printf("NEVER SUCCEEDED: %s\n", commands[i].name.c_str());
@@ -213,6 +227,9 @@ int main(int argc, char** argv) {
   app.add_option("--calls", options.calls, "How many calls at least")->capture_default_str();
   app.add_option("--seed", options.seed, "Where chance begins")->capture_default_str();
   app.add_option("--replay", options.replay, "Only this sequence, printing each call");
+  app.add_flag("--extended", options.extended, "As a host that offers extended datatypes");
+  app.add_option("--transcript", options.transcript,
+                 "Write what each call answers to files\nof this name");
   CLI11_PARSE(app, argc, argv);
   ambrix_fuzz::Run run(options);
   return options.replay >= 0 ? run.replay() : run.all();

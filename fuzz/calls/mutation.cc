@@ -4,6 +4,9 @@
 #include <cmath>
 #include <iterator>
 
+#include "fuzz/calls/mode.h"
+#include "tests/support/command_signatures.h"
+
 namespace ambrix_fuzz {
 namespace {
 
@@ -66,7 +69,11 @@ void spoilCount(Choices& choices, const World&, CallInput& input) {
 }
 
 void spoilName(Choices& choices, const World&, CallInput& input) {
-  input.name = choices.oneIn(3) ? anyArray(choices) : Array::text(anyText(choices));
+  if (!isExtended() && choices.oneIn(4)) {
+    input.name = Array::fromNarrow(choices.pick(ambrix_test::extendedCommands()).name);
+  } else {
+    input.name = choices.oneIn(3) ? anyArray(choices) : Array::text(anyText(choices));
+  }
 }
 
 void disguise(Choices& choices, const World&, CallInput& input) {

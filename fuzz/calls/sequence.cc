@@ -13,7 +13,9 @@
 #include "fuzz/calls/backend.h"
 #include "fuzz/calls/call_log.h"
 #include "fuzz/calls/checks.h"
+#include "fuzz/calls/mode.h"
 #include "fuzz/calls/mutation.h"
+#include "fuzz/calls/transcript.h"
 #include "gateway/open_file_registry.h"
 #include "host/qvh.h"
 #include "tests/support/command_signatures.h"
@@ -22,6 +24,7 @@ namespace ambrix_fuzz {
 namespace {
 
 using ambrix_test::commands;
+using ambrix_test::extendedCommands;
 using ambrix_test::placeOf;
 
 constexpr std::size_t kByteLimit = 1 << 24;
@@ -86,7 +89,9 @@ class Disguise {
 class Sequence {
  public:
   explicit Sequence(std::span<const std::uint8_t> bytes)
-      : choices_(bytes), module_(watchedEntryPoint) {}
+      : choices_(bytes), module_(watchedEntryPoint) {
+    module_.setExtended(isExtended());
+  }
 
   void run();
 
@@ -95,7 +100,7 @@ class Sequence {
   void callOne(std::size_t number);
   void perform(const Command& command, CallInput& input);
   void succeeded(const Command& command, const CallInput& input, const std::vector<Array>& results);
-  void failed(const std::string& what);
+  void failed(const Command& command, const std::string& what);
   void adoptUnreturned(const CallInput& input);
   void checkWarnings(std::string_view command) const;
   void checkValue(std::string_view command, const CallInput& input,
@@ -118,6 +123,7 @@ void Sequence::run() {
 
 const Command& Sequence::nextCommand(std::size_t call) {
   if (call < std::size(kBeginnings)) return commands()[placeOf(kBeginnings[call])];
+  if (isExtended() && choices_.oneIn(12)) return choices_.pick(extendedCommands());
   if (choices_.oneIn(3) || world_.files().empty())
     return commands()[placeOf(choices_.pick(kFrequent))];
   return choices_.pick(commands());
@@ -148,7 +154,7 @@ void Sequence::perform(const Command& command, CallInput& input) {
     results = module_.call(input.name, views, input.outputs);
   } catch (const ambrix::Error& error) {
     ++callLog().errors[requireKnown(error.id())];
-    failed(error.what());
+    failed(command, error.what());
     if (error.identifier() == "TOLVEX:host:outOfMemory") adoptUnreturned(input);
     return requireNothingLeft(before, {});
   } catch (const std::exception& error) {
@@ -156,14 +162,16 @@ void Sequence::perform(const Command& command, CallInput& input) {
         error.what() == std::string_view("basic_string::_M_construct null not valid");
     if (!notText) violation(std::string("an exception: ") + error.what());
     ++callLog().errors[placeOfNotText()];
-    failed(error.what());
+    failed(command, error.what());
     return requireNothingLeft(before, {});
   }
   requireNothingLeft(before, results);
+  transcribe(command.name, results, module_.lastWarnings());
   succeeded(command, input, results);
 }
 
-void Sequence::failed(const std::string& what) {
+void Sequence::failed(const Command& command, const std::string& what) {
+  transcribe(command.name, what, module_.lastWarnings());
   callLog().note("    " + what);
   if (outputsFilled) violation("a call that failed has filled an output");
 }

@@ -10,12 +10,17 @@
 #include <type_traits>
 #include <vector>
 
+#include "fuzz/calls/mode.h"
+
 namespace ambrix_fuzz {
 namespace {
 
 using ambrix_test::CdfDatatype;
 using ambrix_test::findCdfDatatype;
 using ambrix_test::kCdfDatatypes;
+using ambrix_test::kInt8;
+using ambrix_test::kOtherDatatypes;
+using ambrix_test::kTt2000;
 using ambrix_test::lowerCaseName;
 
 constexpr double kInfinity = std::numeric_limits<double>::infinity();
@@ -131,9 +136,15 @@ Array valuesOf(Choices& choices, ClassId classId, std::size_t count) {
   return array;
 }
 
+long anyDatatype(Choices& choices) {
+  return choices.oneIn(8) ? choices.pick(kOtherDatatypes) : choices.pick(kDatatypeCodes);
+}
+
 ClassId classOfDatatype(long datatype) {
   const CdfDatatype* found = findCdfDatatype(datatype);
-  return found == nullptr ? ClassId::kUnknown : found->classId;
+  if (found != nullptr) return found->classId;
+  const bool isOther = std::ranges::find(kOtherDatatypes, datatype) != std::end(kOtherDatatypes);
+  return isExtended() && isOther ? ClassId::kInt64 : ClassId::kUnknown;
 }
 
 std::size_t bytesOfDatatype(long datatype) {
@@ -143,7 +154,9 @@ std::size_t bytesOfDatatype(long datatype) {
 
 long datatypeOfName(std::string_view name) {
   const auto* found = std::ranges::find(kCdfDatatypes, name, lowerCaseName);
-  return found == std::end(kCdfDatatypes) ? 0 : found->code;
+  if (found != std::end(kCdfDatatypes)) return found->code;
+  if (name == "cdf_int8") return kInt8;
+  return name == "cdf_time_tt2000" ? kTt2000 : 0;
 }
 
 bool isText(long datatype) {

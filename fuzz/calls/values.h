@@ -31,6 +31,9 @@ Array valuesOf(Choices& choices, ClassId classId, std::size_t count);
 inline constexpr long kDatatypeCodes[] = {22, 4, 51, 32, 1, 2, 11, 12, 14, 21, 31, 41, 44, 45, 52};
 static_assert(std::size(kDatatypeCodes) == std::size(ambrix_test::kCdfDatatypes));
 
+/// One of these, and now and then one that only extended hosts know.
+long anyDatatype(Choices& choices);
+
 /// The class of a supported datatype; kUnknown for others. And the bytes of one element.
 ClassId classOfDatatype(long datatype);
 std::size_t bytesOfDatatype(long datatype);

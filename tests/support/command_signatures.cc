@@ -2,6 +2,7 @@
 
 #include <algorithm>
 #include <iterator>
+#include <span>
 #include <sstream>
 
 namespace ambrix_test {
@@ -46,9 +47,11 @@ constexpr Kind kKinds[] = {
     {"strides", Conversion::kNumbers, "DIMSTRIDE"},
     {"components", Conversion::kOwn, ""},
     {"components16", Conversion::kOwn, ""},
+    {"components9", Conversion::kOwn, ""},
     {"entryValues", Conversion::kOwn, ""},
     {"epochs", Conversion::kOwn, "EPOCHTIME"},
     {"epochs16", Conversion::kOwn, "EPOCH16TIME"},
+    {"nanoseconds", Conversion::kOwn, ""},
     {"recordValues", Conversion::kOwn, ""},
     {"slabValues", Conversion::kOwn, ""},
     {"value", Conversion::kOwn, ""},
@@ -183,6 +186,11 @@ constexpr Row kRows[] = {
 // clang-format on
 static_assert(std::size(kRows) == 91);
 
+constexpr Row kExtendedRows[] = {
+    {93, "computeTT2000", "components9", "nanoseconds", ""},
+    {94, "tt2000Breakdown", "nanoseconds", "components9", ""},
+};
+
 std::vector<std::string> words(const std::string& text) {
   std::istringstream in(text);
   std::vector<std::string> words;
@@ -207,6 +215,12 @@ Command command(const Row& row) {
   return command;
 }
 
+std::vector<Command> commandsOf(std::span<const Row> rows) {
+  std::vector<Command> commands;
+  std::ranges::transform(rows, std::back_inserter(commands), command);
+  return commands;
+}
+
 }  // namespace
 
 std::size_t Command::minimum() const {
@@ -218,17 +232,23 @@ bool Command::takesFile() const {
 }
 
 const std::vector<Command>& commands() {
-  static const auto kCommands = [] {
-    std::vector<Command> commands;
-    std::ranges::transform(kRows, std::back_inserter(commands), command);
-    return commands;
-  }();
+  static const std::vector<Command> kCommands = commandsOf(kRows);
+  return kCommands;
+}
+
+const std::vector<Command>& extendedCommands() {
+  static const std::vector<Command> kCommands = commandsOf(kExtendedRows);
   return kCommands;
 }
 
 std::size_t placeOf(std::string_view name) {
-  return static_cast<std::size_t>(std::ranges::find(commands(), name, &Command::name) -
-                                  commands().begin());
+  std::size_t place = 0;
+  for (const std::vector<Command>* table : {&commands(), &extendedCommands()}) {
+    const auto found = std::ranges::find(*table, name, &Command::name);
+    place += static_cast<std::size_t>(found - table->begin());
+    if (found != table->end()) return place;
+  }
+  return place;
 }
 
 }  // namespace ambrix_test

@@ -45,7 +45,11 @@ struct Command {
 /// In the order of the module's table.
 const std::vector<Command>& commands();
 
-/// The place of a command in the table; their number for a name that is none.
+/// Those of hosts that offer extended datatypes.
+const std::vector<Command>& extendedCommands();
+
+/// The place of a command in the table, or behind it for an extended one; the number of all for a
+/// name that is none.
 std::size_t placeOf(std::string_view name);
 
 }  // namespace ambrix_test

@@ -44,8 +44,10 @@ inline constexpr CdfDatatype kCdfDatatypes[] = {
 // clang-format on
 static_assert(std::size(kCdfDatatypes) == 15);
 
-/// Known to the library, and to no command.
-inline constexpr long kOtherDatatypes[] = {8, 33};
+/// Known to the library, and to no command unless the host is extended.
+inline constexpr long kInt8 = 8;
+inline constexpr long kTt2000 = 33;
+inline constexpr long kOtherDatatypes[] = {kInt8, kTt2000};
 
 /// Two elements of an array are one of its values.
 inline constexpr long kEpoch16 = 32;
