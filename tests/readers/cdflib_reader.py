@@ -3,11 +3,10 @@
 import cdflib
 import numpy as np
 
-from readers.content import CHARACTERS, CODES, EPOCH16, INT8, TT2000, Attribute, Content
+from readers.content import CHARACTERS, CODES, EPOCH16, Attribute, Content
 from readers.content import Variable, attempt, dtype_of, expand, seen_as_zvariable, text_bytes
 
 NAME = "cdflib"
-UNSUPPORTED = {"CDF_INT8": INT8, "CDF_TIME_TT2000": TT2000}
 SPARSE = {"No_sparse": "no", "Pad_sparse": "pad", "Prev_sparse": "previous"}
 
 
@@ -48,7 +47,7 @@ def _entry(cdf, attribute, number):
     if name in ("CDF_CHAR", "CDF_UCHAR"):
         strings = [data.Data] if isinstance(data.Data, str) else data.Data
         return (51 if name == "CDF_CHAR" else 52), "\\N ".join(strings).encode("latin-1")
-    code = UNSUPPORTED.get(name) or CODES[name.lower()]
+    code = CODES[name.lower()]
     return code, np.atleast_1d(_numbers(data.Data, code)).reshape(-1)
 
 

@@ -27,15 +27,24 @@ DATATYPES = {
     51: ("cdf_char", "u1", "char"),
     52: ("cdf_uchar", "u1", "char"),
 }
-CODES = {name: code for code, (name, _, _) in DATATYPES.items()}
-INT8, TT2000 = 8, 33  # in many files, and not supported by the module
+INT8, TT2000 = 8, 33  # in many files, and supported by extended hosts only
+EXTENDED_DATATYPES = {
+    INT8: ("cdf_int8", "<i8", "int64"),
+    TT2000: ("cdf_time_tt2000", "<i8", "int64"),
+}
+CODES = {name: code for code, (name, _, _) in {**DATATYPES, **EXTENDED_DATATYPES}.items()}
 EPOCH16 = 32
 CHARACTERS = (51, 52)
 
 
+def datatype(code):
+    """Name, numpy type and class of the host's arrays."""
+    return DATATYPES.get(code) or EXTENDED_DATATYPES[code]
+
+
 def dtype_of(code):
     """The numpy type of one stored number or byte."""
-    return np.dtype("<i8") if code in (INT8, TT2000) else np.dtype(DATATYPES[code][1])
+    return np.dtype(datatype(code)[1])
 
 
 def leading_of(code, elements):

@@ -8,14 +8,13 @@ from pathlib import Path
 
 import numpy as np
 
-from readers.content import CHARACTERS, CODES, INT8, TT2000, Attribute, Content, Unread, Variable
+from readers.content import CHARACTERS, CODES, Attribute, Content, Unread, Variable
 from readers.content import attempt, dtype_of, seen_as_zvariable, text_bytes
 
 NAME = "jcdf"
 JAVA = shutil.which("java")
 JAR = Path(os.environ.get("AMBRIX_JCDF", "/usr/share/java/jcdf.jar"))
 PROGRAM = Path(__file__).parent / "java" / "DumpCdf.java"
-UNSUPPORTED = {"INT8": INT8, "TIME_TT2000": TT2000}
 SPECIAL = {"NaN": np.nan, "Infinity": np.inf, "-Infinity": -np.inf}
 
 
@@ -27,7 +26,7 @@ def why_not():
 
 
 def _code(name):
-    return UNSUPPORTED.get(name) or CODES["cdf_" + name.lower()]
+    return CODES["cdf_" + name.lower()]
 
 
 def _flat(values):

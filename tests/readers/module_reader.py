@@ -2,7 +2,7 @@
 
 import numpy as np
 
-from readers.content import CHARACTERS, CODES, DATATYPES, Attribute, Content, Variable, dtype_of
+from readers.content import CHARACTERS, CODES, Attribute, Content, Variable, datatype, dtype_of
 from readers.content import leading_of
 from support.ambrix_session import CallError
 
@@ -11,7 +11,7 @@ SPARSE = {"NO_SPARSERECORDS": "no", "PAD_SPARSERECORDS": "pad", "PREV_SPARSERECO
 
 def to_numpy(result, code):
     """The data of a result, flat, after a check of its class; characters as bytes."""
-    expected = DATATYPES[code][2]
+    expected = datatype(code)[2]
     if result.class_name != expected:
         raise AssertionError(f"class {result.class_name}, not {expected}")
     if result.class_name != "char":
@@ -71,7 +71,7 @@ class ModuleReader:
     def definition(self, number):
         """The variable without values; None when its datatype is not supported."""
         try:
-            name, datatype, elements, sizes, record_varies, varies = self.session.call(
+            name, kind, elements, sizes, record_varies, varies = self.session.call(
                 "inquireVar", self.file, number)
         except CallError as error:
             if error.name == "unrecognizedValue" and error.values[1:] == ["DATATYPE"]:
@@ -79,7 +79,7 @@ class ModuleReader:
             raise
         sparse = self.session.value("getVarSparseRecords", self.file, number)
         return Variable(
-            CODES[datatype.value], int(elements.value),
+            CODES[kind.value], int(elements.value),
             tuple(int(size) for size in self.host_order(sizes.data)),
             tuple(self.host_order(varies.data)), record_varies.value, sparse=SPARSE[sparse])
 
@@ -116,9 +116,9 @@ class ModuleReader:
             if error.name == "libraryFailure":
                 return None
             raise
-        datatype, elements = self.session.values(
+        kind, elements = self.session.values(
             f"inquireAttr{letter}Entry", self.file, attribute, number)
-        code = CODES[datatype]
+        code = CODES[kind]
         if code in CHARACTERS:
             return code, value.data.encode("latin-1")
         data = to_numpy(value, code)
