@@ -28,10 +28,12 @@ def inputs(example):
 class Runner:
     """Runs examples, each in a folder and a process of its own, with their file open.
 
-    `calls` are the calls that succeeded: the command, its arguments and its results.
+    `options` are those of the session. `calls` are the calls that succeeded: the command, its
+    arguments and its results.
     """
 
-    def __init__(self, table):
+    def __init__(self, table, options=()):
+        self._options = options
         self._folder = tempfile.TemporaryDirectory()
         self.home = pathlib.Path(self._folder.name)
         self.calls = []
@@ -60,7 +62,7 @@ class Runner:
             self._evaluate(session, variables, notation.Statement(line).call)
 
     def _run(self, example, folder, opened):
-        with Session(cwd=folder) as session:
+        with Session(options=self._options, cwd=folder) as session:
             variables = {"id": session.call("open", FILE)[0]} if opened else {}
             lines = []
             for line in inputs(example):
