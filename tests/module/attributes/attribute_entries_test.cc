@@ -90,29 +90,6 @@ TEST_F(AttributeEntriesTest, NegativeEntryNumbersAreRefused) {
   EXPECT_EQ(does("getAttrgEntry", {file, 0, -1}), refused("CDFinquireAttrgEntry", kBadEntryNum));
 }
 
-TEST_F(AttributeEntriesTest, ADatatypeThatIsNoneIsReportedBeforeTheClassOfTheValue) {
-  for (const long datatype : {3L, 8L, 33L, 0L, 53L, 100L, -1L, 4294967300L}) {
-    EXPECT_EQ(does("putAttrgEntry", {file, 0, 0, static_cast<double>(datatype), "x"}),
-              unrecognized(datatype, "DATATYPE"));
-  }
-}
-
-TEST_F(AttributeEntriesTest, TheValueMustBeOfTheDatatypesClass) {
-  EXPECT_EQ(does("putAttrgEntry", {file, 0, 0, 4, 1}),
-            cdflib("badPutAttrEntryDatatype", "double", "CDF_INT4"));
-  EXPECT_EQ(does("putAttrEntry", {file, 0, 0, 22, row<float>({1})}),
-            cdflib("badPutAttrEntryDatatype", "single", "CDF_REAL8"));
-  EXPECT_EQ(does("putAttrEntry", {file, 0, 0, 52, 65}),
-            cdflib("badPutAttrEntryDatatype", "double", "CDF_UCHAR"));
-  EXPECT_EQ(does("putAttrEntry", {file, 0, 0, 41, row<std::uint8_t>({1})}),
-            cdflib("badPutAttrEntryDatatype", "uint8", "CDF_BYTE"));
-  EXPECT_EQ(does("putAttrEntry", {file, 0, 0, 1, Array::scalar(true)}),
-            cdflib("badPutAttrEntryDatatype", "logical", "CDF_INT1"));
-  EXPECT_EQ(does("putAttrEntry", {file, 0, 0, 4, Array::cell({1, 1})}),
-            cdflib("badPutAttrEntryDatatype", "cell", "CDF_INT4"));
-  EXPECT_EQ(does("getNumAttrgEntries", {file, 0}), "double 1x1 [0]");
-}
-
 TEST_F(AttributeEntriesTest, TheValueIsCheckedBeforeTheAttributeIsLookedUp) {
   EXPECT_EQ(does("putAttrEntry", {file, 9, 0, 3, 1}), unrecognized(3, "DATATYPE"));
   EXPECT_EQ(does("putAttrEntry", {file, 9, 0, 4, 1}),

@@ -7,11 +7,6 @@ namespace {
 using EpochTest = ModuleTest;
 
 const std::string kIllegal = "TOLVEX:ambrix:cdflib:illegalEpochValue()";
-const std::string kOdd = "TOLVEX:ambrix:cdflib:badEpoch16Modulus()";
-
-std::string badVector(long components) {
-  return cdflib("badEpochVector", components);
-}
 
 Given matrix(std::initializer_list<double> values, ::ambrix::Sizes sizes) {
   return Array::of<double>({std::data(values), values.size()}, sizes);
@@ -42,16 +37,6 @@ TEST_F(EpochTest, NoTimesGiveNoEpochs) {
   EXPECT_EQ(does("computeEpoch16", {{}}), "double 2x0 []");
   EXPECT_EQ(does("epochBreakdown", {{}}), "double 7x0 []");
   EXPECT_EQ(does("epoch16Breakdown", {{}}), "double 10x0 []");
-}
-
-TEST_F(EpochTest, AWrongNumberOfComponentsAndAWrongClassAreOneError) {
-  EXPECT_EQ(does("computeEpoch", {{2000, 1, 1, 0, 0, 0}}), badVector(7));
-  EXPECT_EQ(does("computeEpoch", {2000}), badVector(7));
-  EXPECT_EQ(does("computeEpoch", {row<std::int32_t>({2000, 1, 1, 0, 0, 0, 0})}), badVector(7));
-  EXPECT_EQ(does("computeEpoch", {"1234567"}), badVector(7));
-  EXPECT_EQ(does("computeEpoch", {Array::cell({7, 1})}), badVector(7));
-  EXPECT_EQ(does("computeEpoch16", {{2000, 1, 1, 0, 0, 0, 0}}), badVector(10));
-  EXPECT_EQ(does("computeEpoch16", {row<float>({2000, 1, 1, 0, 0, 0, 0, 0, 0, 0})}), badVector(10));
 }
 
 TEST_F(EpochTest, AnIllegalTimeEndsTheCommand) {
@@ -88,13 +73,6 @@ TEST_F(EpochTest, TheFillValueIsTheEndOfTime) {
   EXPECT_EQ(does("epochBreakdown", {-1e31}), "double 7x1 [9999 12 31 23 59 59 999]");
 }
 
-TEST_F(EpochTest, EpochsMustBeDoubles) {
-  const std::string error = validate("argumentNotDoublePrecision", "EPOCHTIME");
-  EXPECT_EQ(does("epochBreakdown", {row<float>({1})}), error);
-  EXPECT_EQ(does("epochBreakdown", {"x"}), error);
-  EXPECT_EQ(does("epochBreakdown", {Array::cell({1, 1})}), error);
-}
-
 TEST_F(EpochTest, BreaksEpoch16sDown) {
   EXPECT_EQ(does("epoch16Breakdown", {matrix({63113904000.0, 1002003004.0}, {2, 1})}),
             "double 10x1 [2000 1 1 0 0 0 1 2 3 4]");
@@ -114,13 +92,6 @@ TEST_F(EpochTest, TheShapeOfEpoch16sFollowsTheInput) {
   EXPECT_THAT(sizeOf({4, 3}), ElementsAre(10, 6));
   EXPECT_THAT(sizeOf({3, 2, 2}), ElementsAre(10, 6));
   EXPECT_THAT(sizeOf({2, 0}), ElementsAre(10, 0));
-}
-
-TEST_F(EpochTest, AnOddNumberComesBeforeAWrongClass) {
-  EXPECT_EQ(does("epoch16Breakdown", {{1, 2, 3}}), kOdd);
-  EXPECT_EQ(does("epoch16Breakdown", {row<float>({1, 2, 3})}), kOdd);
-  EXPECT_EQ(does("epoch16Breakdown", {row<float>({1, 2})}),
-            validate("argumentNotDoublePrecision", "EPOCH16TIME"));
 }
 
 TEST_F(EpochTest, TimesGoThereAndBack) {

@@ -112,12 +112,5 @@ TEST_F(FileInquiryTest, CopyrightsKeepTheirLineBreaks) {
   }
 }
 
-TEST_F(FileInquiryTest, TheIdentifierIsChecked) {
-  for (const char* command : {"inquire", "getVersion", "getName", "getCopyright"}) {
-    EXPECT_EQ(does(command, {1}), validate("argumentNotUint64Scalar", "CDFID"));
-    EXPECT_EQ(does(command, {Array::scalar(std::uint64_t{1})}), kInvalidFileId);
-  }
-}
-
 }  // namespace
 }  // namespace ambrix_test

@@ -40,19 +40,6 @@ TEST_F(DispatchTest, ACommandThatIsNoTextIsALogicError) {
   }
 }
 
-TEST_F(DispatchTest, AnUnknownNameIsReportedWhateverItsArguments) {
-  EXPECT_EQ(does("openCDF"), cdflib("invalidOperation", "openCDF"));
-}
-
-TEST_F(DispatchTest, NumbersOutOfRangeEndAsArgumentOutOfBounds) {
-  const Given file = create();
-  for (const double value :
-       {1e19, -1e19, 9223372036854775808.0, -9223372036854775808.0, HUGE_VAL, -HUGE_VAL}) {
-    EXPECT_EQ(does("getVarName", {file, value}), kOutOfBounds) << value;
-    EXPECT_EQ(does("setValidate", {value}), kOutOfBounds) << value;
-  }
-}
-
 TEST_F(DispatchTest, NumbersAreTruncatedTowardZero) {
   const Given file = create();
   createVar(file, {.name = "a"});
@@ -61,20 +48,6 @@ TEST_F(DispatchTest, NumbersAreTruncatedTowardZero) {
   EXPECT_EQ(does("getVarName", {file, 0.7}), "char 1x1 'a'");
   EXPECT_EQ(does("getVarName", {file, -0.9}), "char 1x1 'a'");
   EXPECT_EQ(does("setValidate", {-1.9}), "done");
-}
-
-TEST_F(DispatchTest, ANumberMustBeOneDouble) {
-  const Given file = create();
-  createVar(file, {});
-  const std::string notScalar = validate("argumentNotDoubleScalar", "VARNUM");
-  EXPECT_EQ(does("getVarName", {file, Array::scalar(std::int32_t{0})}), notScalar);
-  EXPECT_EQ(does("getVarName", {file, Array::scalar(0.0F)}), notScalar);
-  EXPECT_EQ(does("getVarName", {file, Array::scalar(false)}), notScalar);
-  EXPECT_EQ(does("getVarName", {file, {0, 0}}), notScalar);
-  EXPECT_EQ(does("getVarName", {file, {1e30, 0}}), notScalar);
-  EXPECT_EQ(does("getVarName", {file, {}}), notScalar);
-  EXPECT_EQ(does("getVarName", {file, "0"}), notScalar);
-  EXPECT_EQ(does("getVarName", {file, Array::cell({1, 1})}), notScalar);
 }
 
 TEST_F(DispatchTest, NanIsTheMostNegativeNumberAndNoOverflow) {

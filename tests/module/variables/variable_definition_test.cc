@@ -80,30 +80,6 @@ TEST_F(VariableDefinitionTest, OtherClassesAreNoVariance) {
   EXPECT_EQ(creates(4, 1, {}, "", {}), kBadVariance);
 }
 
-TEST_F(VariableDefinitionTest, SizesAndVariancesMustBeOfOneNumber) {
-  const auto mismatch = [](long variances, long sizes) {
-    return cdflib("mismatchedVarianceSize", variances, sizes);
-  };
-  EXPECT_EQ(creates(4, 1, {2, 3}, -1, {-1, -1, -1}), mismatch(3, 2));
-  EXPECT_EQ(creates(4, 1, {2, 3}, -1, {-1}), mismatch(1, 2));
-  EXPECT_EQ(creates(4, 1, {}, -1, -1), mismatch(1, 0));
-  EXPECT_EQ(creates(4, 1, {2}, -1, {}), mismatch(0, 1));
-}
-
-TEST_F(VariableDefinitionTest, AnEmptyRecordVarianceIsAMismatchReportedAfterThatOfDimensions) {
-  EXPECT_EQ(creates(4, 1, {}, {}, {}), cdflib("mismatchedVarianceSize", 0L, 1L));
-  EXPECT_EQ(creates(4, 1, {2}, {}, {}), cdflib("mismatchedVarianceSize", 0L, 1L));
-  EXPECT_EQ(creates(4, 1, {2, 2}, {}, {-1}), cdflib("mismatchedVarianceSize", 1L, 2L));
-}
-
-TEST_F(VariableDefinitionTest, ArgumentsAreReadInOrder) {
-  const Given bad = "x";
-  EXPECT_EQ(creates(4, 1, {1e30}, bad, bad), kOutOfBounds);
-  EXPECT_EQ(creates(4, 1, {2}, bad, 1), kBadVariance);
-  EXPECT_EQ(creates(4, 1, {2}, 3, bad), unrecognized(3, "VARIANCE"));
-  EXPECT_EQ(creates(99, 99, {2}, -1, bad), kBadVariance);
-}
-
 TEST_F(VariableDefinitionTest, SizesOfOtherClassesAreConvertedByValue) {
   for (const Given& sizes : {row<std::int32_t>({2, 3}), row<float>({2, 3}),
                              row<std::uint64_t>({2, 3}), Given(Array::text(u"\u0002\u0003"))}) {

@@ -78,34 +78,12 @@ TEST_F(WriteHyperslabsTest, TheWrongNumberIsReportedWithTheCountsInTheLibrarysOr
   }
 }
 
-TEST_F(WriteHyperslabsTest, TheExpectedNumberCountsTextsAndPairs) {
-  createVar(file, {.datatype = 22});
-  EXPECT_EQ(does("hyperPutVarData", {file, 0, 0, 3, 1, {}, {}, {}, {1}}), wrongNumber("[ ]", 3, 3));
-  results("deleteVar", {file, 0});
-  createVar(file, {.datatype = 51, .sizes = {2}, .elements = 5});
-  EXPECT_EQ(does("hyperPutVarData", {file, 0, 0, 3, 1, 0, 2, 1, "x"}), wrongNumber("[ 2 ]", 3, 30));
-  results("deleteVar", {file, 0});
-  createVar(file, {.datatype = 32, .sizes = {2}});
-  EXPECT_EQ(does("hyperPutVarData", {file, 0, 0, 3, 1, 0, 2, 1, {1}}), wrongNumber("[ 2 ]", 3, 12));
-}
-
 TEST_F(WriteHyperslabsTest, NegativeCountsAreReportedAsTheyAre) {
   createVar(file, {.datatype = 22, .sizes = {2}});
   EXPECT_EQ(does("hyperPutVarData", {file, 0, 0, -1, 1, 0, 2, 1, {1, 2}}),
             wrongNumber("[ 2 ]", -1, -2));
   EXPECT_EQ(does("hyperPutVarData", {file, 0, 0, 1, 1, 0, -2, 1, {1, 2}}),
             wrongNumber("[ -2 ]", 1, -2));
-}
-
-TEST_F(WriteHyperslabsTest, TheNumberComesBeforeTheDatatypeAndThatBeforeTheClass) {
-  createVar(file, {.datatype = 22});
-  EXPECT_EQ(does("hyperPutVarData", {file, 0, 0, 2, 1, {}, {}, {}, row<float>({1})}),
-            wrongNumber("[ ]", 2, 2));
-  EXPECT_EQ(does("hyperPutVarData", {file, 0, 0, 1, 1, {}, {}, {}, row<float>({1})}),
-            cdflib("datatypeMismatch", "single", "CDF_REAL8"));
-  results("createVar", {file, "i8", 8, 1, {}, -1, {}});
-  EXPECT_EQ(does("hyperPutVarData", {file, 1, 0, 1, 1, {}, {}, {}, row<float>({1})}),
-            unrecognized(8, "DATATYPE"));
 }
 
 // Only the library compares the vectors with the dimensions.

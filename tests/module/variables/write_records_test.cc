@@ -64,26 +64,6 @@ TEST_F(WriteRecordsTest, TextsAreWrittenWholeWithTheLowByteOfEachCharacter) {
                                                        "caf\xE9 XYZ"));
 }
 
-TEST_F(WriteRecordsTest, TheNumberOfElementsIsCheckedFirst) {
-  const double variable = createVar(file, {.datatype = 22, .sizes = {3, 4}});
-  EXPECT_EQ(does("putVarRecordData", {file, variable, 0, "short"}), wrongNumberInRecord(12));
-  EXPECT_EQ(does("putVarRecordData", {file, variable, -1, {}}), wrongNumberInRecord(12));
-  const double epoch = createVar(file, {.datatype = 32, .sizes = {3}, .name = "e"});
-  EXPECT_EQ(does("putVarRecordData", {file, epoch, 0, {1, 2, 3}}),
-            cdflib("wrongNumberOfPutVarRecordDataElements", "e", 6L));
-  const double scalar = createVar(file, {.datatype = 22, .name = "s"});
-  EXPECT_EQ(does("putVarRecordData", {file, scalar, 0, {1, 2}}),
-            cdflib("wrongNumberOfPutVarRecordDataElements", "s", 1L));
-}
-
-TEST_F(WriteRecordsTest, ThenTheDatatypeAndTheClass) {
-  const double variable = createVar(file, {.datatype = 22});
-  EXPECT_EQ(does("putVarRecordData", {file, variable, -1, row<float>({1})}),
-            cdflib("datatypeMismatch", "single", "CDF_REAL8"));
-  results("createVar", {file, "t", 33, 1, {}, -1, {}});
-  EXPECT_EQ(does("putVarRecordData", {file, 1, -1, row<float>({1})}), unrecognized(33, "DATATYPE"));
-}
-
 TEST_F(WriteRecordsTest, ANegativeRecordIsRefusedAndTheFileStaysUsable) {
   const double variable = createVar(file, {.datatype = 22});
   results("putVarRecordData", {file, variable, 0, 7});

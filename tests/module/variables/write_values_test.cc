@@ -79,31 +79,6 @@ TEST_F(WriteValuesTest, TheFirstCharacterKeepsItsLowByte) {
   EXPECT_EQ(does("getVarData", {file, variable, 0}), "char 1x1 '\\xFFAC'");
 }
 
-TEST_F(WriteValuesTest, ATextNeedsItsNumberOfCharacters) {
-  const double variable = createVar(file, {.datatype = 51, .elements = 4});
-  EXPECT_EQ(does("putVarData", {file, variable, 0, {}, "A"}), wrongNumberInValue(4));
-  EXPECT_EQ(does("putVarData", {file, variable, 0, {}, "ABCDE"}), wrongNumberInValue(4));
-}
-
-TEST_F(WriteValuesTest, ThereMustBeOneIndexForEachDimension) {
-  const double variable = createVar(file, {.datatype = 22, .sizes = {2, 3}});
-  const std::string error = cdflib("badDimensionExtent", "v", 2L);
-  EXPECT_EQ(does("putVarData", {file, variable, 0, {}, "wrong"}), error);
-  EXPECT_EQ(does("putVarData", {file, variable, 0, {0}, 1}), error);
-  EXPECT_EQ(does("putVarData", {file, variable, 0, {0, 0, 0}, 1}), error);
-}
-
-TEST_F(WriteValuesTest, TheNumberOfElementsComesBeforeTheDatatypeAndThatBeforeTheClass) {
-  const double variable = createVar(file, {.datatype = 22});
-  EXPECT_EQ(does("putVarData", {file, variable, 0, {}, row<float>({1, 2})}), wrongNumberInValue(1));
-  EXPECT_EQ(does("putVarData", {file, variable, 0, {}, row<float>({1})}),
-            cdflib("datatypeMismatch", "single", "CDF_REAL8"));
-  results("createVar", {file, "i8", 8, 1, {}, -1, {}});
-  EXPECT_EQ(does("putVarData", {file, 1, 0, {}, "xy"}),
-            cdflib("wrongNumberOfPutVarDataElements", "i8", 1L));
-  EXPECT_EQ(does("putVarData", {file, 1, 0, {}, "x"}), unrecognized(8, "DATATYPE"));
-}
-
 TEST_F(WriteValuesTest, ClassesThatCarryNoDatatypeNeverMatch) {
   const double variable = createVar(file, {.datatype = 1});
   const auto mismatch = [](const char* className) {

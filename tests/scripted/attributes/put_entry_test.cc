@@ -1,4 +1,8 @@
 // Writing attribute entries: one handler for both commands, the attribute's scope decides.
+#include <sys/mman.h>
+
+#include <span>
+
 #include "tests/support/datatypes.h"
 #include "tests/support/host_texts.h"
 #include "tests/support/scripted_test.h"
@@ -101,6 +105,17 @@ TEST_F(PutEntryTest, TheDatatypeIsLookedAtBeforeTheClass) {
               unrecognized(datatype, "DATATYPE"));
   }
   EXPECT_THAT(calls(), IsEmpty());
+}
+
+TEST_F(PutEntryTest, MoreValuesThan32BitsCountReachTheLibraryAsANumberThatItRefuses) {
+  constexpr std::size_t kBeyond = std::size_t{1} << 31;
+  void* memory =
+      mmap(nullptr, kBeyond, PROT_READ, MAP_PRIVATE | MAP_ANONYMOUS | MAP_NORESERVE, -1, 0);
+  ASSERT_NE(memory, MAP_FAILED);
+  const std::span<const std::int8_t> values(static_cast<const std::int8_t*>(memory), kBeyond);
+  call("putAttrEntry", {file(), 2, 5, 1, Array::borrowed(values, {1, kBeyond})});
+  EXPECT_EQ(calls()[1], "CDFputAttrEntry 7 1 2 5 1 -1");
+  munmap(memory, kBeyond);
 }
 
 TEST_F(PutEntryTest, FailuresNameTheRoutineOfTheKind) {

@@ -24,6 +24,11 @@ TEST_F(VariableDefinitionTest, SizesAndVariancesOfARowMajorFileAreReversed) {
   EXPECT_EQ(shown(results[5]), "logical 1x3 [0 1 1]");
 }
 
+TEST_F(VariableDefinitionTest, AMajorityThatIsNoneCountsAsThatOfColumns) {
+  describe({.sizes = {4, 3, 2}, .majority = 3});
+  EXPECT_EQ(shown(call("inquireVar", {file(), 3})[3]), "double 1x3 [4 3 2]");
+}
+
 TEST_F(VariableDefinitionTest, AScalarVariableHasEmptyArrays) {
   describe({.datatype = 51, .elements = 20, .name = std::string(256, 'n')});
   const std::vector<Array> results = call("inquireVar", {file(), 3});

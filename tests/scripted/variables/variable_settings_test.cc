@@ -101,13 +101,14 @@ TEST_F(VariableSettingsTest, TheBuffersAreConvertedBeforeTheFormatIsRead) {
 /// The commands that make the library divide by the bytes of a record, by their routines.
 class DividingCommandsTest : public VariableSettingsTest {
  protected:
-  const std::pair<const char*, Arguments> commands[6] = {
+  const std::pair<const char*, Arguments> commands[7] = {
       {"CDFgetzVarReservePercent", {file(), 3}},
       {"CDFsetzVarBlockingFactor", {file(), 3, 1}},
       {"CDFsetzVarInitialRecs", {file(), 3, 1}},
       {"CDFsetzVarReservePercent", {file(), 3, 1}},
       {"CDFdeletezVarRecords", {file(), 3, 0, 1}},
-      {"CDFsetzVarAllocBlockRecords", {file(), 3, 0, 1}}};
+      {"CDFsetzVarAllocBlockRecords", {file(), 3, 0, 1}},
+      {"CDFsetzVarPadValue", {file(), 3, row<std::int32_t>({1})}}};
 
   static std::string commandOf(const char* routine) {
     std::string command = routine + 3;

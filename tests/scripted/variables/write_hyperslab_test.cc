@@ -83,6 +83,20 @@ TEST_F(WriteHyperslabTest, LongVectorsNeverLetTheLibraryReadBeyondTheData) {
   EXPECT_FALSE(fake.sawNullData());
 }
 
+TEST_F(WriteHyperslabTest, NotEvenByOneByte) {
+  describe({.datatype = 1});
+  EXPECT_EQ(errorWith(0, 1, elements<std::int8_t>(0)),
+            libraryFailure("CDFhyperPutzVarData", -2039));
+}
+
+TEST_F(WriteHyperslabTest, ANegativeStartIsLeftToTheLibraryWhereverTheHyperslabEnds) {
+  describe({.datatype = 4, .sizes = {2, 2}});
+  const Given starts{-5, 0}, counts{2147483647, 0}, intervals{2, 1};
+  call("hyperPutVarData",
+       {file(), 3, 0, 1, 1, starts, counts, intervals, elements<std::int32_t>(0)});
+  EXPECT_THAT(calls().back(), testing::HasSubstr("zVAR_DIMINDICES_ [-5 0] | "));
+}
+
 TEST_F(WriteHyperslabTest, MoreThanTenCountsAreCutToWhatTheLibraryReads) {
   describe({.sizes = {2}});
   const Given ones{2, 1, 1, 1, 1, 1, 1, 1, 1, 1, 1, 1};
