@@ -50,7 +50,7 @@ class TimeLimitTest(ProtectionCase):
 class MemoryLimitTest(ProtectionCase):
     def test_a_worker_that_takes_too_much_is_given_up(self):
         self.skip_with_sanitizer()
-        process = self.start("dump", BUSY, "v", "--output", "out.csv", "--memory-limit", "40MB")
+        process = self.start("dump", BUSY, "v", "--output", "out.csv", "--memory-limit", "16MB")
         self.assertRegex(self.error_of(process), r"(?m)^ambrix: (TOLVEX:host|ambrix):outOfMemory: "
                          r"busy\.cdf: .*--memory-limit .*may allow more$")
         self.assert_nothing_left()

@@ -29,6 +29,12 @@ struct Context {
   StandardOutput& output;
 };
 
+constexpr char kOutOfMemory[] = "TOLVEX:host:outOfMemory";
+
+[[noreturn]] void tellOutOfMemory(const std::string& file) {
+  throw NamedError(file, kOutOfMemory, "there is not enough memory; --memory-limit may allow more");
+}
+
 /// Errors while the file is read are told of it; those that name a file already stay as they are.
 void readNamed(const std::string& file, const std::function<void()>& read) try {
   requireOpenable(file);
@@ -40,10 +46,10 @@ void readNamed(const std::string& file, const std::function<void()>& read) try {
 } catch (const FileError& error) {
   throw NamedError(file, error.identifier(), error.reason());
 } catch (const Error& error) {
+  if (error.identifier() == kOutOfMemory) tellOutOfMemory(file);
   throw NamedError(file, error.identifier(), error.what());
 } catch (const std::bad_alloc&) {
-  throw NamedError(file, "TOLVEX:host:outOfMemory",
-                   "there is not enough memory; --memory-limit may allow more");
+  tellOutOfMemory(file);
 }
 
 /// A worker that crashed for want of something says nothing of its file.
