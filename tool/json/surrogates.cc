@@ -1,5 +1,6 @@
 #include "tool/json/surrogates.h"
 
+#include <algorithm>
 #include <charconv>
 #include <cstddef>
 
@@ -43,7 +44,8 @@ unsigned escapedUnit(std::string_view text) {
 
 /// How much of the text can be copied as it is.
 std::size_t plainLength(std::string_view text) {
-  return std::min(text.find_first_of("\\\xF4"), text.size());
+  const auto isSpecial = [](char c) { return c == '\\' || c == '\xF4'; };
+  return static_cast<std::size_t>(std::ranges::find_if(text, isSpecial) - text.begin());
 }
 
 /// Replaces what the text begins with, a stroke or the first byte of a high character; returns how

@@ -1,5 +1,7 @@
 #include "tool/json/text.h"
 
+#include <algorithm>
+
 #include "adapters/catalogue/unicode.h"
 #include "tool/json/surrogates.h"
 
@@ -8,16 +10,22 @@ namespace {
 
 constexpr int kMaxDepth = 512;
 
+/// Watching the depth slows parsing down, so that is done only where there are enough brackets.
+Json parseWatched(std::string_view text) {
+  const auto opens = [](char c) { return c == '[' || c == '{'; };
+  if (std::ranges::count_if(text, opens) <= kMaxDepth) return Json::parse(text);
+  return Json::parse(text, [](int depth, Json::parse_event_t, const Json&) {
+    if (depth > kMaxDepth) throw JsonError("nested too deeply");
+    return true;
+  });
+}
+
 }  // namespace
 
 Json parseJson(std::string_view text) {
   if (text.find('\0') != text.npos) throw JsonError("a zero byte is no JSON");
-  const auto check = [](int depth, Json::parse_event_t, const Json&) {
-    if (depth > kMaxDepth) throw JsonError("nested too deeply");
-    return true;
-  };
   try {
-    return Json::parse(hideSurrogates(text), check);
+    return parseWatched(hideSurrogates(text));
   } catch (const Json::out_of_range&) {
     throw JsonRangeError("a number beyond the range of double");
   } catch (const Json::exception& error) {
