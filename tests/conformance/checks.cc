@@ -60,6 +60,11 @@ void messagesHaveTexts(Findings& findings) {
   findings.expect(!text.empty() && !text.starts_with("TOLVEX"), text);
 }
 
+void extendedDatatypesAreAskedFor(Findings& findings) {
+  if (qvOffersExtendedDatatypes == nullptr) return;
+  findings.expect(!qvOffersExtendedDatatypes(), "they are offered to those who did not ask");
+}
+
 struct Check {
   const char* name;
   void (*run)(Findings&);
@@ -80,6 +85,7 @@ constexpr Check kChecks[] = {
     {"plain file names stay as they are", plainFileNamesStayAsTheyAre},
     {"buffers are aligned", buffersAreAligned},
     {"messages have texts", messagesHaveTexts},
+    {"extended datatypes are asked for", extendedDatatypesAreAskedFor},
 };
 
 std::string findingsOf(const Check& check) {
