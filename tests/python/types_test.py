@@ -14,11 +14,19 @@ WRONG = {
     "commands.getVarName(1, 1) + 1": "Unsupported operand types",
     "commands.setCompression(1, None)": "incompatible type",
     "commands.putVarData(1, 2, 3, 'x', data=1, more=2)": "Unexpected keyword argument",
+    "ambrix.open(3)": "incompatible type",
+    "ambrix.open('a')[0]": "Invalid index type",
     "commands.noSuchCommand()": "has no attribute",
 }
 RIGHT = """
 import numpy as np
+import ambrix
 from ambrix import Error, commands
+with ambrix.open("a") as opened:
+    variable: ambrix.Variable = opened["b"]
+    size: int = variable.shape[0] + len(opened)
+    values = np.asarray(variable)
+    variable.raw.read((0, slice(2, 4)), out=values)
 file: int = commands.open("a")
 name, datatype, elements, sizes, varies, variances = commands.inquireVar(file, 0)
 count: int = sizes[0] + elements
@@ -53,7 +61,7 @@ class TypesTest(unittest.TestCase):
         self.assertEqual(status, 0, told)
 
     def test_wrong_arguments_are_found(self):
-        lines = ["from ambrix import commands", *WRONG]
+        lines = ["import ambrix; from ambrix import commands", *WRONG]
         (self.folder / "wrong.py").write_text("\n".join(lines) + "\n")
         _, told = self.mypy("wrong.py")
         for number, text in enumerate(WRONG.values(), 2):

@@ -1,5 +1,6 @@
 // The functions of the commands: plain functions of CPython's, which cost less than nanobind's.
 #include <array>
+#include <cmath>
 #include <utility>
 
 #include "src/arguments.h"
@@ -67,14 +68,38 @@ std::size_t placeArguments(const Row& row, const Prepared& made, PyObject* const
   return count;
 }
 
-nb::object packed(const Row& row, std::vector<Array>& results, std::size_t counts) {
+double productOf(ArrayView numbers) {
+  double product = 1;
+  visit(numbers, Overloaded{[](ArrayView) {},
+                            [&product](auto values) {
+                              for (const auto value : values)
+                                product *= std::trunc(static_cast<double>(value));
+                            }});
+  return product;
+}
+
+/// The dimensions of what "hyperGetVarData" has read: the counts, the records and, where values
+/// are made of several elements, these.
+std::size_t dimensionsOf(ArrayView block, std::span<const ArrayView> arguments) {
+  const ArrayView records = arguments[3];
+  const ArrayView counts = arguments[6];
+  const double values = productOf(counts) * productOf(records);
+  const bool several =
+      block.classId() == ClassId::kChar || static_cast<double>(block.elementCount()) > values;
+  return counts.elementCount() + (several ? 2 : 1);
+}
+
+nb::object packed(const Row& row, std::vector<Array>& results,
+                  std::span<const ArrayView> arguments) {
   if (row.resultCount == 0) return nb::none();
-  if (row.resultCount == 1) {
-    return convertResult(row.results[0], std::move(results.at(0)), counts);
+  if (row.results[0] == ResultKind::kBlock) {
+    const std::size_t dimensions = dimensionsOf(results.at(0), arguments);
+    return convertResult(ResultKind::kBlock, std::move(results[0]), dimensions);
   }
+  if (row.resultCount == 1) return convertResult(row.results[0], std::move(results.at(0)));
   nb::object tuple = nb::steal(PyTuple_New(static_cast<Py_ssize_t>(row.resultCount)));
   for (std::size_t i = 0; i < row.resultCount; ++i) {
-    nb::object item = convertResult(row.results[i], std::move(results.at(i)), counts);
+    nb::object item = convertResult(row.results[i], std::move(results.at(i)));
     PyTuple_SetItem(tuple.ptr(), static_cast<Py_ssize_t>(i), item.release().ptr());
   }
   return tuple;
@@ -82,19 +107,17 @@ nb::object packed(const Row& row, std::vector<Array>& results, std::size_t count
 
 nb::object call(const Row& row, const Prepared& made, PyObject* const* values,
                 std::size_t positional, PyObject* names) {
-  Given given{};
-  const std::size_t count = placeArguments(row, made, values, positional, names, given);
+  Given places{};
+  const std::size_t count = placeArguments(row, made, values, positional, names, places);
   std::array<Converted, kMostArguments> converted;
   std::array<ArrayView, kMostArguments> arguments;
   for (std::size_t i = 0; i < count; ++i) {
-    converted[i] = convertArgument(row.arguments[i].kind, given[i]);
+    converted[i] = convertArgument(row.arguments[i].kind, places[i]);
     arguments[i] = converted[i].array;
   }
-  std::vector<Array> results = callCommand(made.command, std::span(arguments).first(count));
-  // Only "hyperGetVarData" has so many arguments and a result; its seventh are the counts.
-  const std::size_t counts =
-      row.argumentCount > 6 && row.resultCount == 1 ? arguments[6].elementCount() : 0;
-  return packed(row, results, counts);
+  const std::span<const ArrayView> given = std::span(arguments).first(count);
+  std::vector<Array> results = callCommand(made.command, given);
+  return packed(row, results, given);
 }
 
 /// CPython tells a function nothing that it could find its row by: so there is one for each row.

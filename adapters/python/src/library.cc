@@ -39,18 +39,25 @@ struct Outcome {
   std::vector<MessageId> warnings;
 };
 
-Outcome attempt(const std::function<void(Module&)>& work) {
+Outcome attempt(const std::function<void(Module&)>& work, bool extended) {
   // The lock goes before the GIL comes back: whoever waits for the one may hold the other.
   const nb::gil_scoped_release released;
   const std::scoped_lock lock(library->mutex);
   Outcome outcome;
   try {
+    library->module.setExtended(extended);
     work(library->module);
   } catch (...) {
     outcome.failure = std::current_exception();
   }
   outcome.warnings = std::exchange(library->warnings, {});
   return outcome;
+}
+
+void finish(const Outcome& outcome) {
+  for (const MessageId& warning : outcome.warnings)
+    issueWarning(warning);
+  if (outcome.failure) std::rethrow_exception(outcome.failure);
 }
 
 }  // namespace
@@ -64,10 +71,11 @@ void startLibrary() {
 }
 
 void withModule(const std::function<void(Module&)>& work) {
-  const Outcome outcome = attempt(work);
-  for (const MessageId& warning : outcome.warnings)
-    issueWarning(warning);
-  if (outcome.failure) std::rethrow_exception(outcome.failure);
+  finish(attempt(work, false));
+}
+
+void withExtendedModule(const std::function<void(Module&)>& work) {
+  finish(attempt(work, true));
 }
 
 std::vector<Array> callCommand(ArrayView command, std::span<const ArrayView> arguments) {

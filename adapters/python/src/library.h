@@ -17,6 +17,9 @@ void startLibrary();
 /// and rethrows what the work has thrown.
 void withModule(const std::function<void(Module&)>& work);
 
+/// The same with the datatypes and commands of the module's extension, which commands do not have.
+void withExtendedModule(const std::function<void(Module&)>& work);
+
 /// Calls a command.
 std::vector<Array> callCommand(ArrayView command, std::span<const ArrayView> arguments);
 

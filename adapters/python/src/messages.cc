@@ -4,6 +4,8 @@
 #include <string>
 #include <variant>
 
+#include "ambrix/file_error.h"
+
 namespace nb = nanobind;
 
 namespace ambrix::python {
@@ -44,6 +46,12 @@ void setError(const Error& error) {
   PyErr_SetObject(exception.type().ptr(), exception.ptr());
 }
 
+void setFileError(const FileError& error) {
+  const nb::object type = nb::module_::import_("ambrix.errors").attr("Error");
+  const nb::object exception = type(textOf(error.what()), textOf(error.identifier()));
+  PyErr_SetObject(type.ptr(), exception.ptr());
+}
+
 void setErrorOf(const std::exception_ptr& failure) {
   try {
     std::rethrow_exception(failure);
@@ -51,6 +59,8 @@ void setErrorOf(const std::exception_ptr& failure) {
     error.restore();
   } catch (const Error& error) {
     setError(error);
+  } catch (const FileError& error) {
+    setFileError(error);
   } catch (const std::bad_alloc&) {
     PyErr_NoMemory();
   } catch (const std::exception& error) {

@@ -98,14 +98,10 @@ nb::object row(Array&& result) {
   return inShape(std::move(result), shape);
 }
 
-/// In front of the counts there is one size for the characters of texts and the halves of EPOCH16.
-nb::object block(Array&& result, std::size_t counts) {
+/// Sizes of 1 at the end are not in the result's own.
+nb::object block(Array&& result, std::size_t dimensions) {
   Shape shape = sizesOf(result);
-  const bool isChar = result.classId() == ClassId::kChar;
-  const std::size_t least = counts + (isChar ? 2 : 1);
-  while (shape.size() > least && shape.back() == 1)
-    shape.pop_back();
-  shape.resize(std::max(shape.size(), least), 1);
+  shape.resize(dimensions, 1);
   return inShape(std::move(result), shape);
 }
 
@@ -140,7 +136,7 @@ nb::object flag(bool value) {
 
 }  // namespace
 
-nb::object convertResult(ResultKind kind, Array&& result, std::size_t counts) {
+nb::object convertResult(ResultKind kind, Array&& result, std::size_t dimensions) {
   switch (kind) {
     case ResultKind::kIdentifier:
       return nb::int_(result.data<std::uint64_t>().front());
@@ -163,7 +159,7 @@ nb::object convertResult(ResultKind kind, Array&& result, std::size_t counts) {
     case ResultKind::kRow:
       return row(std::move(result));
     case ResultKind::kBlock:
-      return block(std::move(result), counts);
+      return block(std::move(result), dimensions);
     case ResultKind::kArray:
       break;
   }

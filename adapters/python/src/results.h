@@ -10,8 +10,8 @@
 
 namespace ambrix::python {
 
-/// Converts a result, whose memory goes with it where it is large. `counts` is the number of counts
-/// that a block was asked for by.
-nanobind::object convertResult(ResultKind kind, Array&& result, std::size_t counts);
+/// Converts a result, whose memory goes with it where it is large. A block has so many dimensions,
+/// with the characters of texts and the two numbers of EPOCH16 as the first.
+nanobind::object convertResult(ResultKind kind, Array&& result, std::size_t dimensions = 0);
 
 }  // namespace ambrix::python

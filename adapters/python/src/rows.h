@@ -32,7 +32,7 @@ enum class ResultKind {
   kParameter,  // nothing, a number or a text
   kValue,      // an array without its trailing sizes of 1; a single value is a scalar
   kRow,        // an array without the leading size of 1
-  kBlock,      // an array with a size for each count and one for the records
+  kBlock,      // an array with a dimension for each count and one for the records
   kArray,      // an array with the sizes of the module
 };
 

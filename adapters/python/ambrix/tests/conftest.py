@@ -3,7 +3,7 @@ import pathlib
 
 import pytest
 
-from ambrix import _core
+from ambrix import _core, commands
 from ambrix.tests.support import manual
 
 
@@ -34,8 +34,10 @@ def example(example_home, folder):
 
 @pytest.fixture(autouse=True)
 def leaks():
-    """No test leaves anything behind in the module."""
+    """No test leaves anything behind in the module, nor the library in another mode."""
     yield
+    commands.setFileBackward("BACKWARDFILEOFF")
+    commands.setValidate("VALIDATEFILEON")
     assert _core.leaks() == (0, 0)
 
 
