@@ -4,6 +4,9 @@
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
+#include <algorithm>
+#include <string>
+
 #include "tests/inflate/compressed.h"
 #include "tests/inflate/reading.h"
 
