@@ -13,7 +13,8 @@ from readers.content import leading_of
 HERE = Path(__file__).parent
 SPARSE = {"NO_SPARSERECORDS": "no", "PAD_SPARSERECORDS": "pad", "PREV_SPARSERECORDS": "previous"}
 TYPES = {"double": "<f8", "single": "<f4", "char": "u1", "logical": "u1", "int8": "i1",
-         "uint8": "u1", "int16": "<i2", "uint16": "<u2", "int32": "<i4", "uint32": "<u4"}
+         "uint8": "u1", "int16": "<i2", "uint16": "<u2", "int32": "<i4", "uint32": "<u4",
+         "int64": "<i8"}
 
 
 def octave(*arguments):
@@ -130,15 +131,15 @@ def _attribute(listed, content):
 
 
 def content(path):
-    """What ambrix_read found; variables of an unsupported datatype are None."""
+    """What ambrix_read found."""
     read = load(path)
     found = Content(as_text(read["file"]["majority"]) == "ROW_MAJOR")
     if flat(read["library"]) < (3, 9):
         found.nul_reads_as = ord(" ")
     for field, described in read["variables"].items():
-        supported = bool(described["supported"].item())
-        found.variables[as_text(described["name"])] = (
-            _variable(described, read["data"][field]) if supported else None)
+        if not described["supported"].item():
+            raise AssertionError(f"{field}: {as_text(described['datatype'])} is not supported")
+        found.variables[as_text(described["name"])] = _variable(described, read["data"][field])
     for listed in read["attributeList"].values():
         name, attribute = _attribute(listed, read)
         found.attributes[name] = attribute

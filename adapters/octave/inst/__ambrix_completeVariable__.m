@@ -50,7 +50,7 @@ function [v, data] = storable (v, data, options)
     error ("ambrix:unsupportedClass",
            "ambrix_write: variable \"%s\" is complex, and no datatype is", v.name);
   endif
-  if (isfloat (data) && strncmp (v.datatype, "CDF_EPOCH", 9))
+  if (isfloat (data) && __ambrix_isTime__ (v.datatype))
     data = __ambrix_toEpochs__ (data, v.datatype, options, sprintf ("variable \"%s\"", v.name));
   endif
   if (options.fill && isfloat (data) && isfield (v.attributes, "FILLVAL"))
@@ -66,7 +66,7 @@ function data = withFill (data, v, records)
   fill = v.attributes.FILLVAL;
   missing = isnan (data);
   if (isnumeric (fill) && isscalar (fill))
-    data(missing) = fill;
+    data(missing) = double (fill);  # an integer would make integers of the data
   elseif (isnumeric (fill) && numel (fill) == 2 && strcmp (v.datatype, "CDF_EPOCH16"))
     times = numel (data) / 2;
     fills = kron (fill(:), ones (times, 1));
@@ -107,7 +107,7 @@ endfunction
 
 %!shared s
 %! s.options = struct ("records", "first", "time", [], "fill", false);
-%! s.data = struct ("a", single ([1, 2, 3; 4, 5, 6]), "t", {{"ab"; "c"}}, "d", int64 (1), ...
+%! s.data = struct ("a", single ([1, 2, 3; 4, 5, 6]), "t", {{"ab"; "c"}}, "d", uint64 (1), ...
 %!                  "i", true, "c", 1i);
 %!test
 %! [v, data] = __ambrix_completeVariable__ ("a", struct (), s, false);
@@ -126,6 +126,12 @@ endfunction
 %!test
 %! [v, data] = __ambrix_completeVariable__ ("i", struct (), s, false);
 %! assert ({v.datatype, data}, {"CDF_UINT1", uint8(1)});
+%!test  # a fill value of another class
+%! v.attributes.FILLVAL = int32 (-1);
+%! given = struct ("data", struct ("a", single ([1; NaN])), "options", s.options);
+%! given.options.fill = true;
+%! [~, data] = __ambrix_completeVariable__ ("a", v, given, false);
+%! assert (data, single ([1; -1]));
 %!error <no datatype holds variable "d">
 %! __ambrix_completeVariable__ ("d", struct (), s, false);
 %!error id=ambrix:unsupportedClass __ambrix_completeVariable__ ("c", struct (), s, false);

@@ -2,8 +2,8 @@
 ## @deftypefn {} {[@var{s}, @var{left}] =} __ambrix_describeFile__ (@var{id})
 ## Describe everything in a file but the data, as @code{ambrix_info} returns it.
 ##
-## @var{left} lists the entries of attributes that had to be left out because their datatype is not
-## supported, but for those of variables of such a datatype.
+## @var{left} lists the entries of attributes that had to be left out because the library does not
+## know their datatype, but for those of variables of such a datatype.
 ## @end deftypefn
 
 function [s, left] = __ambrix_describeFile__ (id)
@@ -78,7 +78,7 @@ function v = withStorage (id, v)
   v.blockingFactor = __ambrix__ ("getVarBlockingFactor", id, v.number);
   v.padValue = [];
   if (v.supported)
-    v.padValue = __ambrix__ ("getVarPadValue", id, v.number)(:).';
+    v.padValue = __ambrix__ ("-extended", "getVarPadValue", id, v.number)(:).';
   endif
   v.attributes = struct ();
 endfunction

@@ -3,7 +3,7 @@
 ## Describe a variable: the definition that reading and writing need. Sizes and variances are in the
 ## file's order.
 ##
-## Of a variable whose datatype is not supported @var{v}.supported is false.
+## Of a variable whose datatype the library does not know @var{v}.supported is false.
 ## @end deftypefn
 
 function v = __ambrix_describeVariable__ (id, number, rowMajor)
@@ -12,11 +12,11 @@ function v = __ambrix_describeVariable__ (id, number, rowMajor)
   v.supported = true;
   try
     [~, v.datatype, v.elements, v.sizes, v.recordVariance, v.variances] = ...
-      __ambrix__ ("inquireVar", id, number);
+      __ambrix__ ("-extended", "inquireVar", id, number);
+    v.datatype = upper (v.datatype);
   catch err
     v = unsupported (v, err);
   end_try_catch
-  v.datatype = upper (v.datatype);
   if (rowMajor)
     v.sizes = fliplr (v.sizes);
     v.variances = fliplr (v.variances);
@@ -28,13 +28,8 @@ function v = unsupported (v, err)
   if (! strcmp (err.identifier, "TOLVEX:ambrix:cdflib:unrecognizedValue"))
     rethrow (err);
   endif
-  code = regexp (err.message, '\d+', "match", "once");
-  names = struct ("c8", "CDF_INT8", "c33", "CDF_TIME_TT2000");
   v.supported = false;
-  v.datatype = ["datatype " code];
-  if (isfield (names, ["c" code]))
-    v.datatype = names.(["c" code]);
-  endif
+  v.datatype = ["datatype " regexp(err.message, '\d+', "match", "once")];
   [v.elements, v.sizes, v.recordVariance, v.variances] = deal (1, [], true, logical ([]));
 endfunction
 

@@ -73,6 +73,11 @@ function text = shownValue (value)
     blank = isspace (value);  # no regular expression: those refuse texts that are not UTF-8
     value(blank) = " ";
     text = value(! (blank & [false, blank](1:numel (blank))));
+  elseif (isinteger (value))  # mat2str would make doubles of them
+    text = sprintf (" %d", value)(2:end);
+    if (! isscalar (value))
+      text = ["[" text "]"];
+    endif
   else
     text = mat2str (value, 7);
   endif
@@ -111,6 +116,14 @@ endfunction
 %!          "  Flux  CDF_REAL4   2-by-3  2        km/s", ...
 %!          "  Mode  CDF_CHAR*4          2", ""};
 %! assert (__ambrix_descriptionText__ (s), strjoin (lines, "\n"));
+%!test  # all digits of integers
+%! [id, restore] = __ambrix_example__ ();
+%! ambrix_close (id);
+%! most = intmax ("int64");
+%! ambrix_write ("digits", struct ("data", struct (), "attributes", ...
+%!                                 struct ("a", most - 1, "b", int32 ([123456789, -1]))));
+%! lines = ostrsplit (__ambrix_descriptionText__ (ambrix_info ("digits")), "\n");
+%! assert (lines(4:5), {"  a  9223372036854775806", "  b  [123456789 -1]"});
 %!test  # characters of two bytes, and bytes that are none
 %! [id, restore] = __ambrix_example__ ();
 %! ambrix_putAttrgEntry (id, 0, 0, "CDF_CHAR", ["a" repmat(char ([195, 169]), 1, 60)]);

@@ -156,7 +156,7 @@ function axis = numbered (count, label)
 endfunction
 
 function time = isTime (v)
-  time = strncmp (v.datatype, "CDF_EPOCH", 9);
+  time = __ambrix_isTime__ (v.datatype);
 endfunction
 
 function numbers = hasNumbers (v)

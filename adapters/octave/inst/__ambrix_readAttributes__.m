@@ -3,8 +3,9 @@
 ## Put the attributes of a file into its description.
 ##
 ## @var{names} are the fields of the variables by number. @var{left} lists the entries that had to
-## be left out because their datatype is not supported, but for those of variables of such a
-## datatype. @end deftypefn
+## be left out because the library does not know their datatype, but for those of variables of such
+## a datatype.
+## @end deftypefn
 
 function [s, left] = __ambrix_readAttributes__ (id, s, names, count)
   list = struct ("name", cell (1, count), "scope", "", "entries", [], "datatypes", []);
@@ -69,8 +70,9 @@ endfunction
 function entry = readEntry (id, attribute, kind, number)
   entry = struct ("number", number, "datatype", "", "value", []);
   try
-    entry.datatype = upper (__ambrix__ (["inquireAttr" kind "Entry"], id, attribute, number));
-    entry.value = __ambrix__ (["getAttr" kind "Entry"], id, attribute, number);
+    entry.datatype = upper (__ambrix__ ("-extended", ["inquireAttr" kind "Entry"], id, attribute,
+                                         number));
+    entry.value = __ambrix__ ("-extended", ["getAttr" kind "Entry"], id, attribute, number);
   catch err
     if (isMissing (err))
       entry = [];

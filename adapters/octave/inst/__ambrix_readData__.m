@@ -13,8 +13,9 @@ function [data, v] = __ambrix_readData__ (id, v, rowMajor, options, fill)
   endif
   [order, lead] = __ambrix_axesOf__ (v, rowMajor, options.records);
   if (range.count > 0)
-    data = __ambrix__ ("hyperGetVarData", id, v.number, range.start, range.count, range.step,
-                       slab.start(hostOrder), slab.count(hostOrder), slab.step(hostOrder));
+    data = __ambrix__ ("-extended", "hyperGetVarData", id, v.number, range.start, range.count,
+                       range.step, slab.start(hostOrder), slab.count(hostOrder),
+                       slab.step(hostOrder));
   else
     data = emptyOf (v.datatype);
   endif
@@ -22,7 +23,7 @@ function [data, v] = __ambrix_readData__ (id, v, rowMajor, options, fill)
   isText = any (strcmp (v.datatype, {"CDF_CHAR", "CDF_UCHAR"}));
   if (isText)
     v.filler = fillerOf (data);
-  elseif (options.time && strncmp (v.datatype, "CDF_EPOCH", 9))
+  elseif (options.time && __ambrix_isTime__ (v.datatype))
     [data, order] = __ambrix_toDays__ (data, order, v.datatype);
   elseif (isfloat (data) && isnumeric (fill))
     data = withoutFill (data, fill, lead);

@@ -39,7 +39,8 @@ endfunction
 function readVariable (id, v, sizes)
   for first = 0:1000:v.records - 1
     count = min (1000, v.records - first);
-    ambrix_hyperGetVarData (id, v.number, first, count, 1, 0 * sizes, sizes, ones (size (sizes)));
+    __ambrix__ ("-extended", "hyperGetVarData", id, v.number, first, count, 1, 0 * sizes, sizes,
+                ones (size (sizes)));
     printf (".\n");
     fflush (stdout);
   endfor

@@ -6,7 +6,7 @@
 
 function values = __ambrix_validOf__ (values, attributes)
   kind = class (values);
-  values = double (values);
+  invalid = false (size (values));
   for [limit, name] = attributes
     if (! isnumeric (limit) || ! any (numel (limit) == [1, columns(values)]))
       continue;
@@ -14,15 +14,17 @@ function values = __ambrix_validOf__ (values, attributes)
     if (any (strcmp (kind, {"single", "double"})))
       limit = cast (limit, kind);  # of single data these may be doubles
     endif
-    limit = double (limit(:).');
+    limit = limit(:).';
     if (strcmp (name, "FILLVAL"))
-      values(values == limit) = NaN;
+      invalid |= values == limit;
     elseif (strcmp (name, "VALIDMIN"))
-      values(values < limit) = NaN;
+      invalid |= values < limit;
     elseif (strcmp (name, "VALIDMAX"))
-      values(values > limit) = NaN;
+      invalid |= values > limit;
     endif
   endfor
+  values = double (values);
+  values(invalid) = NaN;
 endfunction
 
 %!test
@@ -32,3 +34,8 @@ endfunction
 %!test  # a double fill value of single data
 %! assert (__ambrix_validOf__ (single ([0.1; 2]), struct ("FILLVAL", 0.1)), [NaN; 2]);
 %!assert (__ambrix_validOf__ (single ([0.1; 2]), struct ("VALIDMIN", 0.1)), double (single ([0.1; 2])))
+%!test  # neighbours that are the same double
+%! most = intmax ("int64");
+%! limits = struct ("FILLVAL", most - 1, "VALIDMIN", 0);
+%! found = __ambrix_validOf__ (most - int64 ([0; 1; 2]), limits);
+%! assert (isnan (found), [false; true; false]);

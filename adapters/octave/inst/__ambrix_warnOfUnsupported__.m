@@ -1,6 +1,6 @@
 ## -*- texinfo -*-
 ## @deftypefn {} {} __ambrix_warnOfUnsupported__ (@var{caller}, @var{file}, @var{left})
-## Warn of what was left out because its datatype is not supported, if anything was.
+## Warn of what could not be read and was left out, if anything was.
 ## @end deftypefn
 
 function __ambrix_warnOfUnsupported__ (caller, file, left)

@@ -73,9 +73,12 @@ function writeOfVariables (id, number, attribute, variables, numbers)
     what = sprintf ("attribute \"%s\" of \"%s\"", attribute.name, name);
     value = v.attributes.(attribute.field);
     datatype = [attribute.datatypes(strcmp (attribute.entries, name)), {""}]{1};
-    if (isempty (datatype) && isLimit (attribute.name))
+    isNewLimit = isempty (datatype) && isLimit (attribute.name);
+    if (isNewLimit)
       datatype = v.datatype;
-      value = limitOf (v, value, what);
+    endif
+    if (isNewLimit || strcmp (datatype, "CDF_TIME_TT2000"))
+      value = limitOf (datatype, value, what);
     endif
     put (id, number, numbers.(name), datatype, value, what);
   endfor
@@ -87,9 +90,9 @@ function limit = isLimit (name)
 endfunction
 
 ## Times may be serial day numbers, as they may be in data.
-function value = limitOf (v, value, what)
-  if (isfloat (value) && strncmp (v.datatype, "CDF_EPOCH", 9))
-    value = __ambrix_toEpochs__ (value, v.datatype, struct ("records", "first", "time", []), what);
+function value = limitOf (datatype, value, what)
+  if (isfloat (value) && __ambrix_isTime__ (datatype))
+    value = __ambrix_toEpochs__ (value, datatype, struct ("records", "first", "time", []), what);
   endif
 endfunction
 
@@ -112,7 +115,8 @@ function put (id, number, entry, datatype, value, what)
     value = "\0";  # an entry has one character at least
   endif
   try
-    ambrix_putAttrEntry (id, number, entry, datatype, value);
+    code = __ambrix__ ("-extended", "getConstantValue", datatype);
+    __ambrix__ ("-extended", "putAttrEntry", id, number, entry, code, value);
   catch err
     __ambrix_raiseFor__ ("ambrix_write", what, err);
   end_try_catch
@@ -147,6 +151,22 @@ endfunction
 %! assert (r.data.t, s.data.t);
 %! assert (r.variables.t.attributes.VALIDMIN, ambrix_computeEpoch ([2000; 1; 1; 0; 0; 0; 0]));
 %! assert (r.variables.t.attributes.FILLVAL, -1e31);
+%!test  # also those of a CDF_TIME_TT2000, and those that replace others
+%! [id, restore] = __ambrix_example__ ();
+%! ambrix_close (id);
+%! s.data.t = datenum (2024, 1, [1; 2]);
+%! s.variables.t.datatype = "CDF_TIME_TT2000";
+%! s.variables.t.attributes = struct ("VALIDMIN", datenum (2000, 1, 1), "FILLVAL", NaN);
+%! s.attributes.Serial = intmin ("int64") + 5;
+%! ambrix_write ("days", s);
+%! r = ambrix_read ("days");
+%! assert (r.attributes.Serial, intmin ("int64") + 5);
+%! limit = ambrix_computeTT2000 ([2000; 1; 1; zeros(6, 1)]);
+%! assert (r.variables.t.attributes, struct ("VALIDMIN", limit, "FILLVAL", intmin ("int64")));
+%! assert ([r.attributeList.datatypes], {"CDF_INT8", "CDF_TIME_TT2000", "CDF_TIME_TT2000"});
+%! r.variables.t.attributes.VALIDMIN = datenum (2000, 1, 1, 0, 0, 0.5);
+%! ambrix_write ("days", r, "overwrite");
+%! assert (ambrix_info ("days").variables.t.attributes.VALIDMIN, limit + int64 (5e8));
 %!test  # blanks at the end of new names
 %! [id, restore] = __ambrix_example__ ();
 %! ambrix_close (id);

@@ -8,8 +8,9 @@ function number = __ambrix_writeVariable__ (id, v, data, rowMajor)
     v.sizes = fliplr (v.sizes);
     v.variances = fliplr (v.variances);
   endif
-  number = ambrix_createVar (id, v.name, v.datatype, v.elements, v.sizes, v.recordVariance,
-                             v.variances);
+  datatype = __ambrix__ ("-extended", "getConstantValue", v.datatype);
+  number = __ambrix__ ("-extended", "createVar", id, v.name, datatype, v.elements, v.sizes,
+                       v.recordVariance, v.variances);
   applySettings (id, number, v);
   for run = runsToWrite (v, data)
     first = run(1);
@@ -18,8 +19,8 @@ function number = __ambrix_writeVariable__ (id, v, data, rowMajor)
     if (count != v.records)
       part = reshape (data, [], v.records)(:,first+1:first+count);
     endif
-    __ambrix__ ("hyperPutVarData", id, number, first, count, 1, zeros (size (v.sizes)), v.sizes,
-                ones (size (v.sizes)), part);
+    __ambrix__ ("-extended", "hyperPutVarData", id, number, first, count, 1,
+                zeros (size (v.sizes)), v.sizes, ones (size (v.sizes)), part);
   endfor
 endfunction
 
@@ -33,7 +34,7 @@ function applySettings (id, number, v)
     ambrix_setVarSparseRecords (id, number, v.sparseRecords);
   endif
   if (isfield (v, "padValue") && ! isempty (v.padValue))
-    ambrix_setVarPadValue (id, number, v.padValue);
+    __ambrix__ ("-extended", "setVarPadValue", id, number, v.padValue);
   endif
   if (isfield (v, "blockingFactor") && v.blockingFactor > 0)
     ambrix_setVarBlockingFactor (id, number, v.blockingFactor);

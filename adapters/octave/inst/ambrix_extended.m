@@ -6,7 +6,8 @@
 ## Without it, which is the default, @code{ambrix_getVarData} and the other functions of the
 ## commands know 15 datatypes and raise @code{unrecognizedValue} for @code{CDF_INT8} and
 ## @code{CDF_TIME_TT2000}, as they do in every host of the commands. With it, values of both are
-## arrays of class int64, and both names are constants.
+## arrays of class int64, and both names are constants. The functions for whole files, such as
+## @code{ambrix_read}, always support both, and do not change the setting.
 ##
 ## @var{on} is true or false. The setting holds until Octave ends or clears the function
 ## @code{__ambrix__}. @code{ambrix_computeTT2000} and @code{ambrix_tt2000Breakdown} work either way.
@@ -19,7 +20,7 @@
 ## ambrix_extended (before);
 ## @end group
 ## @end example
-## @seealso{ambrix_computeTT2000, ambrix_tt2000Breakdown, ambrix_getVarData}
+## @seealso{ambrix_computeTT2000, ambrix_tt2000Breakdown, ambrix_getVarData, ambrix_read}
 ## @end deftypefn
 
 function before = ambrix_extended (on)

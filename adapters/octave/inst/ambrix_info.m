@@ -31,10 +31,9 @@
 ## Sizes are in the order of the file, whatever its majority, as are those of what
 ## @code{ambrix_read} returns. Names that Octave has no identifiers for are fields all the same:
 ## @code{s.variables.("B field")}; blanks at
-## the end of a name are left out there, and kept in @code{name}. A variable whose datatype is not
-## supported has @code{supported} false and no pad value; entries of such a datatype are left out,
-## with the warning
-## @code{ambrix:unsupportedDatatype}.
+## the end of a name are left out there, and kept in @code{name}. A variable whose datatype the
+## library does not know has @code{supported} false and no pad value; entries of such a datatype are
+## left out, with the warning @code{ambrix:unsupportedDatatype}.
 ##
 ## @example
 ## @group

@@ -28,7 +28,7 @@
 ## The first dimension of data is that of the records, so that a scalar variable is a column; those
 ## of the variable follow in the order of the file, whatever its majority. Where values don't
 ## differ from record to record there is no dimension for records. Data have the class that belongs
-## to the datatype. Texts are in a cell array, without the blanks that fill them up. The two
+## to the datatype, which is int64 for CDF_INT8 and CDF_TIME_TT2000. Texts are in a cell array, without the blanks that fill them up. The two
 ## numbers of an EPOCH16, seconds and picoseconds, are along a last dimension.
 ##
 ## The options are:
@@ -42,17 +42,21 @@
 ## @item @qcode{"slab"}, @{@var{range}, @dots{}@}
 ## Read these elements only: a range for each dimension of the variable, empty for all of it.
 ## @item @qcode{"time"}
-## Turn epochs into Octave's serial day numbers, as @code{datestr} takes them, and their fill value
-## into NaN.
+## Turn epochs and CDF_TIME_TT2000 times into Octave's serial day numbers, as @code{datestr} takes
+## them, and their fill value into NaN.
 ## @item @qcode{"fill"}
 ## Turn the values of floating point variables that equal their attribute FILLVAL into NaN.
 ## @item @qcode{"text"}, @qcode{"cell"} or @qcode{"char"}
 ## With @qcode{"char"} texts are arrays of characters, all of them, along a last dimension.
 ## @end table
 ##
-## Variables and entries of attributes whose datatype is not supported are left out, with the
-## warning
-## @code{ambrix:unsupportedDatatype}. A wrong option is the error @code{ambrix:invalidOption}; other
+## Day numbers of our time cannot tell times within 10 microseconds apart. Values of CDF_TIME_TT2000
+## are nanoseconds: read them as they are where these matter, and use @code{ambrix_tt2000Breakdown}.
+## A time in a leap second, 23:59:60, has the same day number as 00:00:00 of the next day. The pad
+## value of the library is the day number 1.
+##
+## Variables and entries of attributes whose datatype the library does not know are left out, with
+## the warning @code{ambrix:unsupportedDatatype}. A wrong option is the error @code{ambrix:invalidOption}; other
 ## errors are those of the commands.
 ##
 ## @example
@@ -62,7 +66,7 @@
 ## plot (t, B)
 ## @end group
 ## @end example
-## @seealso{ambrix_info, ambrix_write, ambrix_plot, ambrix_hyperGetVarData}
+## @seealso{ambrix_info, ambrix_write, ambrix_plot, ambrix_tt2000Breakdown, ambrix_hyperGetVarData}
 ## @end deftypefn
 
 function result = ambrix_read (file, names = {}, varargin)
@@ -111,10 +115,10 @@ endfunction
 ## The error of the command names a number of a datatype only.
 function refuse (id, name, v)
   try
-    __ambrix__ ("inquireVar", id, v.number);
+    __ambrix__ ("-extended", "inquireVar", id, v.number);
   catch err
     error (err.identifier,
-           "ambrix_read: variable \"%s\" in \"%s\" has the datatype %s, which is not supported",
+           "ambrix_read: variable \"%s\" in \"%s\" has %s, which is not supported",
            name, __ambrix__ ("getName", id), v.datatype);
   end_try_catch
 endfunction
@@ -124,7 +128,8 @@ function fill = fillOf (id, number, wanted)
   fill = [];
   try
     if (wanted)
-      fill = __ambrix__ ("getAttrEntry", id, __ambrix__ ("getAttrNum", id, "FILLVAL"), number);
+      fill = __ambrix__ ("-extended", "getAttrEntry", id,
+                         __ambrix__ ("getAttrNum", id, "FILLVAL"), number);
     endif
   end_try_catch
 endfunction

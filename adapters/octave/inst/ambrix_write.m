@@ -51,8 +51,13 @@
 ## the first hours of the year 0. Numbers that are not what @code{s.options.time} says are the error
 ## @code{ambrix:invalidTime}. Day numbers are written to the millisecond.
 ##
+## Values of a CDF_TIME_TT2000 variable are of class int64, as @code{ambrix_computeTT2000} makes
+## them. Doubles are always taken for serial day numbers, of the years 1707 to 2292, and written to
+## 20 microseconds. NaN is written as the fill value, @code{intmin ("int64")}.
+##
 ## The datatypes by class: double CDF_DOUBLE, single CDF_FLOAT, int8 CDF_INT1, int16 CDF_INT2, int32
-## CDF_INT4, uint8 and logical CDF_UINT1, uint16 CDF_UINT2, uint32 CDF_UINT4, text CDF_CHAR.
+## CDF_INT4, int64 CDF_INT8, uint8 and logical CDF_UINT1, uint16 CDF_UINT2, uint32 CDF_UINT4, text
+## CDF_CHAR.
 ##
 ## What @code{ambrix_read} has read is written back the same, but for the encoding, which becomes
 ## that of the computer, for rVariables, which become zVariables, and for what it had to leave out.
@@ -68,7 +73,7 @@
 ## ambrix_write ("field", s);
 ## @end group
 ## @end example
-## @seealso{ambrix_read, ambrix_info, ambrix_create}
+## @seealso{ambrix_read, ambrix_info, ambrix_computeTT2000, ambrix_create}
 ## @end deftypefn
 
 function ambrix_write (file, s, varargin)

@@ -33,13 +33,12 @@ enum class Datatype : int {
   kUchar = 52,
 };
 
-/// What is known of a datatype. Commands take kInt8 and kTimeTt2000 only when the module is
-/// extended
-/// (`Module::setExtended`).
+/// What is known of a datatype.
 struct DatatypeFacts {
   Datatype datatype;
   std::string_view name;  // as the commands tell it: "cdf_int4"
-  ClassId classId;        // of arrays that hold its values
+  /// The class of arrays that hold its values; kUnknown for the datatypes that commands refuse.
+  ClassId classId;
   /// The array elements of one value; 0 for characters, where it is the length of the text.
   std::size_t elements;
 };
