@@ -9,10 +9,11 @@ from ambrix import _core, commands
 from ambrix.attributes import Attributes, Entry
 from ambrix.errors import CdfWarning, Error, OutOfMemoryError
 from ambrix.file import File, close_all, open
+from ambrix.file_cache import set_cache_size
 from ambrix.variable import Variable
 
 __all__ = ["Attributes", "CdfWarning", "Entry", "Error", "File", "OutOfMemoryError", "Variable",
-           "commands", "open"]
+           "commands", "open", "set_cache_size"]
 __version__: str = _core.__version__
 
 # The last is done first. Files of commands are closed while warnings of them can still be shown.

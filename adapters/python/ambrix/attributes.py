@@ -43,7 +43,7 @@ class Attributes(Mapping[str, Any]):
     """Attributes by their names.
 
     `attributes[name]` is the value of the entry: a `str`, a NumPy scalar of exactly its datatype or
-    an array. Where a global attribute has several entries, or none numbered 0, it is a list of them.
+    an array. Of a global attribute with several entries it is a list of their values.
     """
 
     def __init__(self, entries: dict[str, list[Entry]]) -> None:

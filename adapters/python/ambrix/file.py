@@ -18,8 +18,8 @@ _files: "weakref.WeakSet[File]" = weakref.WeakSet()
 class File(Mapping[str, Variable]):
     """A file that is open for reading: a mapping of its variables by name.
 
-    What the file tells of itself is read when it is opened, and known also when it is closed; values
-    are read when they are asked for.
+    What the file tells of itself is read when it is opened, and known also when it is closed.
+    Values are read when they are asked for.
 
     Attributes:
         path: the file, as an absolute path; "<bytes>" for one in memory.

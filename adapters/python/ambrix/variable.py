@@ -112,7 +112,8 @@ class Variable:
 
     def _without_fill(self, values: Any, raw: Any, fill: bool, valid: bool) -> Any:
         value = fill_of(self.attrs, self._type)
-        filled = np.zeros(np.shape(values), bool) if value is None else equal(raw, value, self._type)
+        filled = (np.zeros(np.shape(values), bool) if value is None
+                  else equal(raw, value, self._type))
         if fill and self.dtype.kind in "fM":
             values = np.where(filled, np.array("NaT" if self.dtype.kind == "M" else "nan",
                                                self.dtype), values)

@@ -16,7 +16,7 @@ from ambrix.tests.support import made
 def path(folder):
     """A file with attributes of several kinds."""
     file = commands.create("told")
-    made.add(file, "Epoch", "CDF_EPOCH", commands.computeEpoch([[2024], [1], [1], [0], [0], [0], [0]]))
+    made.add(file, "Epoch", "CDF_EPOCH", commands.computeEpoch([2024, 1, 1, 0, 0, 0, 0]))
     made.add(file, "Flux ", "CDF_REAL4", np.zeros((1, 2), "f4"))
     for name, datatype, value in (("UNITS", "CDF_CHAR", "km/s"), ("CATDESC", "CDF_CHAR", "<Flux>"),
                                   ("FILLVAL", "CDF_REAL4", np.float32(-1e31)),
