@@ -11,7 +11,7 @@ std::optional<Array> File::attributeValue(const Variable& variable, std::string_
   const Attribute found = attribute(*number);
   if (found.global) return std::nullopt;
   std::exception_ptr failure;
-  const auto entry = EntryReader(*this, found).find(variable.number, failure);
+  const auto entry = EntryReader(*this, found, options_.observer).find(variable.number, failure);
   if (!entry) return std::nullopt;
   return value(found, entry->number);
 }

@@ -79,7 +79,7 @@ void File::deleteAttribute(const Attribute& attribute) {
 
 Entry File::entry(const Attribute& attribute, std::size_t number) {
   requireOpen();
-  return EntryReader(*this, attribute).inquire(number);
+  return EntryReader(*this, attribute, options_.observer).inquire(number);
 }
 
 std::vector<Entry> File::entries(const Attribute& attribute) {
@@ -92,7 +92,7 @@ std::vector<Entry> File::entries(const Attribute& attribute) {
 /// are found otherwise.
 void File::forEachEntry(const Attribute& attribute,
                         const std::function<void(const Entry&)>& function) {
-  EntryReader reader(*this, attribute);
+  EntryReader reader(*this, attribute, options_.observer);
   std::size_t remaining = reader.count();
   std::exception_ptr failure;
   std::size_t number = 0;
@@ -108,12 +108,12 @@ void File::forEachEntry(const Attribute& attribute,
     function(reader.inquire(far));
     --remaining;
   }
-  if (remaining > 0 && failure) std::rethrow_exception(failure);
+  if (remaining > 0 && failure) reader.rethrow(failure);
 }
 
 Array File::value(const Attribute& attribute, std::size_t entry) {
   requireOpen();
-  return EntryReader(*this, attribute).value(entry);
+  return EntryReader(*this, attribute, options_.observer).value(entry);
 }
 
 void File::putEntry(const Attribute& attribute, std::size_t entry, Datatype datatype,
@@ -131,13 +131,13 @@ void File::deleteEntry(const Attribute& attribute, std::size_t entry) {
 }
 
 AttributeDescription File::describeAttribute(std::size_t number) {
-  EntryFinder finder(*this);
+  EntryFinder finder(*this, options_.observer);
   return describeAttribute(number, finder);
 }
 
 AttributeDescription File::describeAttribute(std::size_t number, EntryFinder& finder) {
   AttributeDescription description{attribute(number), {}};
-  EntryReader reader(*this, description.attribute);
+  EntryReader reader(*this, description.attribute, options_.observer);
   for (const Entry& entry : finder.find(description.attribute)) {
     Array value = entry.supported ? reader.value(entry.number) : Array();
     description.entries.push_back({entry, std::move(value)});
@@ -152,7 +152,7 @@ FileDescription File::describe() {
   for (std::size_t number = 0; number < variables; ++number)
     description.variables.push_back(describeVariable(number));
   const std::size_t attributes = attributeCount();
-  EntryFinder finder(*this);
+  EntryFinder finder(*this, options_.observer);
   for (std::size_t number = 0; number < attributes; ++number)
     description.attributes.push_back(describeAttribute(number, finder));
   return description;

@@ -88,11 +88,13 @@ bool scanParts(Scanner& scanner, CalendarTime& time) {
 }
 
 /// The CDF library would count months beyond the twelfth into the next year.
-bool isTime(const CalendarTime& time) {
+bool isTime(const CalendarTime& time, bool leapSeconds) {
   const auto part = [&](std::size_t i) { return static_cast<unsigned>(time.parts[i]); };
   const std::chrono::year_month_day date(std::chrono::year(static_cast<int>(part(0))),
                                          std::chrono::month(part(1)), std::chrono::day(part(2)));
-  return date.ok() && part(3) < 24 && part(4) < 60 && part(kSeconds) < 60;
+  const bool isLast = part(3) == 23 && part(4) == 59;
+  const unsigned seconds = leapSeconds && isLast ? 61 : 60;
+  return date.ok() && part(3) < 24 && part(4) < 60 && part(kSeconds) < seconds;
 }
 
 }  // namespace
@@ -109,12 +111,12 @@ std::string calendarText(std::span<const double> parts) {
   return text;
 }
 
-CalendarTime parseCalendarTime(std::string_view text) {
+CalendarTime parseCalendarTime(std::string_view text, bool leapSeconds) {
   CalendarTime time;
   if (text.empty()) return time;
   const std::string_view local = text.ends_with('Z') ? text.substr(0, text.size() - 1) : text;
   Scanner scanner(local);
-  if (!scanParts(scanner, time) || !scanner.atEnd() || !isTime(time)) {
+  if (!scanParts(scanner, time) || !scanner.atEnd() || !isTime(time, leapSeconds)) {
     throw std::invalid_argument("\"" + std::string(text) +
                                 "\" is no time; expected one like 2004-05-13T15:08:11.022");
   }

@@ -11,14 +11,15 @@ namespace ambrix {
 
 /// Year, month, day, hour, minute, second, milli-, micro-, nano- and picosecond.
 struct CalendarTime {
-  std::array<double, 10> parts = {1, 1, 1};
+  std::array<double, 10> parts = {2000, 1, 1};
 };
 
 /// "2004-05-13T15:08:11.022", with three more digits for each part behind the millisecond.
 std::string calendarText(std::span<const double> parts);
 
-/// Throws std::invalid_argument. An empty text becomes some time.
-CalendarTime parseCalendarTime(std::string_view text);
+/// Throws std::invalid_argument. An empty text becomes some time. With leap seconds, a day may have
+/// one at its end.
+CalendarTime parseCalendarTime(std::string_view text, bool leapSeconds);
 
 /// The picoseconds in the parts from that one on.
 double picosecondsBelow(const CalendarTime& time, std::size_t firstPart);

@@ -17,8 +17,8 @@ constexpr std::int64_t kNumbersTried = 10000;
 /// The search for the entries of one attribute.
 class EntryFinder::Search {
  public:
-  Search(File& file, const Attribute& attribute)
-      : reader_(file, attribute),
+  Search(File& file, const Attribute& attribute, FileObserver* observer)
+      : reader_(file, attribute, observer),
         remaining_(reader_.count()),
         tried_(static_cast<std::size_t>(attribute.maxEntry + 1)) {}
 
@@ -33,7 +33,7 @@ class EntryFinder::Search {
   void tryOthers() {
     for (std::size_t number = 0; number < tried_.size() && remaining_ > 0; ++number)
       isFound(number);
-    if (remaining_ > 0 && failure_) std::rethrow_exception(failure_);
+    if (remaining_ > 0 && failure_) reader_.rethrow(failure_);
   }
 
   std::vector<Entry> takeEntries() {
@@ -62,7 +62,7 @@ class EntryFinder::Search {
 
 std::vector<Entry> EntryFinder::find(const Attribute& attribute) {
   if (attribute.maxEntry >= kNumbersTried) return file_.entries(attribute);
-  Search search(file_, attribute);
+  Search search(file_, attribute, observer_);
   std::vector<Numbers>& alike = seen_[search.remaining()];
   for (const Numbers& numbers : alike)
     search.tryFirst(numbers);

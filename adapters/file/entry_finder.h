@@ -15,7 +15,7 @@ namespace ambrix {
 /// attributes belong to the same variables, and when all are found no others are tried.
 class EntryFinder {
  public:
-  explicit EntryFinder(File& file) : file_(file) {}
+  EntryFinder(File& file, FileObserver* observer) : file_(file), observer_(observer) {}
 
   /// In the order of their numbers. Throws `Error` when one cannot be inquired.
   std::vector<Entry> find(const Attribute& attribute);
@@ -25,6 +25,7 @@ class EntryFinder {
   using Numbers = std::vector<std::size_t>;
 
   File& file_;
+  FileObserver* observer_;
   std::map<std::size_t, std::vector<Numbers>> seen_;  // by how many there are
 };
 

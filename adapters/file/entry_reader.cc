@@ -15,9 +15,10 @@ Entry found(std::size_t number, const std::vector<Array>& facts) {
 
 }  // namespace
 
-EntryReader::EntryReader(File& file, const Attribute& attribute)
+EntryReader::EntryReader(File& file, const Attribute& attribute, FileObserver* observer)
     : file_(file),
       attribute_(attribute),
+      observer_(observer),
       inquireCommand_(
           Array::fromNarrow(attribute.global ? "inquireAttrgEntry" : "inquireAttrEntry")),
       valueCommand_(Array::fromNarrow(attribute.global ? "getAttrgEntry" : "getAttrEntry")),
@@ -33,12 +34,25 @@ std::vector<Array> EntryReader::call(const Array& command, std::size_t number) {
 Entry EntryReader::inquire(std::size_t number) {
   std::exception_ptr failure;
   const auto entry = find(number, failure);
-  if (!entry) std::rethrow_exception(failure);
+  if (!entry) rethrow(failure);
   return *entry;
 }
 
 Array EntryReader::value(std::size_t number) {
-  return std::move(call(valueCommand_, number).at(0));
+  try {
+    return std::move(call(valueCommand_, number).at(0));
+  } catch (const Error&) {
+    rethrow(std::current_exception());
+  }
+}
+
+void EntryReader::rethrow(const std::exception_ptr& failure) const {
+  try {
+    std::rethrow_exception(failure);
+  } catch (const Error& error) {
+    if (observer_ != nullptr) observer_->failed(error);
+    throw;
+  }
 }
 
 std::size_t EntryReader::count() {

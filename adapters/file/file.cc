@@ -36,9 +36,9 @@ double constantValue(Module& module, std::string_view name) {
 File::File(Module& module, std::string_view command, std::string path, const FileOptions& options)
     : module_(&module), path_(std::move(path)), options_(options), process_(::getpid()) {
   try {
-    const Array name = Array::fromUtf8(path_);
-    const ArrayView arguments[] = {name};
-    id_ = std::move(callNamed(command, arguments).at(0));
+    id_ = std::move(module.call(command, {Array::fromUtf8(path_)}).at(0));
+  } catch (const Error& error) {
+    fail(error);
   } catch (const std::invalid_argument&) {
     throw FileError(path_, "badFileName", "the name of the file is not valid UTF-8");
   }
@@ -98,32 +98,44 @@ File::~File() {
 void File::close() {
   if (!id_) return;
   const Array id = std::exchange(id_, Array());
-  const ArrayView arguments[] = {id};
-  callNamed("close", arguments);
+  try {
+    module_->call("close", {id});
+  } catch (const Error& error) {
+    fail(error);
+  }
 }
 
 void File::remove() {
   change("delete", {});
 }
 
-/// Tells the observer of an error; what it throws takes the error's place.
-std::vector<Array> File::callNamed(std::string_view command,
-                                   std::span<const ArrayView> arguments) try {
-  return module_->call(command, arguments);
-} catch (const Error& error) {
+/// Inside a handler. What the observer throws takes the place of the error.
+void File::fail(const Error& error) const {
   if (options_.observer != nullptr) options_.observer->failed(error);
   throw;
 }
 
-std::vector<Array> File::call(std::string_view command, std::span<const ArrayView> arguments) {
+std::vector<Array> File::attempt(std::string_view command, std::span<const ArrayView> arguments) {
   requireOpen();
   std::vector<ArrayView> all;
   all.reserve(arguments.size() + 1);
   all.push_back(id_);
   all.insert(all.end(), arguments.begin(), arguments.end());
-  std::vector<Array> results = callNamed(command, all);
+  return module_->call(command, all);
+}
+
+std::vector<Array> File::attempt(std::string_view command, double argument) {
+  const Array number = Array::scalar(argument);
+  const ArrayView arguments[] = {number};
+  return attempt(command, arguments);
+}
+
+std::vector<Array> File::call(std::string_view command, std::span<const ArrayView> arguments) try {
+  std::vector<Array> results = attempt(command, arguments);
   if (command == "close" || command == "delete") id_ = Array();
   return results;
+} catch (const Error& error) {
+  fail(error);
 }
 
 std::vector<Array> File::call(std::string_view command, std::initializer_list<double> arguments) {

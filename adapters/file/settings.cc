@@ -20,14 +20,6 @@ std::string readVersion(File& file) {
   return version;
 }
 
-/// The encoding's name; files of later libraries may have one that the module cannot name.
-std::string readEncoding(File& file) try {
-  return bytesOf(file.call("inquire").at(0));
-} catch (const Error& error) {
-  if (isLibraryFailure(error)) throw;
-  return "unknown (" + std::to_string(std::get<std::int64_t>(error.values().at(0))) + ")";
-}
-
 Compression compressionOf(const std::vector<Array>& results) {
   Compression compression;
   compression.type = bytesOf(results.at(0));
@@ -53,11 +45,19 @@ std::optional<double> levelOf(const Compression& compression) {
 
 }  // namespace
 
+/// The encoding's name; files of later libraries may have one that the module cannot name.
+std::string File::readEncoding() try {
+  return bytesOf(attempt("inquire").at(0));
+} catch (const Error& error) {
+  if (isLibraryFailure(error)) fail(error);
+  return "unknown (" + std::to_string(std::get<std::int64_t>(error.values().at(0))) + ")";
+}
+
 FileFacts File::facts() {
   FileFacts facts;
   facts.version = readVersion(*this);
   facts.format = text("getFormat");
-  facts.encoding = readEncoding(*this);
+  facts.encoding = readEncoding();
   facts.majority = text("getMajority");
   facts.checksum = text("getChecksum");
   facts.compression = compressionOf(call("getCompression"));

@@ -47,14 +47,14 @@ std::int64_t nanosecondsOfEpoch16(double seconds, double picoseconds) {
   return static_cast<std::int64_t>(from1970) * kSecond + fraction;
 }
 
-std::vector<std::int64_t> nanosecondsOfEpochs(ArrayView times) {
+std::vector<std::int64_t> nanosecondsOfEpochs(Module* /*module*/, ArrayView times) {
   const std::span<const double> values = times.data<double>();
   std::vector<std::int64_t> nanoseconds(values.size());
   std::ranges::transform(values, nanoseconds.begin(), nanosecondsOfEpoch);
   return nanoseconds;
 }
 
-Array epochsOfNanoseconds(std::span<const std::int64_t> times) {
+Array epochsOfNanoseconds(Module& /*module*/, std::span<const std::int64_t> times) {
   Array array = Array::uninitialized(ClassId::kDouble, {1, times.size()});
   std::ranges::transform(times, array.mutableData<double>().begin(), [](std::int64_t time) {
     const std::int64_t whole = time / kMillisecond;
@@ -81,7 +81,7 @@ std::vector<bool> validEpochs16(ArrayView times) {
   return valid;
 }
 
-std::vector<std::int64_t> nanosecondsOfEpochs16(ArrayView times) {
+std::vector<std::int64_t> nanosecondsOfEpochs16(Module* /*module*/, ArrayView times) {
   const std::span<const double> values = times.data<double>();
   std::vector<std::int64_t> nanoseconds;
   nanoseconds.reserve(values.size() / 2);
@@ -95,7 +95,7 @@ std::int64_t secondsOf(std::int64_t time) {
   return time / kSecond - (time % kSecond < 0 ? 1 : 0);
 }
 
-Array epochs16OfNanoseconds(std::span<const std::int64_t> times) {
+Array epochs16OfNanoseconds(Module& /*module*/, std::span<const std::int64_t> times) {
   Array array = Array::uninitialized(ClassId::kDouble, {2, times.size()});
   auto value = array.mutableData<double>().begin();
   for (const std::int64_t time : times) {
@@ -127,6 +127,7 @@ constexpr std::array<TimeKind, 2> kTimeKinds = {{
 }  // namespace
 
 const TimeKind& timeKindOf(Datatype datatype) {
+  if (datatype == Datatype::kTimeTt2000) return kTt2000;
   const auto* const found = std::ranges::find(kTimeKinds, datatype, &TimeKind::datatype);
   if (found == kTimeKinds.end()) {
     throw std::invalid_argument("values of " + datatypeName(datatype) + " are no times here");

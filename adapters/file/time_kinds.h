@@ -8,6 +8,7 @@
 
 #include "ambrix/array.h"
 #include "ambrix/datatype.h"
+#include "ambrix/module.h"
 
 namespace ambrix {
 
@@ -20,13 +21,17 @@ struct TimeKind {
   std::size_t parts;
   /// Whether each value is a time of the years 0 to 9999.
   std::vector<bool> (*valid)(ArrayView times);
-  std::vector<std::int64_t> (*nanoseconds)(ArrayView times);
-  Array (*ofNanoseconds)(std::span<const std::int64_t> times);
+  /// Without a module, throws std::invalid_argument when it takes one.
+  std::vector<std::int64_t> (*nanoseconds)(Module* module, ArrayView times);
+  Array (*ofNanoseconds)(Module& module, std::span<const std::int64_t> times);
   /// Adds what a calendar time has below its last part, in picoseconds.
   void (*addPicoseconds)(Array& times, std::size_t index, double picoseconds);
   /// Makes a value the usual fill value.
   void (*fill)(Array& times, std::size_t index);
 };
+
+/// Times since 1970 whose days have 86,400 seconds, but in leap seconds.
+extern const TimeKind kTt2000;
 
 /// Throws std::invalid_argument for a datatype that has no row.
 const TimeKind& timeKindOf(Datatype datatype);

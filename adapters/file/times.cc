@@ -19,12 +19,16 @@ std::vector<std::string> timesAsText(Module& module, ArrayView times, Datatype d
   return texts;
 }
 
-std::vector<std::int64_t> timesAsNanoseconds(ArrayView times, Datatype datatype) {
-  return timeKindOf(datatype).nanoseconds(times);
+std::vector<std::int64_t> timesAsNanoseconds(Module& module, ArrayView times, Datatype datatype) {
+  return timeKindOf(datatype).nanoseconds(&module, times);
 }
 
-Array timesFromNanoseconds(std::span<const std::int64_t> times, Datatype datatype) {
-  return timeKindOf(datatype).ofNanoseconds(times);
+std::vector<std::int64_t> timesAsNanoseconds(ArrayView times, Datatype datatype) {
+  return timeKindOf(datatype).nanoseconds(nullptr, times);
+}
+
+Array timesFromNanoseconds(Module& module, std::span<const std::int64_t> times, Datatype datatype) {
+  return timeKindOf(datatype).ofNanoseconds(module, times);
 }
 
 Array timesFromText(Module& module, std::span<const std::string> times, Datatype datatype) {
@@ -32,12 +36,12 @@ Array timesFromText(Module& module, std::span<const std::string> times, Datatype
   Array parts = Array::zeros(ClassId::kDouble, {kind.parts, times.size()});
   std::vector<CalendarTime> read;
   for (const std::string& text : times) {
-    read.push_back(parseCalendarTime(text));
+    read.push_back(parseCalendarTime(text, datatype == Datatype::kTimeTt2000));
     const auto own = parts.mutableData<double>().subspan(kind.parts * (read.size() - 1));
     for (std::size_t i = 0; i < kind.parts; ++i)
       own[i] = read.back().parts[i];
   }
-  if (times.empty()) return kind.ofNanoseconds({});
+  if (times.empty()) return kind.ofNanoseconds(module, {});
   Array values = std::move(module.call(kind.compute, {parts}).at(0));
   for (std::size_t i = 0; i < read.size(); ++i) {
     if (times[i].empty()) {

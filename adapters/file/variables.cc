@@ -50,13 +50,13 @@ std::optional<Datatype> unsupportedDatatype(const Error& error) {
 
 /// "inquire" does not tell of files in an unknown encoding.
 std::size_t File::variableCount() try {
-  return sizeOf(call("inquire").at(3).data<double>().front());
+  return sizeOf(attempt("inquire").at(3).data<double>().front());
 } catch (const Error& error) {
-  if (isLibraryFailure(error)) throw;
+  if (isLibraryFailure(error)) fail(error);
   std::size_t count = 0;
   try {
     for (;; ++count)
-      call("getVarName", {static_cast<double>(count)});
+      attempt("getVarName", static_cast<double>(count));
   } catch (const Error&) {
     return count;
   }
@@ -64,10 +64,10 @@ std::size_t File::variableCount() try {
 
 Variable File::variable(std::size_t number) try {
   announce(Step::Kind::kVariable, number);
-  return definitionOf(number, call("inquireVar", {static_cast<double>(number)}));
+  return definitionOf(number, attempt("inquireVar", static_cast<double>(number)));
 } catch (const Error& error) {
   const auto datatype = unsupportedDatatype(error);
-  if (!datatype) throw;
+  if (!datatype) fail(error);
   Variable variable;
   variable.number = number;
   variable.name = text("getVarName", {static_cast<double>(number)});
@@ -79,9 +79,9 @@ Variable File::variable(std::size_t number) try {
 std::optional<std::size_t> File::find(std::string_view command, std::string_view name) try {
   const Array text = Array::fromNarrow(name);
   const ArrayView arguments[] = {text};
-  return sizeOf(call(command, arguments).at(0).data<double>().front());
+  return sizeOf(attempt(command, arguments).at(0).data<double>().front());
 } catch (const Error& error) {
-  if (!isLibraryFailure(error)) throw;
+  if (!isLibraryFailure(error)) fail(error);
   return std::nullopt;
 }
 

@@ -193,6 +193,10 @@ TEST_F(FileLifetimeTest, LetsItsObserverReplaceErrors) {
   EXPECT_THROW(file.call("inquireVar", {9.0}), ::ambrix::Error);
   notes.refuses = true;
   EXPECT_THROW(file.call("inquireVar", {9.0}), std::runtime_error);
+  const Attribute title = file.attribute("Title");
+  EXPECT_THROW(file.value(title, 3), std::runtime_error);
+  EXPECT_THROW(file.entry(title, 3), std::runtime_error);
+  EXPECT_FALSE(file.attributeValue(variable_, "UNITS"));
   EXPECT_THROW(File::create(module, "new", {.observer = &notes}), std::runtime_error);
   EXPECT_THAT(file.variables().size(), 1);
 }

@@ -28,10 +28,10 @@ constexpr std::int64_t kDays = 10957;  // from 1970 to 2000
 constexpr std::int64_t kSecond = 1000000000;
 
 TEST_F(FileTimesTest, KnowsTheDatatypesOfTheModule) {
+  module.setExtended(true);
   std::size_t supported = 0;
   for (const auto& facts : ::ambrix::datatypes()) {
     EXPECT_EQ(::ambrix::datatypeNamed(facts.name), facts.datatype);
-    if (facts.classId == ClassId::kUnknown) continue;
     ++supported;
     std::string constant(facts.name);
     for (char& c : constant)
@@ -39,7 +39,7 @@ TEST_F(FileTimesTest, KnowsTheDatatypesOfTheModule) {
     EXPECT_EQ(::ambrix::constantValue(module, constant), static_cast<double>(facts.datatype));
     EXPECT_EQ(::ambrix::datatypeNamed(constant), facts.datatype);
   }
-  EXPECT_EQ(supported, 15);
+  EXPECT_EQ(supported, 17);
   EXPECT_EQ(::ambrix::datatypeName(Datatype{99}), "datatype 99");
   EXPECT_EQ(::ambrix::datatypeNamed("cdf_int5"), std::nullopt);
   EXPECT_EQ(::ambrix::elementsPerValue(Datatype::kUchar, 7), 7);
@@ -61,27 +61,71 @@ TEST_F(FileTimesTest, WritesTimesAsCalendarTexts) {
 
 TEST_F(FileTimesTest, CountsNanosecondsFrom1970) {
   EXPECT_THAT(
-      timesAsNanoseconds(Array::row({k1970 * 1000, k2000 * 1000 + 1.5, k1970 * 1000 - 0.5, -1e31,
+      timesAsNanoseconds(module,
+                         Array::row({k1970 * 1000, k2000 * 1000 + 1.5, k1970 * 1000 - 0.5, -1e31,
                                      0.0, std::numeric_limits<double>::quiet_NaN()}),
                          Datatype::kEpoch),
       ElementsAre(0, kDays * 86400 * kSecond + 1500000, -500000, kNoTime, kNoTime, kNoTime));
-  EXPECT_THAT(timesAsNanoseconds(
-                  Array::row({k2000, 1500.0, k1970 - 1, 999999999000.0, -1e31, -1e31, k2000, -5.0}),
-                  Datatype::kEpoch16),
-              ElementsAre(kDays * 86400 * kSecond + 2, -1, kNoTime, kNoTime));
-  EXPECT_THROW(timesAsNanoseconds(Array::scalar(0.0), Datatype::kInt4), std::invalid_argument);
+  EXPECT_THAT(
+      timesAsNanoseconds(
+          module, Array::row({k2000, 1500.0, k1970 - 1, 999999999000.0, -1e31, -1e31, k2000, -5.0}),
+          Datatype::kEpoch16),
+      ElementsAre(kDays * 86400 * kSecond + 2, -1, kNoTime, kNoTime));
+  EXPECT_THROW(timesAsNanoseconds(module, Array::scalar(0.0), Datatype::kInt4),
+               std::invalid_argument);
+  EXPECT_THAT(timesAsNanoseconds(Array::scalar(k1970 * 1000), Datatype::kEpoch), ElementsAre(0));
+  EXPECT_THROW(timesAsNanoseconds(Array::scalar(std::int64_t{0}), Datatype::kTimeTt2000),
+               std::invalid_argument);
 }
 
 TEST_F(FileTimesTest, MakesTimesOfNanoseconds) {
   const std::vector<std::int64_t> times = {0, kDays * 86400 * kSecond + 1500000, -500000, kNoTime};
-  const Array epochs = timesFromNanoseconds(times, Datatype::kEpoch);
+  const Array epochs = timesFromNanoseconds(module, times, Datatype::kEpoch);
   EXPECT_THAT(epochs.data<double>(),
               ElementsAre(k1970 * 1000, k2000 * 1000 + 1.5, k1970 * 1000 - 0.5, -1e31));
-  EXPECT_EQ(timesAsNanoseconds(epochs, Datatype::kEpoch), times);
-  const Array epochs16 = timesFromNanoseconds(times, Datatype::kEpoch16);
+  EXPECT_EQ(timesAsNanoseconds(module, epochs, Datatype::kEpoch), times);
+  const Array epochs16 = timesFromNanoseconds(module, times, Datatype::kEpoch16);
   EXPECT_THAT(epochs16.data<double>(),
               ElementsAre(k1970, 0, k2000, 1500000000, k1970 - 1, 999500000000, -1e31, -1e31));
-  EXPECT_EQ(timesAsNanoseconds(epochs16, Datatype::kEpoch16), times);
+  EXPECT_EQ(timesAsNanoseconds(module, epochs16, Datatype::kEpoch16), times);
+}
+
+/// Nanoseconds from 2000-01-01T12:00:00 of terrestrial time, 64.184 seconds before that of UTC.
+constexpr std::int64_t kNoon2000 = 64184000000;
+
+TEST_F(FileTimesTest, KnowsLeapSeconds) {
+  module.setExtended(true);
+  const std::vector<std::string> given = {"2000-01-01T12:00:00.000000000",
+                                          "2016-12-31T23:59:60.500000000",
+                                          "2017-01-01T00:00:00.123456789", ""};
+  const Array times = of(given, Datatype::kTimeTt2000);
+  EXPECT_THAT(times.data<std::int64_t>(),
+              ElementsAre(kNoon2000, 536500868684000000, 536500869307456789, INT64_MIN));
+  EXPECT_EQ(texts(times.clone(), Datatype::kTimeTt2000), given);
+  EXPECT_THAT(timesAsNanoseconds(module, times, Datatype::kTimeTt2000),
+              ElementsAre(946728000 * kSecond, 1483228800 * kSecond + 500000000,
+                          1483228800 * kSecond + 123456789, kNoTime));
+}
+
+TEST_F(FileTimesTest, CountsNanosecondsAlikeWithinAndAcrossLeapSeconds) {
+  module.setExtended(true);
+  const std::vector<std::int64_t> within = {1500000000 * kSecond + 5, 1500000001 * kSecond, kNoTime,
+                                            1600000000 * kSecond};
+  const std::vector<std::int64_t> across = {946684800 * kSecond, 1500000000 * kSecond + 7,
+                                            1230768000 * kSecond, kNoTime};
+  for (const auto& times : {within, across}) {
+    const Array array = timesFromNanoseconds(module, times, Datatype::kTimeTt2000);
+    EXPECT_EQ(timesAsNanoseconds(module, array, Datatype::kTimeTt2000), times);
+  }
+  // The years before 1972, when seconds of UTC had no fixed length, are told by the library.
+  const Array early = of({"1965-03-01T00:00:00.000000001"}, Datatype::kTimeTt2000);
+  EXPECT_THAT(timesAsNanoseconds(module, early, Datatype::kTimeTt2000),
+              ElementsAre(-152668800 * kSecond + 1));
+  EXPECT_EQ(errorOf([&] {
+              module.setExtended(false);
+              timesFromNanoseconds(module, within, Datatype::kTimeTt2000);
+            }),
+            cdflib("invalidOperation", "computeTT2000"));
 }
 
 TEST_F(FileTimesTest, ReadsCalendarTexts) {

@@ -1,4 +1,5 @@
-// A host inside a C++ program: everything there is to include.
+// A host inside a C++ program: everything there is to include but what goes by files
+// (ambrix/file.h).
 //
 // clang-format off
 //   ambrix::Module module;

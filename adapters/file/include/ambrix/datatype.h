@@ -33,12 +33,13 @@ enum class Datatype : int {
   kUchar = 52,
 };
 
-/// What is known of a datatype.
+/// What is known of a datatype. Commands take kInt8 and kTimeTt2000 only when the module is
+/// extended
+/// (`Module::setExtended`).
 struct DatatypeFacts {
   Datatype datatype;
   std::string_view name;  // as the commands tell it: "cdf_int4"
-  /// The class of arrays that hold its values; kUnknown for the datatypes that commands refuse.
-  ClassId classId;
+  ClassId classId;        // of arrays that hold its values
   /// The array elements of one value; 0 for characters, where it is the length of the text.
   std::size_t elements;
 };

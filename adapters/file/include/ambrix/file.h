@@ -151,7 +151,10 @@ class AMBRIX_EXPORT File {
 
  private:
   File(Module& module, std::string_view command, std::string path, const FileOptions& options);
-  std::vector<Array> callNamed(std::string_view command, std::span<const ArrayView> arguments);
+  /// Like `call`, for errors that may be no failure; `fail` then throws those that are.
+  std::vector<Array> attempt(std::string_view command, std::span<const ArrayView> arguments = {});
+  std::vector<Array> attempt(std::string_view command, double argument);
+  [[noreturn]] void fail(const Error& error) const;
   std::vector<Array> change(std::string_view command, std::span<const ArrayView> arguments);
   std::vector<Array> change(std::string_view command, std::initializer_list<double> arguments);
   void requireOpen() const;
@@ -160,6 +163,7 @@ class AMBRIX_EXPORT File {
   [[nodiscard]] FileError wrongSize() const;
   void announce(Step::Kind kind, std::size_t number, std::string_view name = {}) const;
   void setReadOnly();
+  std::string readEncoding();
   std::optional<std::size_t> find(std::string_view command, std::string_view name);
   AttributeDescription describeAttribute(std::size_t number, EntryFinder& finder);
   Attribute attributeFor(std::string_view name, bool global);

@@ -19,18 +19,26 @@ namespace ambrix {
 inline constexpr std::int64_t kNoTime = std::numeric_limits<std::int64_t>::min();
 
 /// The times in an array of a datatype as ISO 8601, such as "2004-05-13T15:08:11.022": in
-/// milliseconds, and those of `CDF_EPOCH16` in picoseconds. The text is empty where the value is no
-/// time of the years 0 to 9999. Throws std::invalid_argument for a datatype without times.
+/// milliseconds, those of `CDF_TIME_TT2000` in nanoseconds, and those of `CDF_EPOCH16` in
+/// picoseconds. The text is empty where the value is no time of the years 0 to 9999. Throws
+/// std::invalid_argument for a datatype without times, and `Error` for `CDF_TIME_TT2000` unless the
+/// module is extended.
 AMBRIX_EXPORT std::vector<std::string> timesAsText(Module& module, ArrayView times,
                                                    Datatype datatype);
 
 /// The same as nanoseconds since 1970-01-01T00:00:00, each rounded to the nearest one; `kNoTime`
-/// where there is none. Days have 86,400 seconds, as in all epochs of these datatypes.
+/// where there is none. Days have 86,400 seconds: a leap second, which only `CDF_TIME_TT2000` tells
+/// apart, is the first of the next day.
+AMBRIX_EXPORT std::vector<std::int64_t> timesAsNanoseconds(Module& module, ArrayView times,
+                                                           Datatype datatype);
+/// The same without a module, for `CDF_EPOCH` and `CDF_EPOCH16`. May be called from any thread.
 AMBRIX_EXPORT std::vector<std::int64_t> timesAsNanoseconds(ArrayView times, Datatype datatype);
 
 /// The array of a datatype with these times, one record each. Today's times of `CDF_EPOCH` are
-/// multiples of 1/128 millisecond. `kNoTime` becomes the usual fill value, -1e31.
-AMBRIX_EXPORT Array timesFromNanoseconds(std::span<const std::int64_t> times, Datatype datatype);
+/// multiples of 1/128 millisecond. `kNoTime` becomes the usual fill value: -1e31, or the least
+/// number of `CDF_TIME_TT2000`.
+AMBRIX_EXPORT Array timesFromNanoseconds(Module& module, std::span<const std::int64_t> times,
+                                         Datatype datatype);
 
 /// The same from ISO 8601: a date, or date and time with up to twelve digits behind the second, and
 /// "Z" or nothing. An empty text becomes the fill value. Throws std::invalid_argument for a text
