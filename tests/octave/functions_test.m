@@ -62,7 +62,7 @@ function testFunctionsTakeAndReturnAsManyAsTheTableSays (commands)
   for k = 1:numel (commands)
     [least, most] = counts (commands{k});
     name = commands{k}.name;
-    assert (nargout (["ambrix_" name]), numel (commands{k}.results), name);
+    assert (nargout (["ambrix_" name]) == numel (commands{k}.results), name);
     for count = setdiff ([least - 1, most + 1, most + 9], -1)
       assert (raisedWith (name, count), wrong, name);
     endfor
@@ -111,7 +111,7 @@ function testTestsInFunctionsPass ()
   for file = functionFiles ()'
     [passed, count] = test (file{1}, "quiet", stdout);
     assert (count > 0, "%s has no tests", file{1});
-    assert (passed, count, file{1});
+    assert (passed == count, "%d of %d tests in %s passed", passed, count, file{1});
   endfor
 endfunction
 

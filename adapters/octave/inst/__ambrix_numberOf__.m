@@ -18,5 +18,5 @@ endfunction
 %! assert (__ambrix_numberOf__ (id, "Flux"), 1);
 %! err = __ambrix_raised__ (@() __ambrix_numberOf__ (id, "None"));
 %! assert (err.identifier, "TOLVEX:ambrix:cdflib:libraryFailure");
-%! assert (strncmp (err.message, "ambrix_read: there is no variable \"None\" in \"example\"; ", 56));
+%! assert (strncmp (err.message, "ambrix_read: there is no variable \"None\" in \"example\"; ", 55));
 %! ambrix_close (id);

@@ -40,11 +40,19 @@ function [sound, report] = ambrix_check (file, varargin)
   discard = onCleanup (@() unlink (log));
   code = sprintf ("__ambrix_readSteps__ (\"%s\");", undo_string_escapes (tilde_expand (file)));
   [status, isLate] = __ambrix_otherOctave__ (code, log, seconds);
-  [isSound, said] = verdict (status, isLate, seconds, fileread (log));
+  [isSound, said] = verdict (status, isLate, seconds, linesOf (log));
   if (nargout == 0)
     printf ("%s: %s\n", file, said);
   else
     [sound, report] = deal (isSound, said);
+  endif
+endfunction
+
+## None where the other Octave was ended before it had begun to write.
+function lines = linesOf (log)
+  lines = "";
+  if (! isempty (stat (log)))
+    lines = fileread (log);
   endif
 endfunction
 
