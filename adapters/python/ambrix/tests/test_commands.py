@@ -94,7 +94,7 @@ def test_epoch16_has_two_numbers_a_value(new):
 
 def test_texts_are_arrays_of_bytes(new):
     variable = commands.createVar(new, "t", "CDF_CHAR", 3, [2], True, [True])
-    texts = np.array([[b"abc", b"de"], ["fgh".encode(), b"i"]]).T
+    texts = np.array([[b"abc", b"de "], [b"fgh", b"i  "]]).T
     commands.hyperPutVarData(new, variable, 0, 2, 1, [0], [2], [1], texts)
     read = commands.hyperGetVarData(new, variable, 0, 2, 1, [0], [2], [1])
     assert read.dtype == "S3" and np.array_equal(read, texts)

@@ -81,11 +81,11 @@ def test_large_values_are_not_copied(file):
 
 def test_texts_are_str(file):
     assert file["texts"].dtype == np.dtype("U3")
-    assert file["texts"][:].tolist() == [["ab", "µ "], ["x", ""]]
+    assert file["texts"][:].tolist() == [["ab ", "µ "], ["x  ", "   "]]
     assert file["texts"][0, 1] == "µ " and isinstance(file["texts"][0, 1], str)
     assert file["word"][...] == "alone"
     assert file["texts"].raw.dtype == "S3"
-    assert file["texts"].raw[:].tolist() == [[b"ab", "µ ".encode()], [b"x", b""]]
+    assert file["texts"].raw[:].tolist() == [[b"ab ", "µ ".encode()], [b"x  ", b"   "]]
 
 
 def test_raw_values_of_epoch16_are_pairs(file):

@@ -51,7 +51,7 @@ def grid_file(name, majority):
     add(file, "line", "CDF_INT4", np.arange(RECORDS, dtype="i4"))
     add(file, "still", "CDF_REAL4", grid("f4")[0], varies=False)
     add(file, "one", "CDF_INT2", np.int16(7), varies=False)
-    add(file, "texts", "CDF_CHAR", np.char.encode([["ab", "µ "], ["x", ""]], "utf-8"), 3)
+    add(file, "texts", "CDF_CHAR", np.char.encode([["ab ", "µ "], ["x  ", "   "]], "utf-8"), 3)
     add(file, "word", "CDF_CHAR", b"alone", 5, varies=False)
     add_epoch16(file, "fine", [[2020, 2021], [1, 2], [3, 4]] + 7 * [[0, 1]])
     commands.close(file)
