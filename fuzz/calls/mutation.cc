@@ -5,6 +5,7 @@
 #include <iterator>
 
 #include "fuzz/calls/mode.h"
+#include "fuzz/calls/transcript.h"
 #include "tests/support/command_signatures.h"
 
 namespace ambrix_fuzz {
@@ -50,13 +51,17 @@ void spoilText(Choices& choices, const World&, CallInput& input) {
   }
 }
 
+constexpr std::uint64_t kNoFile = 1;
+
 void spoilFile(Choices& choices, const World& world, CallInput& input) {
   const bool takesFile =
       !input.arguments.empty() && input.arguments[0].classId() == ClassId::kUint64;
   if (!takesFile) return;
   const bool reuse = !world.closedIds().empty() && !choices.oneIn(4);
-  const std::uint64_t id =
+  std::uint64_t id =
       reuse ? world.closedIds()[choices.below(world.closedIds().size())] : choices.word();
+  // The library may have given it to another file, which depends on the memory of the program.
+  if (isTranscribed() && world.openIds().contains(id)) id = kNoFile;
   input.arguments[0] = Array::scalar(id);
 }
 

@@ -51,9 +51,13 @@ void openTranscript(const std::string& path) {
   transcript().open(path, std::ios::binary);
 }
 
+bool isTranscribed() {
+  return transcript().is_open();
+}
+
 void transcribe(const std::string& command, const std::vector<ambrix::Array>& results,
                 const std::vector<ambrix::MessageId>& warnings) {
-  if (!transcript().is_open()) return;
+  if (!isTranscribed()) return;
   transcript() << command << " ->";
   for (const ambrix::Array& result : results)
     write(result);
@@ -62,7 +66,7 @@ void transcribe(const std::string& command, const std::vector<ambrix::Array>& re
 
 void transcribe(const std::string& command, const std::string& error,
                 const std::vector<ambrix::MessageId>& warnings) {
-  if (!transcript().is_open()) return;
+  if (!isTranscribed()) return;
   transcript() << command << " !> " << error;
   finish(warnings);
 }

@@ -11,6 +11,7 @@ namespace ambrix_fuzz {
 
 /// Lines go to this file from now on.
 void openTranscript(const std::string& path);
+bool isTranscribed();
 
 void transcribe(const std::string& command, const std::vector<ambrix::Array>& results,
                 const std::vector<ambrix::MessageId>& warnings);
