@@ -83,7 +83,7 @@ TEST_F(FileAttributesTest, AnAttributeOfTheOtherScopeIsRefused) {
 
 TEST_F(FileAttributesTest, FindsEntriesWhoseNumbersLieFarApart) {
   File file = open("new", Access::kWrite);
-  for (const std::size_t number : {0UL, 7UL, 3000000UL, 5000000UL})
+  for (const std::size_t number : {0UL, 7UL, 20000UL, 1200000UL})
     file.setAttribute("Title", "x", number);
   const Attribute title = file.attribute("Title");
   EXPECT_EQ(errorOf([&] { file.entries(title); }),
@@ -94,7 +94,7 @@ TEST_F(FileAttributesTest, FindsEntriesWhoseNumbersLieFarApart) {
   File read = File::open(module, "new", {.scratchFolder = "scratch"});
   std::vector<std::size_t> numbers;
   read.forEachEntry(title, [&](const Entry& entry) { numbers.push_back(entry.number); });
-  EXPECT_THAT(numbers, ElementsAre(0, 7, 3000000, 5000000));
+  EXPECT_THAT(numbers, ElementsAre(0, 7, 20000, 1200000));
   EXPECT_EQ(read.describeAttribute(title.number).entries.size(), 4);
   EXPECT_TRUE(std::filesystem::is_empty("scratch"));
   std::filesystem::remove("scratch");
