@@ -5,7 +5,7 @@ _ambrix() {
   local commands="info dump check call convert session"
   declare -A options=(
     [info]="--attributes --json --time-limit --memory-limit --help"
-    [dump]="--records --format --output --defuse-formulas --time-limit --memory-limit --help"
+    [dump]="--records --format --output --defuse-formulas --raw-times --time-limit --memory-limit --help"
     [check]="--json --quiet --time-limit --memory-limit --help"
     [call]="--file --extended --help"
     [convert]="--compression --majority --checksum --skip-unsupported --time-limit --memory-limit --help"

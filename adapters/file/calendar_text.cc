@@ -116,11 +116,18 @@ CalendarTime parseCalendarTime(std::string_view text, bool leapSeconds) {
   if (text.empty()) return time;
   const std::string_view local = text.ends_with('Z') ? text.substr(0, text.size() - 1) : text;
   Scanner scanner(local);
-  if (!scanParts(scanner, time) || !scanner.atEnd() || !isTime(time, leapSeconds)) {
-    throw std::invalid_argument("\"" + std::string(text) +
-                                "\" is no time; expected one like 2004-05-13T15:08:11.022");
-  }
+  if (!scanParts(scanner, time) || !scanner.atEnd() || !isTime(time, leapSeconds))
+    throwNoTime(text);
   return time;
+}
+
+bool isLeapSecond(const CalendarTime& time) {
+  return time.parts[kSeconds] == 60;
+}
+
+void throwNoTime(std::string_view text) {
+  throw std::invalid_argument("\"" + std::string(text) +
+                              "\" is no time; expected one like 2004-05-13T15:08:11.022");
 }
 
 double picosecondsBelow(const CalendarTime& time, std::size_t firstPart) {

@@ -21,6 +21,10 @@ std::string calendarText(std::span<const double> parts);
 /// one at its end.
 CalendarTime parseCalendarTime(std::string_view text, bool leapSeconds);
 
+bool isLeapSecond(const CalendarTime& time);
+
+[[noreturn]] void throwNoTime(std::string_view text);
+
 /// The picoseconds in the parts from that one on.
 double picosecondsBelow(const CalendarTime& time, std::size_t firstPart);
 

@@ -2,6 +2,7 @@
 
 #include <utility>
 
+#include "adapters/file/extended_calls.h"
 #include "adapters/file/numbers.h"
 #include "ambrix/texts.h"
 
@@ -28,6 +29,7 @@ EntryReader::EntryReader(File& file, const Attribute& attribute, FileObserver* o
 std::vector<Array> EntryReader::call(const Array& command, std::size_t number) {
   entryNumber_.mutableData<double>().front() = static_cast<double>(number);
   const ArrayView arguments[] = {file_.id(), attributeNumber_, entryNumber_};
+  const ExtendedCalls extended(file_.module());
   return file_.module().call(command, arguments);
 }
 

@@ -7,6 +7,7 @@
 #include <system_error>
 #include <utility>
 
+#include "adapters/file/extended_calls.h"
 #include "ambrix/texts.h"
 
 namespace ambrix {
@@ -148,11 +149,13 @@ std::vector<Array> File::call(std::string_view command, std::initializer_list<do
 
 std::vector<Array> File::change(std::string_view command, std::span<const ArrayView> arguments) {
   requireWritable();
+  const ExtendedCalls extended(*module_);
   return call(command, arguments);
 }
 
 std::vector<Array> File::change(std::string_view command, std::initializer_list<double> arguments) {
   requireWritable();
+  const ExtendedCalls extended(*module_);
   return call(command, arguments);
 }
 

@@ -4,6 +4,7 @@
 #include <string>
 #include <variant>
 
+#include "adapters/file/extended_calls.h"
 #include "adapters/file/numbers.h"
 #include "ambrix/file.h"
 #include "ambrix/texts.h"
@@ -110,6 +111,7 @@ void File::setSparseRecords(const Variable& variable, std::string_view mode) {
 }
 
 Array File::padValue(const Variable& variable) {
+  const ExtendedCalls extended(*module_);
   return std::move(call("getVarPadValue", {numberOf(variable)}).at(0));
 }
 

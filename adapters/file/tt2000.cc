@@ -16,13 +16,13 @@ namespace {
 
 constexpr std::size_t kParts = 9;
 constexpr std::int64_t kFill = std::numeric_limits<std::int64_t>::min();
-constexpr std::int64_t kPad = kFill + 1;  // stands for the year 0
+constexpr std::int64_t kIllegal = kFill + 3;  // and below it, pad and fill value
 constexpr std::int64_t kSecond = 1'000'000'000;
 /// From this time on, in nanoseconds since 2000, all seconds of UTC have been of one length.
 constexpr std::int64_t kFrom1972 = -883655957'816'000'000;
 
 bool isTime(std::int64_t value) {
-  return value != kFill && value != kPad;
+  return value > kIllegal;
 }
 
 std::vector<bool> valid(ArrayView times) {

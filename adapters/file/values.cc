@@ -4,6 +4,7 @@
 #include <numeric>
 #include <utility>
 
+#include "adapters/file/extended_calls.h"
 #include "adapters/file/numbers.h"
 #include "ambrix/file.h"
 
@@ -65,6 +66,7 @@ Array File::read(const Variable& variable, const Slab& slab) {
   if (slab.records == 0) return noRecords(variable, slab);
   const std::vector<Array> arguments = slabArguments(variable, slab);
   const std::vector<ArrayView> views(arguments.begin(), arguments.end());
+  const ExtendedCalls extended(*module_);
   return std::move(call("hyperGetVarData", views).at(0));
 }
 

@@ -3,6 +3,7 @@
 #include <utility>
 #include <variant>
 
+#include "adapters/file/extended_calls.h"
 #include "adapters/file/names.h"
 #include "adapters/file/numbers.h"
 #include "ambrix/file.h"
@@ -64,6 +65,7 @@ std::size_t File::variableCount() try {
 
 Variable File::variable(std::size_t number) try {
   announce(Step::Kind::kVariable, number);
+  const ExtendedCalls extended(*module_);
   return definitionOf(number, attempt("inquireVar", static_cast<double>(number)));
 } catch (const Error& error) {
   const auto datatype = unsupportedDatatype(error);

@@ -2,7 +2,10 @@
 #include <sys/wait.h>
 #include <unistd.h>
 
+#include <fstream>
+
 #include "tests/file_layer/file_layer_test.h"
+#include "tests/module/support/file_bytes.h"
 
 namespace ambrix_test {
 namespace {
@@ -91,20 +94,52 @@ TEST_F(FileLifetimeTest, RefusesValuesThatDoNotFit) {
   EXPECT_EQ(errorOf([&] { file.readInto(variable_, slab, memory); }), refusal);
 }
 
-TEST_F(FileLifetimeTest, TellsOfDatatypesThatAreNotSupported) {
-  AMBRIX_NEED_SAMPLE(path, "a_cdf.cdf");
-  File file = open(path);
+/// Gives the variable of that name another datatype in the file.
+void changeDatatype(const std::string& path, const std::string& variable, char code) {
+  constexpr std::size_t kFromDatatypeToName = 64;
+  const std::string bytes = fileBytes(path);
+  const std::size_t place = bytes.find(variable + '\0') - kFromDatatypeToName + 3;
+  std::fstream file(path, std::ios::in | std::ios::out | std::ios::binary);
+  file.seekp(static_cast<std::streamoff>(place));
+  file.put(code);
+}
+
+TEST_F(FileLifetimeTest, TellsOfDatatypesThatAreNotKnown) {
+  changeDatatype("new.cdf", "Flux", 99);
+  EXPECT_EQ(errorOf([&] { open(); }), "TOLVEX:ambrix:cdflib:fileOpenError()");
+  const double off = ::ambrix::constantValue(module, "VALIDATEFILEOFF");
+  module.call("setValidate", {Array::scalar(off)});
+  File file = open();
   const auto description = file.describe();
-  const auto& variables = description.variables;
-  const auto found = std::ranges::find_if(
-      variables, [](const auto& variable) { return !variable.definition.supported; });
-  ASSERT_NE(found, variables.end());
-  EXPECT_EQ(found->definition.datatype, Datatype::kTimeTt2000);
-  EXPECT_FALSE(found->definition.name.empty());
-  EXPECT_FALSE(found->padValue);
-  EXPECT_EQ(errorOf([&] { file.read(found->definition); }),
-            "ambrix:unsupportedDatatype: " + path + ": variable \"" + found->definition.name +
-                "\" has the datatype cdf_time_tt2000, which is not supported");
+  const Variable& found = description.variables.at(0).definition;
+  EXPECT_FALSE(found.supported);
+  EXPECT_EQ(found.name, "Flux");
+  EXPECT_EQ(found.datatype, Datatype{99});
+  EXPECT_FALSE(description.variables.at(0).padValue);
+  EXPECT_EQ(errorOf([&] { file.read(found); }),
+            "ambrix:unsupportedDatatype: new: variable \"Flux\" has the datatype datatype 99, "
+            "which is not supported");
+}
+
+TEST_F(FileLifetimeTest, HasExtendedDatatypesWhereCommandsAreStrict) {
+  File file = create("other");
+  const Variable time = file.createVariable({.name = "Epoch", .datatype = Datatype::kTimeTt2000});
+  file.setPadValue(time, rowOf<std::int64_t>({INT64_MIN}));
+  file.append(time, rowOf<std::int64_t>({INT64_MIN + 1, 536500868184000000, INT64_MAX}));
+  file.setAttribute(time, "VALIDMAX", Datatype::kInt8, rowOf<std::int64_t>({9007199254740993}));
+  EXPECT_EQ(shown(*file.attributeValue(time, "VALIDMAX")), "int64 1x1 [9007199254740993]");
+  const std::string refusal = cdflib("unrecognizedValue", 33, "DATATYPE");
+  EXPECT_EQ(errorOf([&] { file.call("inquireVar", {0.0}); }), refusal);
+  EXPECT_EQ(errorOf([&] {
+              module.call("getVarPadValue", {file.id(), Array::scalar(0.0)});
+            }),
+            refusal);
+  const auto description = file.describe();
+  EXPECT_TRUE(description.variables.at(0).definition.supported);
+  EXPECT_EQ(shown(description.variables.at(0).padValue), "int64 1x1 [-9223372036854775808]");
+  EXPECT_EQ(shown(file.read(time)),
+            "int64 3x1 [-9223372036854775807 536500868184000000 9223372036854775807]");
+  EXPECT_FALSE(module.extended());
 }
 
 TEST_F(FileLifetimeTest, CanBeClosedTwiceAndMoved) {

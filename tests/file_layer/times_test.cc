@@ -96,7 +96,6 @@ constexpr std::int64_t kNoon2000 = 64184000000;
 
 TEST_F(FileTimesTest, KnowsLeapSeconds) {
   const LeaksIgnored libraryTable;  // of leap seconds
-  module.setExtended(true);
   const std::vector<std::string> given = {"2000-01-01T12:00:00.000000000",
                                           "2016-12-31T23:59:60.500000000",
                                           "2017-01-01T00:00:00.123456789", ""};
@@ -111,7 +110,6 @@ TEST_F(FileTimesTest, KnowsLeapSeconds) {
 
 TEST_F(FileTimesTest, CountsNanosecondsAlikeWithinAndAcrossLeapSeconds) {
   const LeaksIgnored libraryTable;  // of leap seconds
-  module.setExtended(true);
   const std::vector<std::int64_t> within = {1500000000 * kSecond + 5, 1500000001 * kSecond, kNoTime,
                                             1600000000 * kSecond};
   const std::vector<std::int64_t> across = {946684800 * kSecond, 1500000000 * kSecond + 7,
@@ -124,11 +122,39 @@ TEST_F(FileTimesTest, CountsNanosecondsAlikeWithinAndAcrossLeapSeconds) {
   const Array early = of({"1965-03-01T00:00:00.000000001"}, Datatype::kTimeTt2000);
   EXPECT_THAT(timesAsNanoseconds(module, early, Datatype::kTimeTt2000),
               ElementsAre(-152668800 * kSecond + 1));
-  EXPECT_EQ(errorOf([&] {
-              module.setExtended(false);
-              timesFromNanoseconds(module, within, Datatype::kTimeTt2000);
-            }),
-            cdflib("invalidOperation", "computeTT2000"));
+}
+
+TEST_F(FileTimesTest, LeavesTheModuleAsStrictAsItWas) {
+  const LeaksIgnored libraryTable;  // of leap seconds
+  const Array time = of({"2016-12-31T23:59:60"}, Datatype::kTimeTt2000);
+  EXPECT_EQ(errorOf([&] { module.call("tt2000Breakdown", {time}); }),
+            cdflib("invalidOperation", "tt2000Breakdown"));
+  EXPECT_EQ(errorOf([&] { texts(Array::scalar(1.0), Datatype::kTimeTt2000); }),
+            cdflib("datatypeMismatch", "double", "CDF_TIME_TT2000"));
+  EXPECT_FALSE(module.extended());
+  module.setExtended(true);
+  timesAsNanoseconds(module, time, Datatype::kTimeTt2000);
+  EXPECT_TRUE(module.extended());
+  EXPECT_THROW(timesAsNanoseconds(time, Datatype::kTimeTt2000), std::invalid_argument);
+}
+
+TEST_F(FileTimesTest, TellsTimesOfTt2000FromOtherValues) {
+  const LeaksIgnored libraryTable;  // of leap seconds
+  const Array values =
+      rowOf<std::int64_t>({INT64_MIN, INT64_MIN + 1, INT64_MIN + 3, INT64_MIN + 4, INT64_MAX});
+  EXPECT_THAT(
+      texts(values.clone(), Datatype::kTimeTt2000),
+      ElementsAre("", "", "", "1707-09-22T12:12:10.961224196", "2292-04-11T11:46:07.670775807"));
+  EXPECT_THAT(timesAsNanoseconds(module, values, Datatype::kTimeTt2000),
+              ElementsAre(kNoTime, kNoTime, kNoTime, -8276644069038775804, kNoTime));
+  EXPECT_THAT(of({"1965-06-15T01:02:03.004005006789"}, Datatype::kTimeTt2000).data<std::int64_t>(),
+              ElementsAre(-1090234640957376994));
+  EXPECT_EQ(errorOf([&] { of({"1707-09-21"}, Datatype::kTimeTt2000); }),
+            cdflib("illegalEpochValue"));
+  // Leap seconds that there were not.
+  for (const char* const text :
+       {"2015-12-31T23:59:60", "2016-12-31T23:58:60", "2016-12-31T12:59:60"})
+    EXPECT_THROW(of({text}, Datatype::kTimeTt2000), std::invalid_argument) << text;
 }
 
 TEST_F(FileTimesTest, ReadsCalendarTexts) {

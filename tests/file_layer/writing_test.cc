@@ -11,7 +11,6 @@ using testing::HasSubstr;
 class FileWritingTest : public FileLayerTest {};
 
 TEST_F(FileWritingTest, WritesValuesOfEveryDatatypeAndReadsThemBack) {
-  module.setExtended(true);
   File file = create();
   for (const auto& facts : ::ambrix::datatypes()) {
     const Variable variable = file.createVariable({.name = std::string(facts.name),

@@ -16,14 +16,14 @@ READERS = (cdflib_reader, pycdfpp_reader)
 
 
 class ReadersCase(unittest.TestCase):
-    """A session in a temporary folder."""
+    """A session with the extended datatypes, in a temporary folder."""
 
     def setUp(self):
         warnings.simplefilter("ignore")  # the readers' own
         folder = tempfile.TemporaryDirectory()
         self.addCleanup(folder.cleanup)
         self.folder = folder.name
-        self.session = Session(cwd=self.folder)
+        self.session = Session(options=["--extended"], cwd=self.folder)
         self.addCleanup(self.session.close)
 
     def read(self, path):

@@ -2,7 +2,7 @@
 
 import numpy as np
 
-from readers.content import CHARACTERS, INT8, TT2000, Attribute, Unread, fill_texts, leading_of
+from readers.content import CHARACTERS, Attribute, Unread, fill_texts, leading_of
 
 
 def same_numbers(one, other):
@@ -58,7 +58,7 @@ def variable_differences(one, other, nul_reads_as=0):
     if isinstance(other, Unread):
         return [f"unread ({other.error!r})"]
     if one is None:
-        return [] if other.code in (INT8, TT2000) else [f"datatype {other.code} refused"]
+        return [f"datatype {other.code} refused"]
     found = []
     for name in ("code", "elements", "record_varies"):
         mine, theirs = getattr(one, name), getattr(other, name)
@@ -87,7 +87,7 @@ def entry_difference(one, other, nul_reads_as=0):
         return f"unread ({other.error!r})"
     code, value = one
     if code is None:
-        same = value in (INT8, TT2000) and value == other[0]
+        same = False
     elif code in CHARACTERS:
         filler = bytes([nul_reads_as])
         same = code == other[0] and value.rstrip(filler) == other[1].split(b"\0")[0].rstrip(filler)

@@ -6,29 +6,11 @@ import unittest
 
 from readers.case import READERS, ReadersCase, reference, unexplained
 from readers.comparison import differences
-from readers.content import INT8, TT2000, attempt
+from readers.content import attempt
 from readers.sample_files import FOLDER, UNREADABLE, needs_folder, readable_files
 
 TOOL = os.environ["AMBRIX_TOOL"]
-UNSUPPORTED = (INT8, TT2000)
 SMALL = 200000  # bytes; the options are tried on the files that are smaller
-
-
-def without_unsupported(content):
-    """What a conversion carries over."""
-    content.variables = {name: variable for name, variable in content.variables.items()
-                         if variable is not None}
-    for attribute in content.attributes.values():
-        attribute.entries = {key: entry for key, entry in attribute.entries.items()
-                             if entry[0] is not None
-                             and (attribute.is_global or key in content.variables)}
-    return content
-
-
-def has_unsupported(content):
-    entries = [entry for attribute in content.attributes.values()
-               for entry in attribute.entries.values()]
-    return None in content.variables.values() or any(code is None for code, _ in entries)
 
 
 class ConvertTest(ReadersCase):
@@ -44,15 +26,9 @@ class ConvertTest(ReadersCase):
         """Compares the converted file with the original, read through the module, which was itself
         compared with the readers."""
         original = self.read(path)
-        unsupported = has_unsupported(original)
         done, out = self.convert(path, *options)
-        self.assertEqual(done.returncode, 1 if unsupported else 0, done.stderr)
-        self.assertEqual(os.path.exists(out), not unsupported)
-        if unsupported:
-            self.assertIn("not supported", done.stderr)
-            done, out = self.convert(path, "--skip-unsupported", *options)
-            self.assertEqual(done.returncode, 0, done.stderr)
-        expected = self.with_declared_pads(without_unsupported(original), path)
+        self.assertEqual(done.returncode, 0, done.stderr)
+        expected = self.with_declared_pads(original, path)
         if row_major is not None:
             expected.row_major = row_major
         for reader in READERS:

@@ -1,21 +1,15 @@
-"""CDF_INT8 and CDF_TIME_TT2000: in real files and as calendar times, against independent readers."""
+"""CDF_TIME_TT2000 as calendar times, against independent readers."""
 
 import random
 import unittest
-from dataclasses import replace
 
 import cdflib
 import numpy as np
 import pycdfpp
 
-from readers import module_reader
-from readers.case import READERS, ReadersCase, read_by, unexplained
-from readers.comparison import differences
-from readers.content import INT8, TT2000, Content
-from readers.sample_files import needs_folder, readable_files
-from support.ambrix_session import Session, array
+from readers.case import ReadersCase
+from support.ambrix_session import array
 
-EXTENDED = (INT8, TT2000)
 FIRST, LAST = -2 ** 63 + 4, 2 ** 63 - 1
 IN_1960, IN_1972 = -1262347166871870000, -883655957816000000  # 1 January of both
 SECOND = 10 ** 9
@@ -27,12 +21,7 @@ LEAPS = ((1972, 7, 1), (1973, 1, 1), (1981, 7, 1), (1999, 1, 1), (2006, 1, 1), (
          (2017, 1, 1))
 
 
-class ExtendedCase(ReadersCase):
-    def setUp(self):
-        super().setUp()
-        self.session = Session(options=["--extended"], cwd=self.folder)
-        self.addCleanup(self.session.close)
-
+class TimesTest(ReadersCase):
     def computed(self, times):
         flat = [float(component) for time in times for component in time]
         (values,) = self.session.call("computeTT2000", array("double", flat, [9, len(times)]))
@@ -42,52 +31,6 @@ class ExtendedCase(ReadersCase):
         (times,) = self.session.call("tt2000Breakdown", array("int64", list(values)))
         return np.array(times.data, int).reshape(-1, 9).tolist()
 
-
-def only_extended(content, other):
-    """What is of the two datatypes in `other`, and the same of `content`."""
-    parts = [replace(one, variables={}, attributes={}) for one in (content, other)]
-    for name, variable in other.variables.items():
-        if getattr(variable, "code", None) in EXTENDED:
-            for part, source in zip(parts, (content, other)):
-                part.variables[name] = source.variables[name]
-    for name, attribute in other.attributes.items():
-        entries = getattr(attribute, "entries", {})
-        if any(isinstance(entry, tuple) and entry[0] in EXTENDED for entry in entries.values()):
-            for part, source in zip(parts, (content, other)):
-                part.attributes[name] = source.attributes[name]
-    return parts
-
-
-def has_extended(content):
-    part = only_extended(content, content)[0]
-    return bool(part.variables or part.attributes)
-
-
-@needs_folder
-class FilesTest(ExtendedCase):
-    def test_every_value_and_entry(self):
-        files = variables = attributes = 0
-        for name, path in readable_files().items():
-            theirs = [(reader, read_by(reader, path)) for reader in READERS]
-            theirs = [(reader, content) for reader, content in theirs
-                      if isinstance(content, Content)]
-            if not any(has_extended(content) for _, content in theirs):
-                continue
-            files += 1
-            mine = module_reader.read(self.session, str(path))
-            self.assertNotIn(None, mine.variables.values(), name)
-            for reader, content in theirs:
-                with self.subTest(file=name, reader=reader.NAME):
-                    one, other = only_extended(mine, content)
-                    rest, _ = unexplained(reader, name, differences(one, other))
-                    self.assertEqual(rest, [])
-                    variables += len(other.variables)
-                    attributes += len(other.attributes)
-        self.assertGreaterEqual(files, 28)
-        self.assertGreaterEqual(variables, 2 * 28)
-
-
-class TimesTest(ExtendedCase):
     def random_values(self, first, last, count=4000):
         generator = random.Random(first)
         return [first, last, *(generator.randint(first, last) for _ in range(count))]

@@ -150,6 +150,21 @@ class CopyTest(ConvertCase):
                                  self.dump(name + ".cdf", variable["number"]))
 
 
+class ExtendedTest(ConvertCase):
+    def test_everything_is_carried_over(self):
+        self.write_times()
+        before = self.info("times.cdf")
+        values = [self.dump("times.cdf", name)["data"] for name in ("Epoch", "count")]
+        for number, options in enumerate(([], ["--majority", "column", "--checksum", "md5"],
+                                          ["--compression", "gzip:6"])):
+            out = f"out{number}.cdf"
+            self.output("convert", "times.cdf", out, *options)
+            after = self.info(out)
+            for kind in ("variables", "attributes"):
+                self.assertEqual(before[kind], after[kind])
+            self.assertEqual([self.dump(out, name)["data"] for name in ("Epoch", "count")], values)
+
+
 class RefusalTest(ConvertCase):
     def setUp(self):
         super().setUp()
@@ -163,34 +178,23 @@ class RefusalTest(ConvertCase):
             session.call("putAttrEntry", file, 0, variable, 51, f"unit{variable}")
         session.call("close", file)
 
-    def test_what_is_not_supported_stops_it(self):
-        done = self.run_tool("convert", "example.cdf", "out.cdf", status=1)
-        lines = done.stderr.decode().splitlines()
-        self.assertEqual(lines[0], 'ambrix: not supported: variable "fine time" (cdf_time_tt2000)')
-        self.assertTrue(lines[1].startswith("ambrix: ambrix:unsupportedContent: "))
-        self.assertEqual(self.files(), ["example.cdf"])
-
-    def test_it_can_be_skipped_and_entries_stay_with_their_variables(self):
-        done = self.run_tool("convert", "example.cdf", "out.cdf", "--skip-unsupported")
-        self.assertEqual(done.stderr.decode(),
-                         'ambrix: skipped: variable "fine time" (cdf_time_tt2000)\n')
-        after = self.info("out.cdf")
-        self.assertEqual([v["name"] for v in after["variables"]], ["v"])
-        self.assertEqual([(e["number"], e["values"]) for e in after["attributes"][0]["entries"]],
-                         [(0, ["unit1"]), (4, ["unit5"])])
-        self.assertEqual(self.dump("out.cdf", "v")["data"], [5])
+    def test_entries_stay_with_their_variables(self):
+        self.output("convert", "example.cdf", "out.cdf")
+        before, after = self.info("example.cdf"), self.info("out.cdf")
+        self.assertEqual(before["attributes"], after["attributes"])
+        self.assertEqual([v["name"] for v in after["variables"]], ["fine time", "v"])
 
     def test_nothing_is_overwritten(self):
         for name in ("out.cdf", "out"):
             with open(self.path("out.cdf"), "w") as file:
                 file.write("precious")
-            done = self.run_tool("convert", "example.cdf", name, "--skip-unsupported", status=1)
+            done = self.run_tool("convert", "example.cdf", name, status=1)
             self.assertIn("ambrix: ambrix:outputExists: ", done.stderr.decode())
             with open(self.path("out.cdf")) as file:
                 self.assertEqual(file.read(), "precious")
         os.symlink("nowhere", self.path("link.cdf"))
-        self.run_tool("convert", "example.cdf", "link.cdf", "--skip-unsupported", status=1)
-        self.run_tool("convert", "example.cdf", "example.cdf", "--skip-unsupported", status=1)
+        self.run_tool("convert", "example.cdf", "link.cdf", status=1)
+        self.run_tool("convert", "example.cdf", "example.cdf", status=1)
         self.assertEqual(self.files(), ["example.cdf", "link.cdf", "out.cdf"])
 
     def test_outputs_that_are_no_files(self):
@@ -203,7 +207,7 @@ class RefusalTest(ConvertCase):
 
     def test_failures(self):
         self.assert_fails("TOLVEX:ambrix:cdflib:fileOpenError", "convert", "missing.cdf", "out.cdf")
-        done = self.run_tool("convert", "example.cdf", "no/such/out.cdf", "--skip-unsupported",
+        done = self.run_tool("convert", "example.cdf", "no/such/out.cdf",
                              status=1)
         self.assertIn("ambrix: ambrix:noSuchFolder: ", done.stderr.decode())
         for options in (["--compression", "zip"], ["--compression", "gzip:0"],

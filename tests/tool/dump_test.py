@@ -7,7 +7,7 @@ import unittest
 
 from support.ambrix_session import array
 from tool.example_file import DATATYPES, write_example
-from tool.support import ToolCase
+from tool.support import INTEGERS, TIMES, TIME_TEXTS, ToolCase
 
 
 class DumpTest(ToolCase):
@@ -136,13 +136,31 @@ class DumpTest(ToolCase):
         self.assertEqual(rows[1 + 2 + 3 * (999 + 1000 * 250)], ["1", "2", "999", "250", "251"])
         self.assertEqual(rows[-1], ["1", "2", "999", "399", "400"])
 
-    def test_datatypes_that_are_not_supported(self):
-        session = self.session()
-        (file,) = session.call("open", "example.cdf")
-        session.call("createVar", file, "fine time", 33, 1, [], True, [])
-        session.call("close", file)
-        self.assertIn("cdf_time_tt2000", self.assert_fails("ambrix:unsupportedDatatype", "dump",
-                                                           "example.cdf", "fine time"))
+    def dump_all(self, variable, *options):
+        """Of "times.cdf": the values in a table, in CSV and in JSON."""
+        run = lambda form: self.output("dump", "times.cdf", variable, "--format", form, *options)
+        table, rows = (run(form).splitlines()[1:] for form in ("table", "csv"))
+        return ([line.split()[-1] for line in table], [row.split(",")[-1] for row in rows],
+                json.loads(run("json"))["data"])
+
+    def test_integers_of_64_bits(self):
+        self.write_times()
+        texts = [str(value) for value in INTEGERS]
+        self.assertEqual(self.dump_all("count"), (texts, texts, [INTEGERS[:2], INTEGERS[2:]]))
+
+    def test_tt2000_times(self):
+        """Fill and pad values are no times."""
+        self.write_times()
+        shown = [*map(str, TIMES[:2]), *TIME_TEXTS]
+        self.assertEqual(self.dump_all("Epoch"), (shown, shown, TIMES[:2] + TIME_TEXTS))
+
+    def test_raw_times(self):
+        self.write_times()
+        texts = [str(value) for value in TIMES]
+        self.assertEqual(self.dump_all("Epoch", "--raw-times"), (texts, texts, TIMES))
+        self.assertEqual(self.data("CDF_EPOCH", "--raw-times"), [62987673600000, -1e31])
+        self.assertEqual(self.data("fine", "--raw-times"), ["63251680091 22033044055"])
+        self.assertEqual(self.data("CDF_INT2", "--raw-times"), self.data("CDF_INT2"))
 
     def test_failures(self):
         message = self.assert_fails("ambrix:noSuchVariable", "dump", "example.cdf", "nonsense")

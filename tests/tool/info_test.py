@@ -6,7 +6,7 @@ import subprocess
 import unittest
 
 from tool.example_file import DATATYPES, write_example
-from tool.support import TOOL, ToolCase, sample
+from tool.support import INTEGERS, PAD, TIMES, TIME_TEXTS, TOOL, ToolCase, sample
 
 NOBODY = 65534
 
@@ -79,17 +79,20 @@ class InfoTest(ToolCase):
         lines = self.output("info", "--attributes", "example.cdf").splitlines()
         self.assertTrue(any(line.endswith("\u6f22\u5b57") for line in lines))
 
-    def test_unsupported_datatypes_are_listed(self):
-        session = self.session()
-        (file,) = session.call("open", "example.cdf")
-        session.call("createVar", file, "fine time", 33, 1, [2], True, [True])
-        session.call("createVar", file, "long", 8, 1, [], True, [])
-        session.call("close", file)
-        time, long = self.info("--attributes")["variables"][-2:]
-        self.assertEqual((time["name"], time["datatype"], time["supported"], time["records"]),
-                         ("fine time", "cdf_time_tt2000", False, 0))
-        self.assertEqual((long["datatype"], long["supported"]), ("cdf_int8", False))
-        self.assertIn("cdf_time_tt2000 (not supported)", self.output("info", "example.cdf"))
+    def test_extended_datatypes(self):
+        self.write_times()
+        info = self.info("--attributes", file="times.cdf")
+        time, count = info["variables"]
+        self.assertEqual([(v["datatype"], v["supported"], v["elements"], v["dimensions"],
+                           v["records"], v["padValue"]) for v in (time, count)],
+                         [("cdf_time_tt2000", True, 1, [], 4, [TIMES[1]]),
+                          ("cdf_int8", True, 1, [2], 2, [PAD])])
+        self.assertEqual([entry["values"] for entry in info["attributes"][0]["entries"]],
+                         [TIME_TEXTS[:1], INTEGERS])
+        table = self.output("info", "--attributes", "times.cdf")
+        self.assertNotIn("not supported", table)
+        self.assertIn(TIME_TEXTS[0], table)
+        self.assertIn(", ".join(map(str, INTEGERS)), table)
 
     def test_sample_files(self):
         facts = self.info(file=sample("example1.cdf"))

@@ -6,10 +6,15 @@ import tempfile
 import unittest
 from unittest import mock
 
-from support.ambrix_session import Session
+from support.ambrix_session import Session, array
 
 TOOL = os.environ["AMBRIX_TOOL"]
 SAMPLES = os.environ.get("AMBRIX_CDF_SAMPLES", "")
+# Of `write_times`: a fill and a pad value, the middle of a leap second, a time before 1972.
+TIMES = [-2**63, -2**63 + 1, 536500868684000001, -1090234640957376994]
+TIME_TEXTS = ["2016-12-31T23:59:60.500000001", "1965-06-15T01:02:03.004005006"]
+INTEGERS = [2**63 - 1, -2**63, 9007199254740993, 0]
+PAD = -9007199254740993
 
 
 def sample(name):
@@ -77,7 +82,25 @@ class ToolCase(unittest.TestCase):
         self.assertNotIn("terminate", done.stderr.decode())
         return done.stderr.decode()
 
-    def session(self):
-        session = Session(cwd=self.folder)
+    def write_times(self, name="times", compressed=False):
+        """A file with variables of the extended datatypes and their entries."""
+        times = TIMES + list(range(1000)) if compressed else TIMES  # few do not become smaller
+        with self.session("--extended") as session:
+            call = session.call
+            (file,) = call("create", name)
+            call("createVar", file, "Epoch", 33, 1, [], True, [])
+            if compressed:
+                call("setVarCompression", file, 0, session.constant("GZIP_COMPRESSION"), 6)
+            call("hyperPutVarData", file, 0, 0, len(times), 1, [], [], [], array("int64", times))
+            call("createVar", file, "count", 8, 1, [2], True, [True])
+            call("setVarPadValue", file, 1, array("int64", [PAD]))
+            call("hyperPutVarData", file, 1, 0, 2, 1, [0], [2], [1], array("int64", INTEGERS))
+            call("createAttr", file, "VALIDMAX", 2)
+            call("putAttrEntry", file, 0, 0, 33, array("int64", TIMES[2:3]))
+            call("putAttrEntry", file, 0, 1, 8, array("int64", INTEGERS))
+            call("close", file)
+
+    def session(self, *options):
+        session = Session(options=options, cwd=self.folder)
         self.addCleanup(session.close)
         return session

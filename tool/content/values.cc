@@ -42,23 +42,25 @@ void formatNumbers(ArrayView cells, const Sink& /*sink*/) {
   throw std::logic_error(std::string("no value is of class ") + cells.className());
 }
 
-/// What is no time is written as the numbers that it consists of.
-void formatNoTime(std::span<const double> value, const Sink& sink) {
+/// A time as the numbers that it consists of.
+template <typename T>
+void formatRawTime(std::span<const T> value, const Sink& sink) {
   if (value.size() == 1) return formatNumber(value.front(), sink);
   std::string numbers;
-  for (const double number : value) {
+  for (const T number : value) {
     if (!numbers.empty()) numbers += ' ';
     formatNumber(number, [&](const ValueView& text) { numbers += text.text; });
   }
   sink({numbers, true});
 }
 
-void formatTimes(Module& module, ArrayView array, Datatype datatype, const Sink& sink) {
-  const std::size_t elements = elementsPerValue(datatype, 1);
-  auto numbers = array.data<double>();
-  for (const std::string& text : timesAsText(module, array, datatype)) {
+/// What has no text is written as its numbers.
+template <typename T>
+void formatTimes(std::span<const std::string> texts, std::span<const T> numbers, const Sink& sink) {
+  const std::size_t elements = texts.empty() ? 1 : numbers.size() / texts.size();
+  for (const std::string& text : texts) {
     if (text.empty()) {
-      formatNoTime(numbers.first(elements), sink);
+      formatRawTime(numbers.first(elements), sink);
     } else {
       sink({text, true});
     }
@@ -66,11 +68,24 @@ void formatTimes(Module& module, ArrayView array, Datatype datatype, const Sink&
   }
 }
 
+void formatTimes(Module& module, ArrayView array, Datatype datatype, TimeForm form,
+                 const Sink& sink) {
+  const std::vector<std::string> texts =
+      form == TimeForm::kCalendar
+          ? timesAsText(module, array, datatype)
+          : std::vector<std::string>(array.elementCount() / elementsPerValue(datatype, 1));
+  if (array.classId() == ClassId::kInt64) {
+    formatTimes(std::span(texts), array.data<std::int64_t>(), sink);
+  } else {
+    formatTimes(std::span(texts), array.data<double>(), sink);
+  }
+}
+
 }  // namespace
 
 void eachValue(Module& module, ArrayView array, Datatype datatype, std::size_t elements,
-               const Sink& sink) {
-  if (isTimeType(datatype)) return formatTimes(module, array, datatype, sink);
+               TimeForm form, const Sink& sink) {
+  if (isTimeType(datatype)) return formatTimes(module, array, datatype, form, sink);
   if (!isCharacterType(datatype)) {
     return visit(array, [&](auto numbers) { formatNumbers(numbers, sink); });
   }
@@ -81,7 +96,7 @@ void eachValue(Module& module, ArrayView array, Datatype datatype, std::size_t e
 std::vector<ValueText> formatValues(Module& module, ArrayView array, Datatype datatype,
                                     std::size_t elements) {
   std::vector<ValueText> values;
-  eachValue(module, array, datatype, elements, [&](const ValueView& value) {
+  eachValue(module, array, datatype, elements, TimeForm::kCalendar, [&](const ValueView& value) {
     values.push_back({std::string(value.text), value.isText});
   });
   return values;

@@ -24,12 +24,15 @@ struct ValueView {
   bool isText = false;
 };
 
-/// Gives the values in an array that the module has read to `sink`, one after the other. Times
-/// become ISO 8601; numbers are written with as many digits as tell them apart. `elements` is the
-/// number of characters in a text.
+/// Times as ISO 8601, where they are some, or as the numbers that the file has.
+enum class TimeForm { kCalendar, kNumbers };
+
+/// Gives the values in an array that the module has read to `sink`, one after the other. Numbers
+/// are written with as many digits as tell them apart. `elements` is the number of characters in a
+/// text.
 void eachValue(Module& module, ArrayView array, Datatype datatype, std::size_t elements,
-               const std::function<void(const ValueView&)>& sink);
-/// All of them.
+               TimeForm form, const std::function<void(const ValueView&)>& sink);
+/// All of them, times as calendar times.
 std::vector<ValueText> formatValues(Module& module, ArrayView array, Datatype datatype,
                                     std::size_t elements);
 

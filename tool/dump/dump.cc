@@ -84,11 +84,11 @@ class IndexCounter {
 };
 
 void printSlab(Module& module, ArrayView data, const Variable& variable, const Slab& slab,
-               DumpFormat& format, StandardOutput& output) {
+               TimeForm form, DumpFormat& format, StandardOutput& output) {
   constexpr std::size_t kWrittenTogether = 1 << 16;
   IndexCounter counter(slab);
   std::string text;
-  eachValue(module, data, variable.datatype, variable.elements, [&](const ValueView& value) {
+  eachValue(module, data, variable.datatype, variable.elements, form, [&](const ValueView& value) {
     format.append(text, counter.record(), counter.indices(), value);
     counter.advance();
     if (text.size() < kWrittenTogether) return;
@@ -133,10 +133,11 @@ void runDump(Module& module, const DumpOptions& options, StandardOutput& output)
   SlabPlan plan(variable, range.first, range.end);
   Progress progress(printable(variable.name), (range.end - range.first) * variable.recordElements(),
                     errorIsTerminal() && !output.isTerminal());
+  const TimeForm form = options.rawTimes ? TimeForm::kNumbers : TimeForm::kCalendar;
   output.write(format->begin());
   while (const auto slab = plan.next()) {
     const Array data = file.read(variable, *slab);
-    printSlab(module, data, variable, *slab, *format, output);
+    printSlab(module, data, variable, *slab, form, *format, output);
     progress.advance(data.elementCount());
   }
   output.write(format->end());

@@ -17,6 +17,7 @@ struct DumpOptions {
   std::string format;  // empty: what the output's name ends with, or a table
   std::string output;  // empty: standard output
   bool defuseFormulas = false;
+  bool rawTimes = false;
 };
 
 /// Throws `UsageError` for records that are no range, and `ToolError` for those that are not there.

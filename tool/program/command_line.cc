@@ -104,6 +104,8 @@ void addDump(CLI::App& app, Arguments& arguments) {
                 "In CSV, put an apostrophe before texts that begin\n"
                 "with = + - @ tab or carriage return, which a\n"
                 "spreadsheet would take for formulas");
+  dump.add_flag("--raw-times", arguments.dump.rawTimes,
+                "Print times as the numbers that the file has");
   addLimits(dump, arguments);
 }
 
@@ -136,7 +138,7 @@ void addConvert(CLI::App& app, Arguments& arguments) {
       ->type_name("CHECKSUM")
       ->transform(CLI::IsMember({"md5", "none"}));
   convert.add_flag("--skip-unsupported", options.skipUnsupported,
-                   "Leave out what is not supported, and list it");
+                   "Leave out what has an unknown datatype, and list it");
   addLimits(convert, arguments);
 }
 

@@ -28,8 +28,8 @@ inline constexpr HelpText kInfoHelp = {
     "Dimensions are listed as a host's arrays have them: the one that varies\n"
     "fastest comes first. \"Varies\" tells whether values differ from record to\n"
     "record and, after the slash, along each dimension. The percentage is what\n"
-    "compression leaves of the size. A variable of a datatype that is not supported\n"
-    "is listed as far as it is known.\n",
+    "compression leaves of the size. A variable of an unknown datatype is listed as\n"
+    "far as it is known.\n",
     "  ambrix info data.cdf\n"
     "  ambrix info --attributes data.cdf\n"
     "  ambrix info --json data.cdf | jq '.variables[].name'\n"};
@@ -37,10 +37,13 @@ inline constexpr HelpText kInfoHelp = {
 inline constexpr HelpText kDumpHelp = {
     "dump", "FILE VARIABLE [OPTION...]", "Prints the values of a variable",
     "Record numbers and indices begin at 0, and the first index varies fastest.\n"
-    "Epochs are printed as times. Epochs that are no times, such as fill values,\n"
-    "are printed as numbers. In JSON, the data are nested with the first index\n"
-    "innermost.\n",
+    "Epochs and TT2000 times are printed as times of UTC, the latter with leap\n"
+    "seconds. What is no time, such as a fill value, is printed as a number.\n"
+    "--raw-times prints the numbers of all: milliseconds of CDF_EPOCH, seconds and\n"
+    "picoseconds of CDF_EPOCH16, nanoseconds of CDF_TIME_TT2000. In JSON, the data\n"
+    "are nested with the first index innermost.\n",
     "  ambrix dump data.cdf Epoch\n"
+    "  ambrix dump data.cdf Epoch --raw-times\n"
     "  ambrix dump data.cdf 3 --records 10:19\n"
     "  ambrix dump data.cdf B_GSE --output b_gse.csv\n"};
 
@@ -52,7 +55,7 @@ inline constexpr HelpText kCheckHelp = {
     "\n"
     "A file is sound, not sound or undecided. It is undecided when nothing wrong\n"
     "was found, but something was not read: memory, time or descriptors ran out, or\n"
-    "a datatype is not supported.\n"
+    "a datatype is not known.\n"
     "\n"
     "The exit status is 0 if all files are sound, 1 if one is not sound, and 3\n"
     "otherwise. In JSON, \"sound\" is true, false or null.\n",
@@ -96,9 +99,9 @@ inline constexpr HelpText kConvertHelp = {
     "OUT gets the extension .cdf if it has none. An existing file is never\n"
     "overwritten. Nothing is left behind when the conversion fails.\n"
     "\n"
-    "The conversion fails if a datatype is not supported, and lists the variables\n"
-    "and entries that have it. --skip-unsupported leaves them out. It also fails if\n"
-    "a variable claims more records than the file has room for.\n",
+    "The conversion fails if a datatype is not known, and lists the variables and\n"
+    "entries that have it. --skip-unsupported leaves them out. It also fails if a\n"
+    "variable claims more records than the file has room for.\n",
     "  ambrix convert old.cdf new.cdf --compression gzip:6\n"
     "  ambrix convert rows.cdf columns.cdf --majority column --checksum md5\n"};
 

@@ -34,8 +34,7 @@ enum class Datatype : int {
 };
 
 /// What is known of a datatype. Commands take kInt8 and kTimeTt2000 only when the module is
-/// extended
-/// (`Module::setExtended`).
+/// extended (`Module::setExtended`); `File` always does.
 struct DatatypeFacts {
   Datatype datatype;
   std::string_view name;  // as the commands tell it: "cdf_int4"

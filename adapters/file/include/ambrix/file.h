@@ -36,6 +36,9 @@ class EntryFinder;
 /// An open file. The module must stay where it is, and loaded, until its files are closed. Members
 /// throw what the module raises, `Error`, and `FileError`. Numbers of variables and attributes
 /// change when one before them is deleted: what was found earlier is to be found anew then.
+///
+/// A file has values of all datatypes, the extended ones included (CDF_INT8, CDF_TIME_TT2000),
+/// whatever `Module::setExtended` has said. That is for calls of commands, by `call` as well.
 class AMBRIX_EXPORT File {
  public:
   /// Opens a file for reading, unless the options say otherwise. Open a file once at a time.

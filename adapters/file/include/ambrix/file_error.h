@@ -14,7 +14,7 @@ namespace ambrix {
 /// |---|---|
 /// | ambrix:noSuchVariable | there is no variable of that name |
 /// | ambrix:noSuchAttribute | there is no attribute of that name |
-/// | ambrix:unsupportedDatatype | the values are of a datatype that commands refuse |
+/// | ambrix:unsupportedDatatype | the values are of a datatype that is not known |
 /// | ambrix:wrongScope | an attribute that is to be set belongs to the file, not to variables, or
 ///   the other way round |
 /// | ambrix:partOfRecord | what is to be written is no number of whole records |
