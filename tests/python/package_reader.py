@@ -5,6 +5,8 @@ import ambrix
 from readers.content import CHARACTERS, EPOCH16, Attribute, Content, Variable, dtype_of
 
 CODES = {datatype.name: code for code, datatype in ambrix.datatypes.DATATYPES.items()}
+# From the first zero byte of a text on, versions of the library before 3.9 give blanks.
+GIVES_BLANKS = ambrix.commands.getLibraryVersion() < (3, 9)
 SPARSE = {"NO_SPARSERECORDS": "no", "PAD_SPARSERECORDS": "pad", "PREV_SPARSERECORDS": "previous"}
 
 
@@ -12,6 +14,7 @@ def read(path):
     """Everything in the file."""
     with ambrix.open(path) as file:
         content = Content(file.majority == "ROW_MAJOR")
+        content.nul_reads_as = ord(" ") if GIVES_BLANKS else 0
         for name, variable in file.items():
             content.variables[as_bytes(name).decode("latin-1")] = variable_of(variable)
         names = [as_bytes(name).decode("latin-1") for name in file]

@@ -93,6 +93,8 @@ class SpacepyTest(unittest.TestCase):
         if not variable.record_varies and variable.records == 0:
             self.assertEqual(theirs.size, 0)  # no record was written: the pad value is read
         elif variable.raw.dtype.kind == "S":
+            if package_reader.GIVES_BLANKS:
+                mine, theirs = np.char.rstrip(mine), np.char.rstrip(theirs)
             self.assertEqual(mine.tolist(), theirs.tolist())
         elif theirs.ndim == 0:  # which has lost its datatype
             self.assertEqual(mine.astype(theirs.dtype), theirs)
