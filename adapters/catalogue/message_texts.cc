@@ -45,7 +45,7 @@ constexpr MessageText kTexts[] = {
      "The file could not be opened: see that it exists, that it can be read and that it is a CDF "
      "file."},
     {"TOLVEX:ambrix:cdflib:illegalEpochValue",
-     "The components don't make a valid time: see that each is in its range."},
+     "The components are not a valid time: check that each is in its range."},
     {"TOLVEX:ambrix:cdflib:invalidCharError",
      "The file name has a character that file names can't have here: see that it is valid text."},
     {"TOLVEX:ambrix:cdflib:invalidCompressionParameter",
@@ -59,7 +59,7 @@ constexpr MessageText kTexts[] = {
     {"TOLVEX:ambrix:cdflib:mismatchedVarianceSize",
      "There are {1} dimension variances for {2} dimensions: give one variance for each dimension."},
     {"TOLVEX:ambrix:cdflib:unrecognizedConstantName",
-     "There is no constant \"{1}\": \"getConstantNames\" lists those there are."},
+     "There is no constant \"{1}\": \"getConstantNames\" lists all constants."},
     {"TOLVEX:ambrix:cdflib:unrecognizedValue",
      "The value {1} has no meaning as {2}: use one of the CDF library's constants, which "
      "\"getConstantValue\" gives by name."},
@@ -86,7 +86,7 @@ constexpr MessageText kTexts[] = {
     {"TOLVEX:ambrix:validate:argumentOutOfBounds",
      "A number is too large for a signed 64-bit integer: give one between -2^63 and 2^63."},
     {"TOLVEX:ambrix:validate:wrongNumberOfInputs",
-     "The command takes another number of arguments: see its description."},
+     "The number of arguments is wrong: see the description of the command."},
     {"TOLVEX:host:badDimension",
      "An array can't have a negative size: see that every count asked for is 0 or more."},
     {"TOLVEX:host:outOfMemory",

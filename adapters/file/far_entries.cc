@@ -29,8 +29,8 @@ class ScratchCopy {
     if (!error) return;
     discard();
     throw FileError(file.path(), "noScratchCopy",
-                    std::string(kFarApart) + "there can be no copy in " + parent.string() +
-                        " to look for them: " + error.message());
+                    std::string(kFarApart) + "no copy can be made in " + parent.string() +
+                        " to find them: " + error.message());
   }
   ScratchCopy(const ScratchCopy&) = delete;
   ScratchCopy& operator=(const ScratchCopy&) = delete;

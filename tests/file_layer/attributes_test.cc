@@ -100,7 +100,7 @@ TEST_F(FileAttributesTest, FindsEntriesWhoseNumbersLieFarApart) {
   std::filesystem::remove("scratch");
   EXPECT_THAT(errorOf([&] { read.entries(title); }),
               testing::StartsWith("ambrix:noScratchCopy: new: the file has entries with numbers "
-                                  "far apart, and there can be no copy in scratch"));
+                                  "far apart, and no copy can be made in scratch"));
 }
 
 TEST_F(FileAttributesTest, DescribesAWholeFile) {

@@ -42,7 +42,7 @@ class FullDiskTest(unittest.TestCase):
             done = run(folder, os.environ["AMBRIX_OCTAVE_CLI"], "--norc", "--no-history", "--path",
                        os.environ["AMBRIX_OCTAVE"], "--eval", CODE)
         self.assertEqual(done.returncode, 0, done.stdout)
-        self.assertIn("perhaps for want of room on the disk", done.stdout)
+        self.assertIn("perhaps for lack of disk space", done.stdout)
         self.assertNotIn("warning", done.stdout)  # of files that were still open
 
 

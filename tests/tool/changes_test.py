@@ -13,7 +13,7 @@ MARK = "~"  # the module writes no zero bytes in the midst of texts
 class ChangesTest(ConvertCase):
     """What a copy does not keep, on one line."""
 
-    CUT = "1 text of attributes ended at a zero byte, and what followed is zeros now"
+    CUT = "1 text of attributes ended at a zero byte, and the rest is now zeros"
 
     def write_texts(self, *texts, version2=False):
         session = self.session()
@@ -86,7 +86,7 @@ class ChangesTest(ConvertCase):
         sizes = [os.path.getsize(self.path(name)) for name in (file, out)]
         self.assertGreater(sizes[1], 1.5 * sizes[0])
         return (f"ambrix: changed in {out}: {sizes[0]} bytes became {sizes[1]}, "
-                "with the room that the library reserves\n")
+                "including space that the library reserves\n")
 
     @needs_folder
     def test_variables_of_the_old_kind(self):

@@ -182,7 +182,7 @@ class DamageTest(CheckCase):
         self.assert_misused("check")
         self.assert_misused("check", "--nonsense", "example.cdf")
         for wrong in ("-1", "soon", "", "nan", "1s"):
-            self.assertIn(f"'{wrong}' is no number of seconds",
+            self.assertIn(f"'{wrong}' is not a number of seconds",
                           self.assert_misused("check", "example.cdf", "--time-limit", wrong))
 
     def start_checking(self, *options):

@@ -10,7 +10,7 @@ from support.ambrix_session import array
 from tool.example_file import write_example
 from tool.support import ToolCase, sample
 
-GROWTH = r"(\d+) bytes became (\d+), with the room that the library reserves"
+GROWTH = r"(\d+) bytes became (\d+), including space that the library reserves"
 SETTINGS = ("version", "encoding", "file", "majority", "compression", "checksum")
 
 

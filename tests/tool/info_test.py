@@ -112,14 +112,14 @@ class InfoTest(ToolCase):
         for name, content, cause in (
                 ("missing", None, "there is no such file"), ("folder", None, "it is a folder"),
                 ("pipe", None, "it is a device or a pipe"), ("empty", b"", "it is empty"),
-                ("text", b"text" * 99, "it is no CDF file"),
-                ("netcdf", b"CDF\x01" + bytes(99), "it is no CDF file but one of netCDF"),
-                ("hdf", b"\x89HDF\r\n\x1a\n" + bytes(99), "it is no CDF file but one of HDF5"),
-                ("gzip", b"\x1f\x8b" + bytes(99), "it is no CDF file but something packed by gzip"),
-                ("cut", sound[:-2000], "it is damaged: it breaks off after"),
+                ("text", b"text" * 99, "it is not a CDF file"),
+                ("netcdf", b"CDF\x01" + bytes(99), "it is not a CDF file but a netCDF file"),
+                ("hdf", b"\x89HDF\r\n\x1a\n" + bytes(99), "it is not a CDF file but an HDF5 or netCDF file"),
+                ("gzip", b"\x1f\x8b" + bytes(99), "it is not a CDF file but is packed by gzip"),
+                ("cut", sound[:-2000], "it is damaged: it ends after"),
                 ("later", sound[:28] + b"\0\0\0\4" + sound[32:], "it was written by version 4."),
                 ("new", b"\xcd\xf4" + sound[2:], "it was written by a later version"),
-                ("x" * 600, None, "the path has 600 bytes, and the CDF library takes 512 at most"),
+                ("x" * 600, None, "the path has 600 bytes, and the CDF library accepts at most 512"),
                 ("\x1b", None, "there is no such file")):
             if content is not None:
                 with open(self.path(name), "wb") as file:
@@ -145,7 +145,7 @@ class InfoTest(ToolCase):
             file.write(content)
         message = self.assert_fails("TOLVEX:ambrix:cdflib:fileOpenError", "info", "times.cdf")
         self.assertEqual(message, "times.cdf: it has times by a table of leap seconds of 20991231, "
-                         "and that of the CDF library is outdated; name a newer one in the "
+                         "and the table of the CDF library is outdated; name a newer one in the "
                          "environment variable CDF_LEAPSECONDSTABLE")
 
     def test_files_that_may_not_be_read(self):

@@ -36,7 +36,7 @@ void reportUnsupported(File& input, bool skip) {
     std::fprintf(stderr, "ambrix: %s: %s\n", skip ? "skipped" : "not supported", line.c_str());
   if (lines.empty() || skip) return;
   throw ToolError("unsupportedContent",
-                  "not everything can be carried over; nothing was written"
+                  "not everything can be copied; nothing was written"
                   " (--skip-unsupported leaves it out)");
 }
 
@@ -48,7 +48,7 @@ void requireFileName(const fs::path& wanted) {
     throw ToolError("noFileName", wanted.string() + " is a folder; name the file to write in it");
   }
   if (fs::exists(status) && !fs::is_regular_file(status)) {
-    throw ToolError("noFileName", wanted.string() + " is a device or a pipe, and no file");
+    throw ToolError("noFileName", wanted.string() + " is a device or a pipe, not a file");
   }
 }
 
@@ -67,7 +67,7 @@ std::string describeVariables(const fs::path& input) {
 std::string describeTexts(const Conversion& conversion) {
   if (conversion.cutTexts == 0) return "";
   return counted(conversion.cutTexts, "text") +
-         " of attributes ended at a zero byte, and what followed is zeros now";
+         " of attributes ended at a zero byte, and the rest is now zeros";
 }
 
 /// Growth that nobody asked for: the library reserves room anew, which shows in small files.
@@ -79,7 +79,8 @@ std::string describeGrowth(const Conversion& conversion, const fs::path& input,
   const std::uintmax_t after = error ? 0 : fs::file_size(output, error);
   if (error || conversion.input.text("getFormat") != "SINGLE_FILE") return "";
   if (after / 3 * 2 <= before) return "";
-  return fmt::format("{} bytes became {}, with the room that the library reserves", before, after);
+  return fmt::format("{} bytes became {}, including space that the library reserves", before,
+                     after);
 }
 
 /// Tells on one line what of the input was not carried over as it is.

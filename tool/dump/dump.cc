@@ -28,7 +28,7 @@ std::size_t findVariable(File& file, const std::string& name) {
   const auto number = parseCount(name);
   if (number && *number < file.variableCount()) return *number;
   throw ToolError("noSuchVariable", "there is no variable \"" + printable(name) +
-                                        "\"; 'ambrix info' lists those there are");
+                                        "\"; 'ambrix info' lists the variables");
 }
 
 std::size_t parseBound(std::string_view text, std::size_t whenLeftOut) {

@@ -16,7 +16,7 @@ namespace ambrix::tool {
 namespace {
 
 constexpr const char* kDamagedOrUnknown =
-    "it is damaged, or of a kind that this version of the CDF library does not take";
+    "it is damaged, or this version of the CDF library does not support it";
 
 namespace fs = std::filesystem;
 
@@ -38,7 +38,7 @@ std::array<std::uint32_t, 3> libraryVersion(Module& module) {
 std::string explainLeapSeconds(std::uint32_t table) {
   if (table > kLeapSecondTable) {
     return fmt::format(
-        "it has times by a table of leap seconds of {}, and that of the CDF library is "
+        "it has times by a table of leap seconds of {}, and the table of the CDF library is "
         "outdated; name a newer one in the environment variable "
         "CDF_LEAPSECONDSTABLE",
         table);
@@ -53,12 +53,12 @@ std::string explainCdf(Module& module, const FileHeader& header, std::uint64_t b
   const auto library = libraryVersion(module);
   if (header.version > library) {
     return fmt::format(
-        "it was written by version {} of the CDF library, which is later than the one "
-        "in use ({}), or it is damaged",
+        "it was written by version {} of the CDF library, which is later than the "
+        "version in use ({}), or it is damaged",
         versionText(header.version), versionText(library));
   }
   if (bytes < header.end) {
-    return fmt::format("it is damaged: it breaks off after {} of {} bytes", bytes, header.end);
+    return fmt::format("it is damaged: it ends after {} of {} bytes", bytes, header.end);
   }
   const std::uint32_t table = header.leapSecondTable;
   if (table != 0 && table != kLeapSecondTable) return explainLeapSeconds(table);
@@ -77,15 +77,15 @@ std::string explainContent(Module& module, const FileHeader& header, std::uint64
     case Kind::kLaterCdf:
       return "it was written by a later version of the CDF library than the one in use";
     case Kind::kNetCdf:
-      return "it is no CDF file but one of netCDF";
+      return "it is not a CDF file but a netCDF file";
     case Kind::kHdf:
-      return "it is no CDF file but one of HDF5 or netCDF";
+      return "it is not a CDF file but an HDF5 or netCDF file";
     case Kind::kGzip:
-      return "it is no CDF file but something packed by gzip; unpack it first";
+      return "it is not a CDF file but is packed by gzip; unpack it first";
     case Kind::kOther:
       break;
   }
-  return "it is no CDF file";
+  return "it is not a CDF file";
 }
 
 }  // namespace
@@ -94,14 +94,14 @@ void requireOpenable(const std::string& path) {
   const fs::path file = fileOnDisk(path);
   if (file.native().size() > kLongestPath) {
     throw OpenError(
-        fmt::format("the path has {} bytes, and the CDF library takes {} at most; go to "
+        fmt::format("the path has {} bytes, and the CDF library accepts at most {}; go to "
                     "its folder first, or rename it",
                     file.native().size(), kLongestPath));
   }
   std::error_code error;
   const fs::file_status status = fs::status(file, error);
   if (fs::exists(status) && !fs::is_regular_file(status) && !fs::is_directory(status)) {
-    throw OpenError("it is a device or a pipe; copy what it holds to a file first");
+    throw OpenError("it is a device or a pipe; copy its contents to a file first");
   }
 }
 
@@ -116,7 +116,7 @@ std::string explainRefusal(Module& module, const std::string& path) {
   const std::uintmax_t bytes = fs::file_size(file, error);
   if (!error && bytes == 0) return "it is empty";
   const auto header = readFileHeader(file);
-  return header ? explainContent(module, *header, bytes) : "it is no CDF file";
+  return header ? explainContent(module, *header, bytes) : "it is not a CDF file";
 }
 
 bool isOpenFailure(const Error& error) {

@@ -20,7 +20,7 @@ void requireIndexed(File& file, const Variable& variable, double records) {
   const double indexed = countIndexedRecords(file, variable);
   if (records <= indexed) return;
   throw DamagedCounts(
-      fmt::format("variable \"{}\" claims records up to {}, but the file has room for {} only: it "
+      fmt::format("variable \"{}\" claims records up to {}, but the file has room only for {}: it "
                   "is damaged",
                   printable(variable.name), records - 1, std::max(indexed, 0.0)));
 }

@@ -58,7 +58,7 @@ T readNonFinite(const std::string& text) {
   if (text == "NaN") return std::numeric_limits<T>::quiet_NaN();
   if (text == "Inf") return std::numeric_limits<T>::infinity();
   if (text == "-Inf") return -std::numeric_limits<T>::infinity();
-  throw JsonError("a text that is no number");
+  throw JsonError("a text that is not a number");
 }
 
 template <std::floating_point T>

@@ -23,7 +23,7 @@ Json parseWatched(std::string_view text) {
 }  // namespace
 
 Json parseJson(std::string_view text) {
-  if (text.find('\0') != text.npos) throw JsonError("a zero byte is no JSON");
+  if (text.find('\0') != text.npos) throw JsonError("a zero byte is not JSON");
   try {
     return parseWatched(hideSurrogates(text));
   } catch (const Json::out_of_range&) {

@@ -46,11 +46,11 @@ std::string requireSeconds(const std::string& text) {
   double seconds = -1;
   const auto end = std::from_chars(text.data(), text.data() + text.size(), seconds).ptr;
   const bool understood = end == text.data() + text.size() && seconds >= 0;
-  return understood ? "" : "'" + text + "' is no number of seconds";
+  return understood ? "" : "'" + text + "' is not a number of seconds";
 }
 
 std::string requireBytes(const std::string& text) {
-  return text.starts_with('-') ? "'" + text + "' is no number of bytes" : "";
+  return text.starts_with('-') ? "'" + text + "' is not a number of bytes" : "";
 }
 
 /// A number of bytes, also as "512MB" or "4GiB".
@@ -66,12 +66,12 @@ void addBytes(CLI::App& command, const char* name, std::size_t& bytes, const cha
 void addLimits(CLI::App& command, Arguments& arguments) {
   command
       .add_option("--time-limit", arguments.limits.seconds,
-                  fmt::format("Give up when nothing was read for so long (default:\n{}; 0: never)",
+                  fmt::format("Stop when nothing was read for this time (default:\n{}; 0: never)",
                               kTimeLimit))
       ->type_name("SECONDS")
       ->check(requireSeconds);
   addBytes(command, "--memory-limit", arguments.limits.memory,
-           "Give up when reading takes more memory, as in 2GB\n"
+           "Stop when reading takes more memory, as in 2GB\n"
            "(default: three quarters of the machine's; 0: none)");
 }
 
@@ -93,7 +93,7 @@ void addDump(CLI::App& app, Arguments& arguments) {
                   "Only records A to B; one may be left out, and A\nalone is one record")
       ->type_name("A:B");
   dump.add_option("--format", arguments.dump.format,
-                  "table, csv or json (default: what OUT ends with, or\na table)")
+                  "table, csv or json (default: by the extension\nof OUT, or a table)")
       ->type_name("FORMAT")
       ->transform(CLI::IsMember({"table", "csv", "json"}));
   dump.add_option("--output", arguments.dump.output,
@@ -113,7 +113,7 @@ void addCheck(CLI::App& app, Arguments& arguments) {
   CLI::App& check = addCommand(app, kCheckHelp);
   check.add_option("FILE", arguments.check.files, "The files")->required()->type_name("");
   check.add_flag("--json", arguments.check.json, "Print a JSON list with an object for each file");
-  check.add_flag("--quiet", arguments.check.quiet, "Tell only of files that are not sound");
+  check.add_flag("--quiet", arguments.check.quiet, "List only files that are not sound");
   addLimits(check, arguments);
 }
 
@@ -138,7 +138,7 @@ void addConvert(CLI::App& app, Arguments& arguments) {
       ->type_name("CHECKSUM")
       ->transform(CLI::IsMember({"md5", "none"}));
   convert.add_flag("--skip-unsupported", options.skipUnsupported,
-                   "Leave out what has an unknown datatype, and list it");
+                   "Leave out data of unknown datatypes, and list them");
   addLimits(convert, arguments);
 }
 
@@ -161,9 +161,9 @@ void addSession(CLI::App& app, Arguments& arguments) {
   CLI::App& session = addCommand(app, kSessionHelp);
   addExtended(session, arguments.session.extended);
   addBytes(session, "--max-array-bytes", arguments.session.arrayBytes,
-           "The most bytes one array or scratch buffer may take\n(default: 4 GiB)");
+           "The limit for one array or scratch buffer, in bytes\n(default: 4 GiB)");
   addBytes(session, "--max-line-bytes", arguments.session.lineBytes,
-           "The most bytes of a request line (default: 256 MiB)");
+           "The limit for a request line, in bytes\n(default: 256 MiB)");
 }
 
 }  // namespace

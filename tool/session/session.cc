@@ -28,7 +28,7 @@ Request readRequest(const Json& object) {
   request.command = readValue(object["command"]);
   if (object.contains("outputs")) request.outputs = readCount(object["outputs"]);
   const Json arguments = object.value("arguments", Json::array());
-  if (!arguments.is_array()) throw JsonError("\"arguments\" is no list");
+  if (!arguments.is_array()) throw JsonError("\"arguments\" is not a list");
   for (const Json& argument : arguments)
     request.arguments.push_back(readValue(argument));
   return request;
@@ -68,9 +68,8 @@ std::string describeCall(Module& module, std::string_view line, std::string& tag
 
 /// The answer to a line of which no more is known than that it is too long.
 std::string refuseLine(std::size_t limit) {
-  const JsonError error(fmt::format(
-      "the line has more than {} bytes, the most there may be; --max-line-bytes changes that",
-      limit));
+  const JsonError error(
+      fmt::format("the line has more than {} bytes; --max-line-bytes sets another limit", limit));
   std::string answer = R"({"error":)";
   appendError(answer, std::make_exception_ptr(error));
   answer += ',';

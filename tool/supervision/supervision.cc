@@ -163,7 +163,7 @@ std::string describeEnd(const WorkerEnd& end, const Limits& limits) {
     case Kind::kQuit:
       return "the CDF library ended the process" + during;
     case Kind::kKilled:
-      return "the process was killed" + during + ", perhaps for want of " +
+      return "the process was killed" + during + ", perhaps for lack of " +
              (end.signal == SIGXCPU ? "processor time" : "memory");
     case Kind::kTooSlow:
       return fmt::format("nothing was read for {} seconds{}", limits.seconds, during);
@@ -172,7 +172,7 @@ std::string describeEnd(const WorkerEnd& end, const Limits& limits) {
     case Kind::kDone:
       break;
   }
-  return "all of it was done";
+  return "the work is complete";
 }
 
 std::string identifierOf(const WorkerEnd& end) {

@@ -25,7 +25,7 @@ function [v, data] = __ambrix_completeVariable__ (name, v, s, rowMajor)
   classes = __ambrix_datatypes__ ();
   if (! isfield (classes, v.datatype))
     error ("ambrix:unsupportedDatatype",
-           "ambrix_write: variable \"%s\" has datatype \"%s\"; those there are: %s",
+           "ambrix_write: variable \"%s\" has datatype \"%s\"; it must be one of: %s",
            name, v.datatype, strjoin (fieldnames (classes)', ", "));
   endif
   if (! isfield (v, "recordVariance"))
@@ -141,5 +141,5 @@ endfunction
 %!error <neither data> __ambrix_completeVariable__ ("none", struct (), s, false);
 %!error <are 2-by-3, which does not fit dimensions of sizes .4.>
 %! __ambrix_completeVariable__ ("a", struct ("sizes", 4), s, false);
-%!error <"CDF_INT3"; those there are: CDF_INT1,>
+%!error <"CDF_INT3"; it must be one of: CDF_INT1,>
 %! __ambrix_completeVariable__ ("a", struct ("datatype", "cdf_int3"), s, false);

@@ -6,26 +6,26 @@
 ##
 ## @table @code
 ## @item ambrix_info (@var{file})
-## what is in a file
+## the contents of a file
 ## @item @var{data} = ambrix_read (@var{file}, @var{name})
 ## the data of a variable
 ## @item @var{s} = ambrix_read (@var{file})
 ## all data and attributes, in a struct
 ## @item ambrix_write (@var{file}, @var{s})
-## a new file of a struct
+## a new file from a struct
 ## @item ambrix_plot (@var{file}, @var{name})
-## a plot of a variable, with axes as its attributes tell
+## a plot of a variable, with axes by its attributes
 ## @item ambrix_check (@var{file})
-## whether a file is sound, without danger to this Octave
+## whether a file is sound, without risk to this Octave
 ## @end table
 ##
 ## The commands are one function for each operation of the CDF library, such as @code{ambrix_open},
 ## @code{ambrix_getVarData} and @code{ambrix_close}. @code{pkg describe -verbose ambrix} lists all
-## of them by subject; a part of a name and the Tab key complete it, and @code{lookfor} finds words
-## in their descriptions. The tutorial is @file{doc/octave.md} in the folder of the package.
+## of them by subject. The Tab key completes names, and @code{lookfor} finds words in their
+## descriptions. The tutorial is @file{doc/octave.md} in the folder of the package.
 ##
-## A damaged file can make the CDF library crash, which ends Octave. Use @code{ambrix_check} for
-## files that you don't trust before anything else.
+## A damaged file can make the CDF library crash, which ends Octave. First use @code{ambrix_check}
+## for files that you do not trust.
 ##
 ## @example
 ## @group

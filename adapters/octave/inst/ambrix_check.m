@@ -3,16 +3,15 @@
 ## @deftypefnx {} {@var{sound} =} ambrix_check (@var{file})
 ## @deftypefnx {} {[@var{sound}, @var{report}] =} ambrix_check (@var{file})
 ## @deftypefnx {} {@dots{} =} ambrix_check (@var{file}, "timeout", @var{seconds})
-## Tell whether a CDF file is sound, by reading all that is in it.
+## Check whether a CDF file is sound, by reading everything in it.
 ##
-## A damaged file can make the CDF library crash, which ends Octave, or never return. Here another
-## Octave reads the file, so that this one is safe: check a file that you don't trust before you
-## read it. Checking takes as long as reading, and the start of an Octave.
+## A damaged file can make the CDF library crash, which ends Octave, or never return. This function
+## reads the file in another Octave, so that this one is safe. Check a file that you do not trust
+## before you read it. The check takes the time of reading the file and of starting an Octave.
 ##
 ## @var{file} is the path of the file, with or without @code{.cdf}. @var{sound} is true or false,
-## and @var{report} tells what is wrong; without outputs the report is printed. When nothing more
-## was read for @var{seconds}, 60 unless told otherwise, the other Octave is ended, and the file is
-## not sound.
+## and @var{report} describes what is wrong. Without outputs the report is printed. If nothing more
+## was read for @var{seconds} (default 60), the other Octave is ended, and the file is not sound.
 ##
 ## @example
 ## @group

@@ -1,7 +1,7 @@
 ## -*- texinfo -*-
 ## @deftypefn  {} {} ambrix_info (@var{file})
 ## @deftypefnx {} {@var{s} =} ambrix_info (@var{file})
-## Tell everything that a CDF file holds but its data.
+## Return everything in a CDF file except its data.
 ##
 ## @var{file} is the path of a file, with or without @code{.cdf}, or the identifier of an open one.
 ## Without an output the description is printed.
@@ -10,30 +10,28 @@
 ##
 ## @table @code
 ## @item file
-## what the file itself is: @code{name}, @code{path}, @code{version} of the CDF library that wrote
-## it,
-## @code{format}, @code{encoding}, @code{majority}, @code{checksum}, @code{compression} and
+## properties of the file: @code{name}, @code{path}, @code{version} of the CDF library that wrote
+## it, @code{format}, @code{encoding}, @code{majority}, @code{checksum}, @code{compression} and
 ## @code{compressionParameter}
 ## @item attributes
-## the global attributes by name: the value of the only entry, or a cell array of the values of all
+## the global attributes by name: the value of a single entry, or a cell array of the values of all
+## entries
 ## @item variables
 ## the variables by name, each a struct with its @code{name}, @code{number}, @code{datatype},
-## number of
-## @code{elements} (the characters of a text, else 1), @code{sizes} of its dimensions,
+## number of @code{elements} (the characters of a text, else 1), @code{sizes} of its dimensions,
 ## @code{recordVariance} and dimension @code{variances}, number of @code{records} and of those
 ## @code{written}, @code{sparseRecords}, @code{compression} and @code{compressionParameter},
 ## @code{blockingFactor}, @code{padValue} and @code{attributes}, by name
 ## @item attributeList
 ## the attributes of both scopes in the order of the file: the numbers of their entries, or the
-## names of the variables that have one, and the datatypes of these
+## names of the variables with an entry, and the datatypes of the entries
 ## @end table
 ##
-## Sizes are in the order of the file, whatever its majority, as are those of what
-## @code{ambrix_read} returns. Names that Octave has no identifiers for are fields all the same:
-## @code{s.variables.("B field")}; blanks at
-## the end of a name are left out there, and kept in @code{name}. A variable whose datatype the
-## library does not know has @code{supported} false and no pad value; entries of such a datatype are
-## left out, with the warning @code{ambrix:unsupportedDatatype}.
+## Sizes are in the order of the file for both majorities, as in the data of @code{ambrix_read}.
+## Names that are not identifiers in Octave are also fields: @code{s.variables.("B field")}. Field
+## names have no blanks at the end; @code{name} has them. A variable whose datatype the library does
+## not know has @code{supported} false and no pad value. Entries of such a datatype are left out,
+## with the warning @code{ambrix:unsupportedDatatype}.
 ##
 ## @example
 ## @group

@@ -3,36 +3,37 @@
 ## @deftypefnx {} {} ambrix_plot (@var{file}, @var{names})
 ## @deftypefnx {} {} ambrix_plot (@dots{}, "range", [@var{first}, @var{last}])
 ## @deftypefnx {} {@var{h} =} ambrix_plot (@dots{})
-## Plot variables of a CDF file, with axes as their attributes tell.
+## Plot variables of a CDF file, with axes by their attributes.
 ##
 ## @var{file} is the path of a file, with or without @code{.cdf}, or the identifier of an open one.
 ## One variable is plotted in the current axes. Several @var{names} in a cell array make panels one
-## below the other, instead of what is in the figure; those over time share one time axis. With
-## @qcode{"range"} only these records are plotted, counted from 1. @var{h} are the handles of what
-## was plotted.
+## below the other, which replace the contents of the figure. Panels over time share one time axis.
+## With @qcode{"range"} only these records are plotted, counted from 1. @var{h} are the handles of
+## the plotted objects.
 ##
-## A scalar variable, or one of some components, becomes lines over the variable that its attribute
-## DEPEND_0 names, else over the only epochs that there are as many of as records, else over record
-## numbers. The components, if they are not more than ten, have their names at the right: those in
-## the variable that LABL_PTR_1 or DEPEND_1 names.
+## A scalar variable, or a variable with components, is drawn as lines over the variable that its
+## attribute DEPEND_0 names. Without it, the lines are over the epochs of the file if exactly one
+## epoch variable has as many records, else over record numbers. The names of up to ten components
+## are at the right. They come from the variable that LABL_PTR_1 or DEPEND_1 names.
 ##
-## A variable with one dimension whose DEPEND_1 has numbers, and more than four or with a
-## DISPLAY_TYPE of spectrogram, becomes a picture of its values over time and these numbers. A
-## variable with two dimensions becomes a picture of its first record.
+## A variable with one dimension is drawn as a picture of its values over time and the numbers of
+## DEPEND_1, if there are more than four of them or DISPLAY_TYPE is spectrogram. A variable with two
+## dimensions is drawn as a picture of its first record.
 ##
-## Values that equal FILLVAL, or are not from VALIDMIN to VALIDMAX, are left out. Axes are
-## logarithmic where SCALETYP says so, without what is not positive; labels are made of LABLAXIS or
-## the variable's name and of UNITS, where the codes @code{!E}, @code{!U}, @code{!D} and @code{!N}
-## raise and lower, titles of CATDESC or FIELDNAM. Of lines with more than 4000 records the extremes
-## are drawn that axes can show, of pictures with more than 2000 means of neighbours. Texts,
-## variables with more dimensions and those without records are the error @code{ambrix:cannotPlot}.
+## Values that equal FILLVAL, or are not from VALIDMIN to VALIDMAX, are left out. If SCALETYP says
+## so, axes are logarithmic, without values that are not positive. Labels consist of LABLAXIS or the
+## name of the variable, and UNITS; the codes @code{!E}, @code{!U}, @code{!D} and @code{!N} raise
+## and lower characters. Titles are CATDESC or FIELDNAM. Lines with more than 4000 records are
+## reduced to the extremes that axes can show, pictures with more than 2000 records to means of
+## neighbours. Texts, variables with more dimensions and variables without records are the error
+## @code{ambrix:cannotPlot}.
 ##
 ## The x axis of plots over time counts days from the beginning of the first day, or of the first
-## minute where all is within one, because graphics cards cannot tell moments apart in serial day
-## numbers. The day number of its zero is kept with the axes, as
-## @code{getappdata (gca (), "ambrix_start")}. What is added has to have it subtracted, as the
-## limits here; the labels of the axis follow the limits. For the same reason values far from zero
-## that differ little are drawn less a number, which their label tells.
+## minute if all times are within one, because serial day numbers have too many digits for graphics
+## cards. @code{getappdata (gca (), "ambrix_start")} is the day number of its zero. Subtract it from
+## times that you add and from limits that you set. The labels of the axis are adjusted to the
+## limits. For the same reason, values far from zero that differ little are drawn with an offset,
+## which is in the label.
 ##
 ## @example
 ## @group

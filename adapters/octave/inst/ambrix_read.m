@@ -6,8 +6,9 @@
 ## Read variables of a CDF file, whole or in part.
 ##
 ## @var{file} is the path of a file, with or without @code{.cdf}, or the identifier of an open one.
-## With the @var{name} of a variable its data are returned. With a cell array of names, or with
-## @code{@{@}} or without any for all variables, a struct is returned that tells all about the file:
+## With the @var{name} of a variable, its data are returned. With a cell array of names, a struct is
+## returned that describes the file. @code{@{@}} or no name stands for all variables. The fields
+## are:
 ##
 ## @table @code
 ## @item data
@@ -16,47 +17,50 @@
 ## @itemx attributes
 ## @itemx file
 ## @itemx attributeList
-## the description that @code{ambrix_info} gives: @code{s.variables.Flux.attributes.UNITS}
+## the description that @code{ambrix_info} returns: @code{s.variables.Flux.attributes.UNITS}
 ## @item options
 ## how the data were read
 ## @item leftOut
-## a cell array of texts that tell what the file holds and the struct does not
+## a cell array of texts that name what the file has and the struct does not
 ## @end table
 ##
-## @code{ambrix_write} makes the same file of it again.
+## @code{ambrix_write} makes the same file from this struct.
 ##
-## The first dimension of data is that of the records, so that a scalar variable is a column; those
-## of the variable follow in the order of the file, whatever its majority. Where values don't
-## differ from record to record there is no dimension for records. Data have the class that belongs
-## to the datatype, which is int64 for CDF_INT8 and CDF_TIME_TT2000. Texts are in a cell array, without the blanks that fill them up. The two
-## numbers of an EPOCH16, seconds and picoseconds, are along a last dimension.
+## The first dimension of data is that of the records, so that a scalar variable is a column. The
+## dimensions of the variable follow in the order of the file for both majorities. If values do not
+## vary from record to record, there is no dimension for records. Data have the class of the
+## datatype, which is int64 for CDF_INT8 and CDF_TIME_TT2000. Texts are in a cell array, without
+## trailing blanks. The two numbers of an EPOCH16, seconds and picoseconds, are along the last
+## dimension.
 ##
 ## The options are:
 ##
 ## @table @asis
 ## @item @qcode{"records"}, @qcode{"first"} or @qcode{"last"}
-## With @qcode{"last"} the dimension of the records comes last, and that of the characters or of the
-## two numbers of an EPOCH16 first. It takes the least time and memory.
+## With @qcode{"last"} the dimension of the records is the last, and that of the characters or of
+## the two numbers of an EPOCH16 is the first. This takes the least time and memory.
 ## @item @qcode{"range"}, [@var{first}, @var{last}] or [@var{first}, @var{last}, @var{step}]
-## Read these records only, counted from 1.
+## Read only these records, counted from 1.
 ## @item @qcode{"slab"}, @{@var{range}, @dots{}@}
-## Read these elements only: a range for each dimension of the variable, empty for all of it.
+## Read only these elements: a range for each dimension of the variable, empty for all elements.
 ## @item @qcode{"time"}
-## Turn epochs and CDF_TIME_TT2000 times into Octave's serial day numbers, as @code{datestr} takes
-## them, and their fill value into NaN.
+## Convert epochs and CDF_TIME_TT2000 times to Octave's serial day numbers, which @code{datestr}
+## accepts, and their fill value to NaN.
 ## @item @qcode{"fill"}
-## Turn the values of floating point variables that equal their attribute FILLVAL into NaN.
+## Convert values of floating point variables that equal their attribute FILLVAL to NaN.
 ## @item @qcode{"text"}, @qcode{"cell"} or @qcode{"char"}
-## With @qcode{"char"} texts are arrays of characters, all of them, along a last dimension.
+## With @qcode{"char"} texts are arrays with all their characters along the last dimension.
 ## @end table
 ##
-## Day numbers of our time cannot tell times within 10 microseconds apart. Values of CDF_TIME_TT2000
-## are nanoseconds: read them as they are where these matter, and use @code{ambrix_tt2000Breakdown}.
-## Times in a leap second have the day numbers of the second after it: 23:59:60.5 has that of
-## 00:00:00.5 of the next day. The pad value of the library is the day number 1.
+## Day numbers of our time have a resolution of 10 microseconds. Values of CDF_TIME_TT2000 are
+## nanoseconds: to keep these, read the values without @qcode{"time"} and use
+## @code{ambrix_tt2000Breakdown}. Times in a leap second have the day numbers of the next second:
+## 23:59:60.5 has that of 00:00:00.5 of the next day. The pad value of the library is the day number
+## 1.
 ##
-## Variables and entries of attributes whose datatype the library does not know are left out, with
-## the warning @code{ambrix:unsupportedDatatype}. A wrong option is the error @code{ambrix:invalidOption}; other
+## Variables and attribute entries whose datatype the library does not know are left out, with the
+## warning @code{ambrix:unsupportedDatatype}. A wrong option is the error
+## @code{ambrix:invalidOption}. Other
 ## errors are those of the commands.
 ##
 ## @example

@@ -3,32 +3,33 @@
 ## @deftypefnx {} {} ambrix_write (@var{file}, @var{s}, @var{option}, @dots{})
 ## Write a struct of arrays to a new CDF file.
 ##
-## @var{file} is the path of the file; @code{.cdf} is added where it is missing. The new file
-## appears whole or not at all. The options are:
+## @var{file} is the path of the file; @code{.cdf} is added if it is missing. The new file appears
+## complete or not at all. The options are:
 ##
 ## @table @asis
 ## @item @qcode{"overwrite"}
-## Replace a file that exists; else it is the error @code{ambrix:fileExists}.
+## Replace an existing file. Without this option it is the error @code{ambrix:fileExists}.
 ## @item @qcode{"incomplete"}
-## Replace even the file that @var{s} was read from without all that it holds, which is then lost;
-## else that is the error @code{ambrix:incomplete}. @code{s.leftOut} lists what is missing.
+## Replace the file that @var{s} was read from even if @var{s} lacks parts of it, which are then
+## lost. Without this option it is the error @code{ambrix:incomplete}. @code{s.leftOut} lists these
+## parts.
 ## @end table
 ##
-## @var{s} is a struct that @code{ambrix_read} has returned, or a struct of arrays, one for each
-## variable. The first dimension of an array is that of the records, and a text is a row of
-## characters or a cell of a cell array. What else there is to say has the place in @var{s} where
-## @code{ambrix_read} puts it; everything but the data can be left out:
+## @var{s} is a struct from @code{ambrix_read}, or a struct of arrays, one for each variable. The
+## first dimension of an array is that of the records, and a text is a row of characters or a cell
+## of a cell array. All other properties have the same fields as in the struct of
+## @code{ambrix_read}. Only the data are necessary:
 ##
 ## @table @code
 ## @item s.data.(@var{name})
 ## the data of a variable
 ## @item s.variables.(@var{name}).datatype
-## its datatype, such as @qcode{"CDF_EPOCH"}; the first in the table below that belongs to the class
-## of the data where it is not given
+## its datatype, such as @qcode{"CDF_EPOCH"}; the default is in the table below, by the class of the
+## data
 ## @item s.variables.(@var{name}).attributes.(@var{attribute})
 ## an attribute of the variable
 ## @item s.variables.(@var{name}).recordVariance
-## false for data that don't differ from record to record, and have no dimension for records
+## false for data that do not vary from record to record and have no dimension for records
 ## @item s.variables.(@var{name}).compression
 ## such as @qcode{"GZIP_COMPRESSION"}, with a level in @code{compressionParameter}
 ## @item s.attributes.(@var{name})
@@ -37,19 +38,19 @@
 ## and @code{format}, @code{checksum}, @code{compression} and @code{compressionParameter} of the
 ## file; without them it is column-major, a single file, not compressed
 ## @item s.options
-## how the data are given, as the options of @code{ambrix_read}: @code{records}, @qcode{"first"} or
+## the form of the data, as in the options of @code{ambrix_read}: @code{records}, @qcode{"first"} or
 ## @qcode{"last"}; @code{time}, whether times are serial day numbers; @code{fill}, whether NaN
 ## stands for the attribute FILLVAL
 ## @end table
 ##
-## Also @code{sizes}, @code{elements}, @code{variances}, @code{sparseRecords}, @code{padValue} and
-## @code{blockingFactor} of a variable are those that @code{ambrix_info} describes. Any other field
-## is the error @code{ambrix:invalidData}.
+## The fields @code{sizes}, @code{elements}, @code{variances}, @code{sparseRecords}, @code{padValue}
+## and @code{blockingFactor} of a variable are those of @code{ambrix_info}. Any other field is the
+## error @code{ambrix:invalidData}.
 ##
-## Where @code{s.options.time} is missing, values of a CDF_EPOCH or CDF_EPOCH16 variable that are
-## serial day numbers of the years 0 to 9999 are taken for such; as epochs all of them would be in
-## the first hours of the year 0. Numbers that are not what @code{s.options.time} says are the error
-## @code{ambrix:invalidTime}. Day numbers are written to the millisecond.
+## Without @code{s.options.time}, values of a CDF_EPOCH or CDF_EPOCH16 variable are serial day
+## numbers if all are in the range of the years 0 to 9999. As epochs such numbers would be in the
+## first hours of the year 0. Numbers that do not agree with @code{s.options.time} are the error
+## @code{ambrix:invalidTime}. Day numbers are written with a precision of a millisecond.
 ##
 ## Values of a CDF_TIME_TT2000 variable are of class int64, as @code{ambrix_computeTT2000} makes
 ## them. Doubles are always taken for serial day numbers, of the years 1707 to 2292, and written to
@@ -59,8 +60,9 @@
 ## CDF_INT4, int64 CDF_INT8, uint8 and logical CDF_UINT1, uint16 CDF_UINT2, uint32 CDF_UINT4, text
 ## CDF_CHAR.
 ##
-## What @code{ambrix_read} has read is written back the same, but for the encoding, which becomes
-## that of the computer, for rVariables, which become zVariables, and for what it had to leave out.
+## A struct from @code{ambrix_read} is written back the same, with three exceptions: the encoding
+## becomes that of the computer, rVariables become zVariables, and parts that were left out are
+## missing.
 ##
 ## @example
 ## @group
@@ -95,7 +97,7 @@ function ambrix_write (file, s, varargin)
   try
     __ambrix__ ("close", id);
   catch err
-    what = sprintf ("\"%s.cdf\" can't be finished, perhaps for want of room on the disk", target);
+    what = sprintf ("\"%s.cdf\" can't be finished, perhaps for lack of disk space", target);
     __ambrix_raiseFor__ ("ambrix_write", what, err);
   end_try_catch
   __ambrix_moveFile__ (temporary, target, options.overwrite);
