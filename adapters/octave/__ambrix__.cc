@@ -3,6 +3,7 @@
 
 #include <algorithm>
 #include <new>
+#include <string_view>
 #include <vector>
 
 #include "adapters/common/call_frame.h"
@@ -28,10 +29,16 @@ octave_value_list takeResults(const Slots& slots, int nargout) {
 
 // What else the functions of the package ask for has names that no command has.
 
+/// Whether a text is exactly this name. The module decides about a text of any other shape: Octave
+/// converts only single rows without a warning.
+bool isName(const octave_value& text, std::string_view name) {
+  return text.is_string() && text.ndims() == 2 && text.rows() == 1 &&
+         text.columns() == static_cast<octave_idx_type>(name.size()) && text.string_value() == name;
+}
+
 /// Whether a function gives up a file of its own.
 bool givesUpFile(const octave_value_list& args) {
-  return args.length() == 2 && args(0).is_string() && args(0).string_value() == "-abandon" &&
-         args(1).is_uint64_type();
+  return args.length() == 2 && isName(args(0), "-abandon") && args(1).is_uint64_type();
 }
 
 octave_value_list callModule(const octave_value_list& args, int nargout, bool extended) {
@@ -51,7 +58,7 @@ octave_value_list callModule(const octave_value_list& args, int nargout, bool ex
 bool allExtended = false;
 
 bool concernsExtension(const octave_value_list& args) {
-  return args(0).is_string() && args(0).string_value() == "-extended";
+  return isName(args(0), "-extended");
 }
 
 /// ("-extended") tells whether every call may use the extended datatypes, ("-extended", logical)

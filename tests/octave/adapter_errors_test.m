@@ -19,6 +19,21 @@ function testTheTextsOfTheLibraryAreTold (id, folder)
   assert (! isspace (err.message(end)));
 endfunction
 
+## The characters of a name count in linear order, whatever its shape.
+function testNamesOfAnyShapeReachTheModuleWithoutAWarning (id, folder)
+  lastwarn ("");
+  err = raised (@() __ambrix__ (["op"; "en"]));
+  assert (err.identifier, "TOLVEX:ambrix:cdflib:invalidOperation");
+  assert (! isempty (strfind (err.message, "\"oepn\"")));
+  err = raised (@() __ambrix__ (["op"; "en"], id));
+  assert (err.identifier, "TOLVEX:ambrix:cdflib:invalidOperation");
+  err = raised (@() __ambrix__ (["-extended"; "xxxxxxxxx"]));
+  assert (err.identifier, "TOLVEX:ambrix:cdflib:invalidOperation");
+  err = raised (@() __ambrix__ (reshape ("open", [1, 1, 4])));
+  assert (err.identifier, "TOLVEX:ambrix:validate:wrongNumberOfInputs");
+  assert (lastwarn (), "");
+endfunction
+
 function testTextsWithPercentSignsStayAsTheyAre (id, folder)
   err = raised (@() __ambrix__ ("100%s%d%n"));
   assert (! isempty (strfind (err.message, "\"100%s%d%n\"")));
@@ -106,6 +121,7 @@ function testAFailureLeavesTheModuleUsable (id, folder)
 endfunction
 
 runTests ({@testErrorsHaveIdentifierTextAndStack, @testTheTextsOfTheLibraryAreTold, ...
+           @testNamesOfAnyShapeReachTheModuleWithoutAWarning, ...
            @testTextsWithPercentSignsStayAsTheyAre, @testClassesAreToldByTheirOctaveNames, ...
            @testWhatHasNoNumbersIsRefusedWhereNumbersAreNeeded, ...
            @testForeignExceptionsBecomeErrors, @testSizesThatCannotBeAreRefused, ...
