@@ -94,6 +94,8 @@ void getVarCompression(int, qvArray* outputs[], std::int32_t, const qvArray* arg
                        makeDoubleScalar(found.percentage)});
 }
 
+// A gzip level outside 1 to 9 has an error of its own here. Without the check the library would
+// refuse it (BAD_COMPRESSION_PARM), as it does for a variable.
 void setCompression(int, qvArray*[], std::int32_t argumentCount, const qvArray* arguments[],
                     const CommandEntry*) {
   const CdfId file = getCdfIdArg(arguments[0]);
@@ -112,8 +114,7 @@ void setCompression(int, qvArray*[], std::int32_t argumentCount, const qvArray* 
   callOnFile("CDFsetCompression", file, PUT_, CDF_COMPRESSION_, type, parameters);
 }
 
-// The library refuses a gzip level outside 1 to 9 (BAD_COMPRESSION_PARM). It would do so for
-// "setCompression", too, which checks first and so has an error of its own.
+// The gzip level is left to the library, which refuses one outside 1 to 9 (BAD_COMPRESSION_PARM).
 void setVarCompression(int, qvArray*[], std::int32_t argumentCount, const qvArray* arguments[],
                        const CommandEntry*) {
   const CdfId file = getCdfIdArg(arguments[0]);

@@ -109,9 +109,9 @@ class AMBRIX_EXPORT Array : public ArrayView {
 
   /// Gives up the elements, which stay where they are, with the duty to free them; the handle is
   /// empty then. Null when there are none. Few elements lie in one block of memory with the array's
-  /// sizes: freeing the elements frees all of it, as late for few as for many. Until then
-  /// `liveCounts` counts the array. Throws std::logic_error for a cell array and for elements that
-  /// are borrowed, and leaves the array as it is.
+  /// sizes: freeing the elements frees all of it. Until then `liveCounts` counts the array. Throws
+  /// std::logic_error for a cell array and for elements that are borrowed, and leaves the array as
+  /// it is.
   [[nodiscard]] OwnedElements releaseElements();
 
   /// Takes over an array that the module's interface has made, from the call that made it as well.

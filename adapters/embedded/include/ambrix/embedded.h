@@ -1,5 +1,4 @@
-// A host inside a C++ program: everything there is to include but what goes by files
-// (ambrix/file.h).
+// A host inside a C++ program: all headers except those for files (ambrix/file.h).
 //
 // clang-format off
 //   ambrix::Module module;

@@ -63,12 +63,10 @@ constexpr decltype(auto) visitClass(ClassId classId, Function&& function) {
 /// it is called with the ArrayView itself, which gives the elements. Returns what the function
 /// does, in the same type for each class. Throws std::logic_error when there is no array.
 ///
-/// clang-format off
 ///   visit(array, Overloaded{
 ///       [](ArrayView cells) { std::cout << cells.elementCount() << " arrays"; },
 ///       [](std::span<const char16_t> text) { std::cout << text.size() << " characters"; },
 ///       [](auto values) { std::cout << values.size() << " numbers or logicals"; }});
-/// clang-format on
 template <typename Function>
 decltype(auto) visit(ArrayView array, Function&& function) {
   if (!array) throw std::logic_error("there is no array");

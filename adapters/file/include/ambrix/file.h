@@ -35,10 +35,10 @@ class EntryFinder;
 
 /// An open file. The module must stay where it is, and loaded, until its files are closed. Members
 /// throw what the module raises, `Error`, and `FileError`. Numbers of variables and attributes
-/// change when one before them is deleted: what was found earlier is to be found anew then.
+/// change when one before them is deleted: look them up again then.
 ///
 /// A file has values of all datatypes, the extended ones included (CDF_INT8, CDF_TIME_TT2000),
-/// whatever `Module::setExtended` has said. That is for calls of commands, by `call` as well.
+/// whatever `Module::setExtended` has set. That setting holds for commands, also those by `call`.
 class AMBRIX_EXPORT File {
  public:
   /// Opens a file for reading, unless the options say otherwise. Open a file once at a time.
@@ -110,7 +110,7 @@ class AMBRIX_EXPORT File {
   /// values.
   Array read(const Variable& variable);
   Array read(const Variable& variable, const Slab& slab);
-  /// The same into memory of the caller's, as it is needed: the module's own takes a few megabytes.
+  /// The same into memory of the caller's, in pieces. A few MB of temporary memory are used.
   void readInto(const Variable& variable, const Slab& slab, std::span<std::byte> memory);
   /// Writes values into records from the first on, or behind the last, or into a slab. Only the
   /// number of values counts; their order is that in which they are read.

@@ -15,15 +15,16 @@ namespace ambrix {
 /// | ambrix:noSuchVariable | there is no variable of that name |
 /// | ambrix:noSuchAttribute | there is no attribute of that name |
 /// | ambrix:unsupportedDatatype | the values are of a datatype that is not known |
-/// | ambrix:wrongScope | an attribute that is to be set belongs to the file, not to variables, or
-///   the other way round |
+/// | ambrix:wrongScope | a global attribute is to be set for a variable, or the reverse |
 /// | ambrix:partOfRecord | what is to be written is no number of whole records |
 /// | ambrix:wrongSize | the memory for values is of another size than these |
 /// | ambrix:openedForReading | a file that was opened for reading is to be changed |
 /// | ambrix:fileClosed | the file was closed, deleted or moved from |
 /// | ambrix:badFileName | the name of the file is no valid UTF-8 |
-/// | ambrix:noScratchCopy | entries with numbers far apart are looked for in a copy of the file,
-///   and there can be none, or the file was opened for writing |
+/// | ambrix:noScratchCopy | entries cannot be found without a copy of the file |
+///
+/// Entries with numbers far apart are looked for in a copy of the file. There is none if it cannot
+/// be written, and if the file was opened for writing.
 class AMBRIX_EXPORT FileError : public std::runtime_error {
  public:
   FileError(const std::string& file, const char* identifier, const std::string& reason);
