@@ -81,6 +81,7 @@ namespace {
 /// Those of the table and of the host's extension, in byte-wise order; each ends with a zero.
 std::vector<std::string_view> namesOfConstants() {
   std::vector<std::string_view> names;
+  names.reserve(ConstantNameTable.size() + extension().constants.size());
   for (const auto& [name, value] : ConstantNameTable)
     names.emplace_back(name);
   for (const NamedConstant& added : extension().constants)

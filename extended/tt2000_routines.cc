@@ -11,6 +11,7 @@
 #undef breakdownTT2000
 #undef CDF_TT2000_to_UTC_parts
 
+// NOLINTBEGIN(readability-redundant-declaration)
 extern "C" {
 [[gnu::weak]] long long computeTT2000(double year, double month, double day, ...);
 [[gnu::weak]] long long CDF_TT2000_from_UTC_parts(double year, double month, double day, ...);
@@ -18,6 +19,7 @@ extern "C" {
 [[gnu::weak]] void CDF_TT2000_to_UTC_parts(long long time, double* year, double* month, double* day,
                                            ...);
 }
+// NOLINTEND(readability-redundant-declaration)
 
 namespace TOLVEX::ambrix {
 namespace {
