@@ -9,7 +9,8 @@
 namespace TOLVEX::ambrix {
 
 /// "computeTT2000" (9-by-n double: year, month, day, hour, minute, second, millisecond,
-/// microsecond, nanosecond): 1-by-n int64. Raises `badEpochVector` (9), `illegalEpochValue`.
+/// microsecond, nanosecond): 1-by-n int64. Raises `badEpochVector` (9), `argumentOutOfBounds`,
+/// `illegalEpochValue`.
 void computeTt2000(int, qvArray* outputs[], std::int32_t, const qvArray* arguments[],
                    const CommandEntry*);
 
