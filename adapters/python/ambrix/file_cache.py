@@ -17,8 +17,8 @@ def set_cache_size(files: int) -> None:
     A file that has read compressed values keeps up to 4 MB of memory in the CDF library.
     """
     global _SEVERAL
-    _SEVERAL = files
     with _lock:
+        _SEVERAL = files
         _shrink()
 
 
@@ -60,7 +60,9 @@ class Source:
             raise OSError(f"{self.path} has changed since it was opened")
         key = (self.path, *self._stamp)
         with _lock:
-            found = _open.pop(key, None) or File(self.path)
+            found = _open.pop(key, None)
+            if found is None:  # not merely without variables, and so empty
+                found = File(self.path)
             _open[key] = found
             _shrink()
         return found

@@ -29,12 +29,22 @@ Slab slabOf(const Block& block) {
 }  // namespace
 
 OpenFile::OpenFile(const std::string& path) : process_(getpid()) {
-  withExtendedModule(
-      [&](Module& module) { file_ = std::make_unique<File>(File::open(module, path)); });
+  try {
+    withExtendedModule(
+        [&](Module& module) { file_ = std::make_unique<File>(File::open(module, path)); });
+  } catch (...) {
+    closeSilently();  // when a warning has become an exception, the file is open
+    throw;
+  }
 }
 
 OpenFile::~OpenFile() {
-  if (process_ != getpid()) return;
+  closeSilently();
+}
+
+/// In the module's turn, which the file itself would not wait for.
+void OpenFile::closeSilently() noexcept {
+  if (process_ != getpid() || file_ == nullptr || !file_->isOpen()) return;
   try {
     close();
   } catch (...) {
@@ -43,7 +53,6 @@ OpenFile::~OpenFile() {
 }
 
 void OpenFile::close() {
-  if (!file_->isOpen()) return;
   withExtendedModule([&](Module&) { file_->close(); });
 }
 

@@ -42,6 +42,8 @@ class OpenFile {
   std::size_t blockingFactor(std::size_t variable);
 
  private:
+  void closeSilently() noexcept;
+
   std::unique_ptr<File> file_;
   int process_;
 };

@@ -188,6 +188,13 @@ def test_no_more_files_stay_open_than_allowed(folder):
     assert len(os.listdir("/proc/self/fd")) == before
 
 
+def test_a_file_without_variables_stays_open_as_well(folder):
+    commands.close(commands.create("none"))
+    source = file_cache.Source("none.cdf")
+    assert source.file() is source.file()
+    source.close()
+
+
 def test_real_files_are_datasets(sample):
     if not CdfBackend().guess_can_open(sample):
         pytest.skip("no CDF file")
