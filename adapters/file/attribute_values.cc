@@ -1,9 +1,21 @@
 // Attributes by name.
+#include <exception>
+
 #include "adapters/file/entry_reader.h"
-#include "adapters/file/numbers.h"
 #include "ambrix/file.h"
 
 namespace ambrix {
+namespace {
+
+bool isMissingEntry(const std::exception_ptr& failure) {
+  try {
+    std::rethrow_exception(failure);
+  } catch (const Error& error) {
+    return isLibraryFailure(error, "NO_SUCH_ENTRY");
+  }
+}
+
+}  // namespace
 
 std::optional<Array> File::attributeValue(const Variable& variable, std::string_view name) {
   const auto number = findAttribute(name);
@@ -11,9 +23,10 @@ std::optional<Array> File::attributeValue(const Variable& variable, std::string_
   const Attribute found = attribute(*number);
   if (found.global) return std::nullopt;
   std::exception_ptr failure;
-  const auto entry = EntryReader(*this, found, options_.observer).find(variable.number, failure);
-  if (!entry) return std::nullopt;
-  return value(found, entry->number);
+  EntryReader reader(*this, found, options_.observer);
+  if (reader.find(variable.number, failure)) return reader.value(variable.number);
+  if (!isMissingEntry(failure)) reader.rethrow(failure);
+  return std::nullopt;
 }
 
 /// The attribute of that name, made where there is none.

@@ -1,4 +1,5 @@
 // Attributes and their entries.
+#include <algorithm>
 #include <exception>
 #include <utility>
 
@@ -31,13 +32,16 @@ Attribute File::attribute(std::size_t number) {
   attribute.name = bytesOf(facts.at(0));
   attribute.global = bytesOf(facts.at(1)) == "GLOBAL_SCOPE";
   const Array& maxEntry = facts.at(attribute.global ? 2 : 3);
-  attribute.maxEntry = static_cast<std::int64_t>(maxEntry.data<double>().front());
+  // A damaged file may have any negative number where -1 means that there is none.
+  attribute.maxEntry =
+      std::max<std::int64_t>(static_cast<std::int64_t>(maxEntry.data<double>().front()), -1);
   announce(Step::Kind::kAttribute, number, attribute.name);
   return attribute;
 }
 
 std::optional<std::size_t> File::findAttribute(std::string_view name) {
-  return find("getAttrNum", name);
+  constexpr std::string_view kMissing[] = {"NO_SUCH_ATTR", "BAD_ATTR_NAME"};
+  return find("getAttrNum", name, kMissing);
 }
 
 Attribute File::attribute(std::string_view name) {

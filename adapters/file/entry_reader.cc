@@ -11,7 +11,8 @@ namespace {
 
 Entry found(std::size_t number, const std::vector<Array>& facts) {
   const auto datatype = datatypeNamed(bytesOf(facts.at(0)));
-  return {number, datatype.value_or(Datatype{}), true, sizeOf(facts.at(1).data<double>().front())};
+  const std::size_t elements = sizeOf(facts.at(1).data<double>().front());
+  return {number, datatype.value_or(Datatype{}), datatype.has_value(), elements};
 }
 
 }  // namespace

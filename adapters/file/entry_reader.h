@@ -1,7 +1,6 @@
 // Entries of one attribute.
 #pragma once
 
-#include <array>
 #include <cstddef>
 #include <exception>
 #include <optional>

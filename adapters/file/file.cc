@@ -88,10 +88,10 @@ File& File::operator=(File&& other) noexcept {
 }
 
 File::~File() {
-  if (process_ != ::getpid()) return;
+  options_.observer = nullptr;
   try {
     close();
-  } catch (const std::exception&) {
+  } catch (...) {
     // Another failure is on its way, or nobody wants to know.
   }
 }
@@ -99,6 +99,7 @@ File::~File() {
 void File::close() {
   if (!id_) return;
   const Array id = std::exchange(id_, Array());
+  if (process_ != ::getpid()) return;
   try {
     module_->call("close", {id});
   } catch (const Error& error) {

@@ -1,8 +1,6 @@
 #include "ambrix/times.h"
 
 #include <algorithm>
-#include <cmath>
-#include <stdexcept>
 
 #include "adapters/file/calendar_text.h"
 #include "adapters/file/extended_calls.h"

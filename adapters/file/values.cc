@@ -1,7 +1,5 @@
 // Reading and writing values.
-#include <algorithm>
 #include <cstring>
-#include <numeric>
 #include <utility>
 
 #include "adapters/file/extended_calls.h"
@@ -49,7 +47,7 @@ Slab within(const Slab& slab, Slab part) {
 }  // namespace
 
 void File::requireSupported(const Variable& variable) const {
-  if (variable.supported) return;
+  if (variable.supported && findDatatype(variable.datatype) != nullptr) return;
   throw FileError(path_, "unsupportedDatatype",
                   "variable \"" + variable.name + "\" has the datatype " +
                       datatypeName(variable.datatype) + ", which is not supported");
@@ -89,6 +87,8 @@ FileError File::wrongSize() const {
 }
 
 void File::write(const Variable& variable, ArrayView values, std::size_t firstRecord) {
+  requireOpen();
+  requireWritable();
   requireSupported(variable);
   const std::size_t elements = variable.recordElements();
   const std::size_t records = elements == 0 ? 0 : values.elementCount() / elements;
@@ -105,6 +105,7 @@ void File::append(const Variable& variable, ArrayView values) {
 }
 
 void File::write(const Variable& variable, const Slab& slab, ArrayView values) {
+  requireSupported(variable);
   const std::vector<Array> arguments = slabArguments(variable, slab);
   std::vector<ArrayView> views(arguments.begin(), arguments.end());
   views.push_back(values);
@@ -112,6 +113,8 @@ void File::write(const Variable& variable, const Slab& slab, ArrayView values) {
 }
 
 void File::deleteRecords(const Variable& variable, std::size_t first, std::size_t records) {
+  requireOpen();
+  requireWritable();
   if (records == 0) return;
   const auto last = static_cast<double>(first + records - 1);
   change("deleteVarRecords", {numberOf(variable), static_cast<double>(first), last});

@@ -12,19 +12,17 @@
 namespace ambrix {
 namespace {
 
-/// A name that is new to the table is of a later library; it has no code here.
-Datatype datatypeOf(const Array& name) {
-  return datatypeNamed(bytesOf(name)).value_or(Datatype{});
-}
-
+/// A name of a datatype that is new to the table is of a later library; it has no code here.
 Variable definitionOf(std::size_t number, const std::vector<Array>& facts) {
   Variable variable;
   variable.number = number;
   variable.name = bytesOf(facts.at(0));
-  variable.datatype = datatypeOf(facts.at(1));
+  const auto datatype = datatypeNamed(bytesOf(facts.at(1)));
+  variable.datatype = datatype.value_or(Datatype{});
+  variable.supported = datatype.has_value();
   variable.elements = sizeOf(facts.at(2).data<double>().front());
   for (const double size : facts.at(3).data<double>())
-    variable.sizes.push_back(static_cast<std::size_t>(size));
+    variable.sizes.push_back(sizeOf(size));
   variable.recordVaries = facts.at(4).data<bool>().front();
   for (const bool varies : facts.at(5).data<bool>())
     variable.varies.push_back(varies);
@@ -43,6 +41,12 @@ bool isLibraryFailure(const Error& error) {
   return error.identifier() == "TOLVEX:ambrix:cdflib:libraryFailure";
 }
 
+bool isLibraryFailure(const Error& error, std::string_view status) {
+  if (!isLibraryFailure(error)) return false;
+  const auto* const text = std::get_if<std::string>(&error.values().at(1));
+  return text != nullptr && text->starts_with(std::string(status) + ':');
+}
+
 std::optional<Datatype> unsupportedDatatype(const Error& error) {
   if (error.identifier() != "TOLVEX:ambrix:cdflib:unrecognizedValue") return std::nullopt;
   if (error.values().at(1) != MessageArg(std::string("DATATYPE"))) return std::nullopt;
@@ -58,7 +62,8 @@ std::size_t File::variableCount() try {
   try {
     for (;; ++count)
       attempt("getVarName", static_cast<double>(count));
-  } catch (const Error&) {
+  } catch (const Error& end) {
+    if (!isLibraryFailure(end, "NO_SUCH_VAR")) fail(end);
     return count;
   }
 }
@@ -78,17 +83,22 @@ Variable File::variable(std::size_t number) try {
   return variable;
 }
 
-std::optional<std::size_t> File::find(std::string_view command, std::string_view name) try {
+std::optional<std::size_t> File::find(std::string_view command, std::string_view name,
+                                      std::span<const std::string_view> missing) try {
   const Array text = Array::fromNarrow(name);
   const ArrayView arguments[] = {text};
   return sizeOf(attempt(command, arguments).at(0).data<double>().front());
 } catch (const Error& error) {
-  if (!isLibraryFailure(error)) fail(error);
+  const auto isStatus = [&](std::string_view status) { return isLibraryFailure(error, status); };
+  if (std::ranges::none_of(missing, isStatus)) fail(error);
   return std::nullopt;
 }
 
 std::optional<std::size_t> File::findVariable(std::string_view name) {
-  return find("getVarNum", name);
+  // Of a file that was opened, not created, the library takes zVariables only: "illegal" stands for
+  // "no such variable" there.
+  constexpr std::string_view kMissing[] = {"NO_SUCH_VAR", "ILLEGAL_IN_zMODE", "BAD_VAR_NAME"};
+  return find("getVarNum", name, kMissing);
 }
 
 Variable File::variable(std::string_view name) {

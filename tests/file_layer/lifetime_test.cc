@@ -2,10 +2,7 @@
 #include <sys/wait.h>
 #include <unistd.h>
 
-#include <fstream>
-
 #include "tests/file_layer/file_layer_test.h"
-#include "tests/module/support/file_bytes.h"
 
 namespace ambrix_test {
 namespace {
@@ -73,6 +70,8 @@ TEST_F(FileLifetimeTest, RefusesChangesOfAFileOpenedForReading) {
       "to change it";
   EXPECT_EQ(errorOf([&] { file.append(variable_, rowOf<std::int32_t>({3, 4})); }), refusal);
   EXPECT_EQ(errorOf([&] { file.setAttribute("Title", "y"); }), refusal);
+  EXPECT_EQ(errorOf([&] { file.write(variable_, rowOf<std::int32_t>({})); }), refusal);
+  EXPECT_EQ(errorOf([&] { file.deleteRecords(variable_, 0, 0); }), refusal);
   EXPECT_EQ(errorOf([&] { file.remove(); }), refusal);
   EXPECT_EQ(file.text("getReadOnlyMode"), "READONLYon");
   file.close();
@@ -94,21 +93,10 @@ TEST_F(FileLifetimeTest, RefusesValuesThatDoNotFit) {
   EXPECT_EQ(errorOf([&] { file.readInto(variable_, slab, memory); }), refusal);
 }
 
-/// Gives the variable of that name another datatype in the file.
-void changeDatatype(const std::string& path, const std::string& variable, char code) {
-  constexpr std::size_t kFromDatatypeToName = 64;
-  const std::string bytes = fileBytes(path);
-  const std::size_t place = bytes.find(variable + '\0') - kFromDatatypeToName + 3;
-  std::fstream file(path, std::ios::in | std::ios::out | std::ios::binary);
-  file.seekp(static_cast<std::streamoff>(place));
-  file.put(code);
-}
-
 TEST_F(FileLifetimeTest, TellsOfDatatypesThatAreNotKnown) {
-  changeDatatype("new.cdf", "Flux", 99);
+  changeBeforeName("new.cdf", "Flux", kDatatypeToName, std::string("\0\0\0\x63", 4));
   EXPECT_EQ(errorOf([&] { open(); }), "TOLVEX:ambrix:cdflib:fileOpenError()");
-  const double off = ::ambrix::constantValue(module, "VALIDATEFILEOFF");
-  module.call("setValidate", {Array::scalar(off)});
+  setValidationOff();
   File file = open();
   const auto description = file.describe();
   const Variable& found = description.variables.at(0).definition;
@@ -119,6 +107,12 @@ TEST_F(FileLifetimeTest, TellsOfDatatypesThatAreNotKnown) {
   EXPECT_EQ(errorOf([&] { file.read(found); }),
             "ambrix:unsupportedDatatype: new: variable \"Flux\" has the datatype datatype 99, "
             "which is not supported");
+  file = open("new", Access::kWrite);
+  EXPECT_THAT(errorOf([&] { file.write(found, Slab(), rowOf<double>({1})); }),
+              testing::StartsWith("ambrix:unsupportedDatatype"));
+  const Variable unknown = {.name = "Flux", .datatype = Datatype{99}};
+  EXPECT_THAT(errorOf([&] { file.read(unknown, Slab()); }),
+              testing::StartsWith("ambrix:unsupportedDatatype"));
 }
 
 TEST_F(FileLifetimeTest, HasExtendedDatatypesWhereCommandsAreStrict) {
@@ -188,7 +182,10 @@ TEST_F(FileLifetimeTest, LeavesAFileToTheProcessThatOpenedIt) {
   const Variable variable = file.createVariable({.name = "v", .datatype = Datatype::kInt4});
   const pid_t child = ::fork();
   if (child == 0) {
-    { const File mine = std::move(file); }
+    {
+      File mine = std::move(file);
+      mine.close();
+    }
     ::_exit(std::filesystem::file_size("other.cdf") == 0 ? 0 : 1);
   }
   int status = -1;
@@ -234,6 +231,39 @@ TEST_F(FileLifetimeTest, LetsItsObserverReplaceErrors) {
   EXPECT_FALSE(file.attributeValue(variable_, "UNITS"));
   EXPECT_THROW(File::create(module, "new", {.observer = &notes}), std::runtime_error);
   EXPECT_THAT(file.variables().size(), 1);
+}
+
+TEST_F(FileLifetimeTest, ClosesSilentlyWhateverItsObserverThrows) {
+  class Thrower : public ::ambrix::FileObserver {
+    void failed(const ::ambrix::Error& /*error*/) override { throw 1; }
+  } thrower;
+  {
+    const File file = File::open(module, "new", {.observer = &thrower});
+    module.call("close", {file.id()});
+  }
+  EXPECT_EQ(open().variableCount(), 1);
+}
+
+/// The place of the next variable becomes one behind the end of the file.
+TEST_F(FileLifetimeTest, TellsADamagedFileFromOneWithoutTheName) {
+  File file = open("new", Access::kWrite);
+  file.createVariable({.name = "Next", .datatype = Datatype::kInt4});
+  file.close();
+  changeBeforeName("new.cdf", "Flux", kNextToName, kFarPlace);
+  setValidationOff();
+  file = open("new", Access::kWrite);
+  EXPECT_THAT(errorOf([&] { file.variable("Next"); }), testing::HasSubstr("libraryFailure"));
+}
+
+TEST_F(FileLifetimeTest, FindsNoNamesThatThereCannotBe) {
+  File opened = open();
+  File created = create("other");
+  for (File* const file : {&opened, &created}) {
+    for (const std::string& name : {std::string(), std::string(" "), std::string(300, 'x')}) {
+      EXPECT_FALSE(file->findVariable(name)) << name;
+      EXPECT_FALSE(file->findAttribute(name)) << name;
+    }
+  }
 }
 
 }  // namespace

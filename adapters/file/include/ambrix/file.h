@@ -50,11 +50,11 @@ class AMBRIX_EXPORT File {
                      const FileOptions& options = {});
   File(File&& other) noexcept;
   File& operator=(File&& other) noexcept;
-  /// Closes the file, silently; call `close` to learn whether what was written is on disk. A child
-  /// of the process that opened the file leaves it alone.
+  /// Closes the file, silently; call `close` to learn whether what was written is on disk.
   ~File();
 
-  /// Does nothing when the file is closed already.
+  /// Does nothing when the file is closed already. A child of the process that opened the file only
+  /// forgets it.
   void close();
   /// Deletes the file from disk.
   void remove();
@@ -66,7 +66,7 @@ class AMBRIX_EXPORT File {
   [[nodiscard]] ArrayView id() const noexcept { return id_; }
 
   /// Calls a command with the file as its first argument. After "close" and "delete" the file is
-  /// closed.
+  /// closed. Whether the file was opened for reading is not checked here: see `FileOptions`.
   std::vector<Array> call(std::string_view command, std::span<const ArrayView> arguments);
   std::vector<Array> call(std::string_view command, std::initializer_list<double> arguments = {});
   /// The first result of a command, as a number or as the bytes of a text.
@@ -167,7 +167,9 @@ class AMBRIX_EXPORT File {
   void announce(Step::Kind kind, std::size_t number, std::string_view name = {}) const;
   void setReadOnly();
   std::string readEncoding();
-  std::optional<std::size_t> find(std::string_view command, std::string_view name);
+  /// None when the library fails with one of these statuses.
+  std::optional<std::size_t> find(std::string_view command, std::string_view name,
+                                  std::span<const std::string_view> missing);
   AttributeDescription describeAttribute(std::size_t number, EntryFinder& finder);
   Attribute attributeFor(std::string_view name, bool global);
 
@@ -188,5 +190,7 @@ AMBRIX_EXPORT double constantValue(Module& module, std::string_view name);
 AMBRIX_EXPORT std::optional<Datatype> unsupportedDatatype(const Error& error);
 /// Whether the library has failed, and not an argument.
 AMBRIX_EXPORT bool isLibraryFailure(const Error& error);
+/// The same, with the status of that name ("NO_SUCH_VAR").
+AMBRIX_EXPORT bool isLibraryFailure(const Error& error, std::string_view status);
 
 }  // namespace ambrix

@@ -31,7 +31,9 @@ class AMBRIX_EXPORT FileObserver {
 enum class Access { kRead, kWrite };
 
 struct FileOptions {
-  /// A file opened for reading is quicker, and refuses changes.
+  /// A file opened for reading is quicker, and members of `File` refuse to change it. Commands
+  /// called by `File::call` are refused by the library, but not in a file with more than 2^20
+  /// numbers of entries: the library cannot make that one read-only.
   Access access = Access::kRead;
   FileObserver* observer = nullptr;  // must outlive the file
   /// Where a copy of the file may be, if it takes one to find its entries; empty means the folder
