@@ -1,5 +1,7 @@
 """Differences between a file's content as the module and as another reader sees it."""
 
+from dataclasses import replace
+
 import numpy as np
 
 from readers.content import CHARACTERS, Attribute, Unread, fill_texts, leading_of
@@ -102,6 +104,18 @@ def renumbered(attribute):
     return Attribute(True, dict(enumerate(values)))
 
 
+def without_blanks_of_names(content):
+    """The content with the names of variables and attributes without blanks at their end."""
+    variables = {name.rstrip(): variable for name, variable in content.variables.items()}
+    attributes = {}
+    for name, attribute in content.attributes.items():
+        entries = attribute.entries
+        if not attribute.is_global:
+            entries = {key.rstrip(): entry for key, entry in entries.items()}
+        attributes[name.rstrip()] = replace(attribute, entries=entries)
+    return replace(content, variables=variables, attributes=attributes)
+
+
 def attribute_differences(name, one, other, keeps_entry_numbers, nul_reads_as):
     if one.is_global and not keeps_entry_numbers:
         one = renumbered(one)
@@ -119,6 +133,8 @@ def differences(one, other):
     """Texts that tell what differs; `one` from the module, `other` from an independent reader."""
     if isinstance(other, Unread):
         return [f"file: unread ({other.error!r})"]
+    if not other.keeps_blanks_of_names:
+        one = without_blanks_of_names(one)
     found = []
     if one.row_major != other.row_major:
         found.append("majority")

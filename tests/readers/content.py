@@ -82,6 +82,7 @@ class Attribute:
 class Content:
     row_major: bool
     keeps_entry_numbers: bool = True  # of gEntries, where some were never written
+    keeps_blanks_of_names: bool = True  # at the end
     variables: dict = field(default_factory=dict)
     attributes: dict = field(default_factory=dict)
     # What the reader makes of a text's bytes from the first 0 on.

@@ -4,6 +4,7 @@ import os
 import subprocess
 import unittest
 
+from readers import spacepy_reader
 from readers.case import READERS, ReadersCase, reference, unexplained
 from readers.comparison import differences
 from readers.content import attempt
@@ -31,7 +32,7 @@ class ConvertTest(ReadersCase):
         expected = self.with_declared_pads(original, path)
         if row_major is not None:
             expected.row_major = row_major
-        for reader in READERS:
+        for reader in (*READERS, spacepy_reader):
             found = differences(expected, attempt(reader.read, out))
             rest, _ = unexplained(reader, "converted_" + path.name, found)
             self.assertEqual(rest, [], reader.NAME)

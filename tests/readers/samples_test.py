@@ -1,8 +1,8 @@
-"""Everything in real files, value by value, as cdflib and pycdfpp read it."""
+"""Everything in real files, value by value, as cdflib, pycdfpp and SpacePy read it."""
 
 import unittest
 
-from readers import pycdfpp_reader
+from readers import pycdfpp_reader, spacepy_reader
 from readers.case import READERS, ReadersCase, read_by, unexplained
 from readers.comparison import differences
 from readers.content import CHARACTERS, Content, Variable
@@ -11,17 +11,19 @@ from readers.sample_files import FOLDER, UNREADABLE, distribution_files, folder_
 from readers.sample_files import needs_folder, readable_files
 from support.ambrix_session import CallError, Session
 
+ALL_READERS = (*READERS, spacepy_reader)
+
 
 class SamplesTest(ReadersCase):
     def compare(self, files):
         self.assertTrue(files)
         used = set()
-        compared = {reader.NAME: 0 for reader in READERS}
+        compared = {reader.NAME: 0 for reader in ALL_READERS}
         in_files = 0
         for name, path in files.items():
             mine = self.read_sample_alone(path)
             in_files += len(mine.variables)
-            for reader in READERS:
+            for reader in ALL_READERS:
                 with self.subTest(file=name, reader=reader.NAME):
                     theirs = read_by(reader, path)
                     rest, rows = unexplained(reader, name, differences(mine, theirs))
@@ -31,7 +33,7 @@ class SamplesTest(ReadersCase):
                         read = theirs.variables.values()
                         compared[reader.NAME] += sum(isinstance(one, Variable) for one in read)
         print(f"{len(files)} files, {in_files} variables, compared with", compared)
-        for reader in READERS:
+        for reader in ALL_READERS:
             stale = [row for row in rows_for(reader.NAME, files) if row not in used]
             self.assertEqual(stale, [], "known faults that are none any more")
 
