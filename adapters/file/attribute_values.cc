@@ -35,7 +35,7 @@ Attribute File::attributeFor(std::string_view name, bool global) {
   if (!number) return createAttribute(name, global);
   const Attribute found = attribute(*number);
   if (found.global == global) return found;
-  throw FileError(path_, "wrongScope",
+  throw FileError(path(), "wrongScope",
                   "attribute \"" + std::string(name) + "\" is " +
                       (global ? "one of variables; name the variable" : "a global one") +
                       ", or choose another name");

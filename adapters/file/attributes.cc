@@ -49,7 +49,7 @@ Attribute File::attribute(std::string_view name) {
   const auto nameOf = [this](std::size_t number) {
     return text("getAttrName", {static_cast<double>(number)});
   };
-  throw FileError(path_, "noSuchAttribute",
+  throw FileError(path(), "noSuchAttribute",
                   missing("attribute", name, namesOf(attributeCount(), nameOf)));
 }
 
@@ -108,7 +108,8 @@ void File::forEachEntry(const Attribute& attribute,
     function(*entry);
     --remaining;
   }
-  for (const std::size_t far : farEntries(*this, attribute, number, remaining, options_)) {
+  const ScratchPlace scratch{place_, options_};
+  for (const std::size_t far : farEntries(*this, attribute, number, remaining, scratch)) {
     function(reader.inquire(far));
     --remaining;
   }

@@ -14,23 +14,35 @@ namespace fs = std::filesystem;
 
 constexpr const char* kFarApart = "the file has entries with numbers far apart, and ";
 
+FileError noCopy(const File& file, const std::string& folder, const std::error_code& error) {
+  return {file.path(), "noScratchCopy",
+          std::string(kFarApart) + "no copy can be made in " + folder +
+              " to find them: " + error.message()};
+}
+
+fs::path folderFor(const File& file, const fs::path& wanted) {
+  if (!wanted.empty()) return wanted;
+  std::error_code error;
+  fs::path folder = fs::temp_directory_path(error);
+  if (error) throw noCopy(file, "the folder for temporary files", error);
+  return folder;
+}
+
 /// A copy of a file that may be changed, in a folder that goes with this object.
 class ScratchCopy {
  public:
-  ScratchCopy(const File& file, const fs::path& parent) {
+  ScratchCopy(const File& file, const fs::path& original, const fs::path& parent) {
     std::error_code error;
     std::string folder = (parent / "ambrix-XXXXXX").string();
     if (::mkdtemp(folder.data()) == nullptr) {
       error.assign(errno, std::generic_category());
     } else {
       folder_ = folder;
-      copy(fileOnDisk(file.path()), error);
+      copy(fileOnDisk(original), error);
     }
     if (!error) return;
     discard();
-    throw FileError(file.path(), "noScratchCopy",
-                    std::string(kFarApart) + "no copy can be made in " + parent.string() +
-                        " to find them: " + error.message());
+    throw noCopy(file, parent.string(), error);
   }
   ScratchCopy(const ScratchCopy&) = delete;
   ScratchCopy& operator=(const ScratchCopy&) = delete;
@@ -75,14 +87,15 @@ void discard(File& scratch) {
 }  // namespace
 
 std::vector<std::size_t> farEntries(File& file, const Attribute& attribute, std::size_t first,
-                                    std::size_t count, const FileOptions& options) {
+                                    std::size_t count, const ScratchPlace& place) {
   if (count == 0 || static_cast<std::int64_t>(first) > attribute.maxEntry) return {};
+  const FileOptions& options = place.options;
   if (options.access == Access::kWrite) {
     throw FileError(file.path(), "noScratchCopy",
                     std::string(kFarApart) + "to look for them it must be opened for reading");
   }
-  const fs::path& wanted = options.scratchFolder;
-  const ScratchCopy copy(file, wanted.empty() ? fs::temp_directory_path() : wanted);
+  const fs::path folder = folderFor(file, options.scratchFolder);
+  const ScratchCopy copy(file, place.original, folder);
   File scratch = File::open(file.module(), copy.path(), {Access::kWrite, options.observer});
   std::vector<std::size_t> numbers = deleteEntries(scratch, attribute.number, first, count);
   discard(scratch);

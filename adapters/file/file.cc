@@ -18,6 +18,13 @@ namespace fs = std::filesystem;
 /// How many numbers the library may list in its tables.
 constexpr std::int64_t kNumbersListed = 1 << 20;
 
+/// The working directory may be another one later.
+fs::path absolute(const fs::path& path) {
+  std::error_code error;
+  fs::path place = fs::absolute(path, error);
+  return error ? path : place;
+}
+
 }  // namespace
 
 fs::path fileOnDisk(const fs::path& path) {
@@ -35,13 +42,17 @@ double constantValue(Module& module, std::string_view name) {
 }
 
 File::File(Module& module, std::string_view command, std::string path, const FileOptions& options)
-    : module_(&module), path_(std::move(path)), options_(options), process_(::getpid()) {
+    : module_(&module),
+      path_(std::make_shared<const std::string>(std::move(path))),
+      place_(absolute(*path_)),
+      options_(options),
+      process_(::getpid()) {
   try {
-    id_ = std::move(module.call(command, {Array::fromUtf8(path_)}).at(0));
+    id_ = std::move(module.call(command, {Array::fromUtf8(*path_)}).at(0));
   } catch (const Error& error) {
     fail(error);
   } catch (const std::invalid_argument&) {
-    throw FileError(path_, "badFileName", "the name of the file is not valid UTF-8");
+    throw FileError(*path_, "badFileName", "the name of the file is not valid UTF-8");
   }
 }
 
@@ -72,6 +83,7 @@ void File::setReadOnly() {
 File::File(File&& other) noexcept
     : module_(other.module_),
       path_(other.path_),
+      place_(std::move(other.place_)),
       options_(std::move(other.options_)),
       id_(std::exchange(other.id_, Array())),
       process_(other.process_) {}
@@ -81,6 +93,7 @@ File& File::operator=(File&& other) noexcept {
   const File old(std::move(*this));
   module_ = other.module_;
   path_ = other.path_;
+  place_ = std::move(other.place_);
   options_ = std::move(other.options_);
   id_ = std::exchange(other.id_, Array());
   process_ = other.process_;
@@ -161,12 +174,12 @@ std::vector<Array> File::change(std::string_view command, std::initializer_list<
 }
 
 void File::requireOpen() const {
-  if (!id_) throw FileError(path_, "fileClosed", "the file is closed; open it again");
+  if (!id_) throw FileError(*path_, "fileClosed", "the file is closed; open it again");
 }
 
 void File::requireWritable() const {
   if (options_.access == Access::kWrite) return;
-  throw FileError(path_, "openedForReading",
+  throw FileError(*path_, "openedForReading",
                   "the file was opened for reading; open it with Access::kWrite to change it");
 }
 

@@ -34,13 +34,30 @@ Compression compressionOf(const std::vector<Array>& results) {
   return compression;
 }
 
+[[noreturn]] void throwBadSetting(const File& file, std::string_view given, const char* wanted) {
+  throw FileError(file.path(), "badSetting", '"' + std::string(given) + "\" is no " + wanted);
+}
+
+/// The value of a constant of that kind, which is how its name ends ("_CHECKSUM").
+double settingValue(const File& file, std::string_view name, std::string_view ending,
+                    const char* kind) {
+  const double value = constantValue(file.module(), name);
+  if (!name.ends_with(ending)) throwBadSetting(file, name, kind);
+  return value;
+}
+
+double typeOf(const File& file, const Compression& compression) {
+  return settingValue(file, compression.type, "_COMPRESSION", "type of compression");
+}
+
 /// The parameter as commands take it: only GZIP has one to be chosen.
-std::optional<double> levelOf(const Compression& compression) {
+std::optional<double> levelOf(const File& file, const Compression& compression) {
   const std::string& text = compression.parameter;
   double level = 0;
-  if (compression.type != "GZIP_COMPRESSION") return std::nullopt;
+  if (compression.type != "GZIP_COMPRESSION" || text.empty()) return std::nullopt;
   const auto [end, error] = std::from_chars(text.data(), text.data() + text.size(), level);
-  if (error != std::errc() || end != text.data() + text.size()) return std::nullopt;
+  const bool isNumber = error == std::errc() && end == text.data() + text.size();
+  if (!isNumber) throwBadSetting(file, text, "level of compression");
   return level;
 }
 
@@ -69,20 +86,20 @@ FileFacts File::facts() {
 }
 
 void File::setFormat(std::string_view format) {
-  change("setFormat", {constantValue(*module_, format)});
+  change("setFormat", {settingValue(*this, format, "_FILE", "format of files")});
 }
 
 void File::setMajority(std::string_view majority) {
-  change("setMajority", {constantValue(*module_, majority)});
+  change("setMajority", {settingValue(*this, majority, "_MAJOR", "majority")});
 }
 
 void File::setChecksum(std::string_view checksum) {
-  change("setChecksum", {constantValue(*module_, checksum)});
+  change("setChecksum", {settingValue(*this, checksum, "_CHECKSUM", "checksum")});
 }
 
 void File::setCompression(const Compression& compression) {
-  const double type = constantValue(*module_, compression.type);
-  if (const auto level = levelOf(compression)) {
+  const double type = typeOf(*this, compression);
+  if (const auto level = levelOf(*this, compression)) {
     change("setCompression", {type, *level});
   } else {
     change("setCompression", {type});
@@ -94,8 +111,8 @@ Compression File::compression(const Variable& variable) {
 }
 
 void File::setCompression(const Variable& variable, const Compression& compression) {
-  const double type = constantValue(*module_, compression.type);
-  if (const auto level = levelOf(compression)) {
+  const double type = typeOf(*this, compression);
+  if (const auto level = levelOf(*this, compression)) {
     change("setVarCompression", {numberOf(variable), type, *level});
   } else {
     change("setVarCompression", {numberOf(variable), type});
@@ -107,7 +124,8 @@ std::string File::sparseRecords(const Variable& variable) {
 }
 
 void File::setSparseRecords(const Variable& variable, std::string_view mode) {
-  change("setVarSparseRecords", {numberOf(variable), constantValue(*module_, mode)});
+  change("setVarSparseRecords", {numberOf(variable), settingValue(*this, mode, "_SPARSERECORDS",
+                                                                  "mode of sparse records")});
 }
 
 Array File::padValue(const Variable& variable) {

@@ -10,11 +10,10 @@
 namespace ambrix {
 namespace {
 
-constexpr double kFill = -1e31;
+constexpr double kEpochFill = -1e31;
 constexpr std::int64_t kEpochOf1970 = 62167219200;  // seconds from the year 0 on
 constexpr double kEndOfTime = 315569520000;         // the year 10000
-constexpr double kSpan = 9.2e9;                     // seconds that nanoseconds can hold, about
-constexpr std::int64_t kSecond = 1'000'000'000;     // in nanoseconds
+constexpr double kLargestSpan = 9.3e9;              // seconds: nanoseconds cannot hold as many
 constexpr std::int64_t kMillisecond = 1'000'000;
 constexpr double kPicosecondsPerSecond = 1e12;
 
@@ -30,21 +29,23 @@ std::vector<bool> validEpochs(ArrayView times) {
   return valid;
 }
 
-/// Of times from 1677 to 2262, all of them after the year 0, so that whole numbers are below.
+/// All times that nanoseconds can hold are after the year 0, so that whole numbers are below.
 std::int64_t nanosecondsOfEpoch(double value) {
   const double from1970 = value - static_cast<double>(kEpochOf1970 * 1000);
-  if (!(std::abs(from1970) < kSpan * 1000)) return kNoTime;
+  if (!(std::abs(from1970) < kLargestSpan * 1000)) return kNoTime;
   const auto whole = static_cast<std::int64_t>(value);
   const double fraction = (value - static_cast<double>(whole)) * kMillisecond;
-  return (whole - kEpochOf1970 * 1000) * kMillisecond + static_cast<std::int64_t>(fraction + 0.5);
+  return nanosecondsOf(whole - kEpochOf1970 * 1000, kMillisecond,
+                       static_cast<std::int64_t>(fraction + 0.5));
 }
 
 std::int64_t nanosecondsOfEpoch16(double seconds, double picoseconds) {
   const double from1970 = seconds - static_cast<double>(kEpochOf1970);
-  const bool isTime = std::abs(from1970) < kSpan && isWithin(picoseconds, kPicosecondsPerSecond);
+  const bool isTime =
+      std::abs(from1970) < kLargestSpan && isWithin(picoseconds, kPicosecondsPerSecond);
   if (!isTime) return kNoTime;
   const auto fraction = static_cast<std::int64_t>(picoseconds / 1000 + 0.5);
-  return static_cast<std::int64_t>(from1970) * kSecond + fraction;
+  return nanosecondsOf(static_cast<std::int64_t>(from1970), kSecond, fraction);
 }
 
 std::vector<std::int64_t> nanosecondsOfEpochs(Module* /*module*/, ArrayView times) {
@@ -59,7 +60,8 @@ Array epochsOfNanoseconds(Module& /*module*/, std::span<const std::int64_t> time
   std::ranges::transform(times, array.mutableData<double>().begin(), [](std::int64_t time) {
     const std::int64_t whole = time / kMillisecond;
     const auto fraction = static_cast<double>(time % kMillisecond) / kMillisecond;
-    return time == kNoTime ? kFill : static_cast<double>(whole + kEpochOf1970 * 1000) + fraction;
+    return time == kNoTime ? kEpochFill
+                           : static_cast<double>(whole + kEpochOf1970 * 1000) + fraction;
   });
   return array;
 }
@@ -69,7 +71,7 @@ void addToEpoch(Array& times, std::size_t index, double picoseconds) {
 }
 
 void fillEpoch(Array& times, std::size_t index) {
-  times.mutableData<double>()[index] = kFill;
+  times.mutableData<double>()[index] = kEpochFill;
 }
 
 std::vector<bool> validEpochs16(ArrayView times) {
@@ -90,19 +92,13 @@ std::vector<std::int64_t> nanosecondsOfEpochs16(Module* /*module*/, ArrayView ti
   return nanoseconds;
 }
 
-/// Rounds down, also before 1970.
-std::int64_t secondsOf(std::int64_t time) {
-  return time / kSecond - (time % kSecond < 0 ? 1 : 0);
-}
-
 Array epochs16OfNanoseconds(Module& /*module*/, std::span<const std::int64_t> times) {
   Array array = Array::uninitialized(ClassId::kDouble, {2, times.size()});
   auto value = array.mutableData<double>().begin();
   for (const std::int64_t time : times) {
-    const std::int64_t seconds = secondsOf(time);
-    const auto fraction = static_cast<double>(time - seconds * kSecond);
-    *value++ = time == kNoTime ? kFill : static_cast<double>(seconds + kEpochOf1970);
-    *value++ = time == kNoTime ? kFill : fraction * 1000;
+    const auto [seconds, fraction] = divided(time, kSecond);
+    *value++ = time == kNoTime ? kEpochFill : static_cast<double>(seconds + kEpochOf1970);
+    *value++ = time == kNoTime ? kEpochFill : static_cast<double>(fraction) * 1000;
   }
   return array;
 }
@@ -113,8 +109,8 @@ void addToEpoch16(Array& times, std::size_t index, double picoseconds) {
 
 void fillEpoch16(Array& times, std::size_t index) {
   const std::span<double> values = times.mutableData<double>();
-  values[2 * index] = kFill;
-  values[2 * index + 1] = kFill;
+  values[2 * index] = kEpochFill;
+  values[2 * index + 1] = kEpochFill;
 }
 
 constexpr std::array<TimeKind, 2> kTimeKinds = {{

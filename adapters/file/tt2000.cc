@@ -1,7 +1,6 @@
 // `CDF_TIME_TT2000`: nanoseconds of terrestrial time, leap seconds included. The module knows them.
 #include <algorithm>
 #include <chrono>
-#include <cmath>
 #include <cstdint>
 #include <limits>
 #include <optional>
@@ -15,14 +14,13 @@ namespace ambrix {
 namespace {
 
 constexpr std::size_t kParts = 9;
-constexpr std::int64_t kFill = std::numeric_limits<std::int64_t>::min();
-constexpr std::int64_t kIllegal = kFill + 3;  // and below it, pad and fill value
-constexpr std::int64_t kSecond = 1'000'000'000;
+constexpr std::int64_t kTt2000Fill = std::numeric_limits<std::int64_t>::min();
+constexpr std::int64_t kDay = 86400 * kSecond;
 /// From this time on, in nanoseconds since 2000, all seconds of UTC have been of one length.
 constexpr std::int64_t kFrom1972 = -883655957'816'000'000;
 
 bool isTime(std::int64_t value) {
-  return value > kIllegal;
+  return value > kLargestTt2000Fill;
 }
 
 std::vector<bool> valid(ArrayView times) {
@@ -33,16 +31,14 @@ std::vector<bool> valid(ArrayView times) {
 }
 
 /// Calendar time as nanoseconds since 1970.
-std::int64_t nanosecondsOf(std::span<const double> parts) {
+std::int64_t nanosecondsFrom1970(std::span<const double> parts) {
   const auto part = [&](std::size_t i) { return static_cast<std::int64_t>(parts[i]); };
   const std::chrono::year_month_day date(std::chrono::year(static_cast<int>(part(0))),
                                          std::chrono::month(static_cast<unsigned>(part(1))),
                                          std::chrono::day(static_cast<unsigned>(part(2))));
   const std::int64_t days = std::chrono::sys_days(date).time_since_epoch().count();
   const std::int64_t seconds = ((days * 24 + part(3)) * 60 + part(4)) * 60 + part(5);
-  const double from1970 = static_cast<double>(seconds);
-  if (std::abs(from1970) > 9.2e9) return kNoTime;
-  return seconds * kSecond + (part(6) * 1000 + part(7)) * 1000 + part(8);
+  return nanosecondsOf(seconds, kSecond, (part(6) * 1000 + part(7)) * 1000 + part(8));
 }
 
 std::vector<std::int64_t> brokenDown(Module& module, ArrayView times) {
@@ -52,7 +48,7 @@ std::vector<std::int64_t> brokenDown(Module& module, ArrayView times) {
   nanoseconds.reserve(times.elementCount());
   for (const std::int64_t value : times.data<std::int64_t>()) {
     const auto own = parts.subspan(kParts * nanoseconds.size(), kParts);
-    nanoseconds.push_back(isTime(value) ? nanosecondsOf(own) : kNoTime);
+    nanoseconds.push_back(isTime(value) ? nanosecondsFrom1970(own) : kNoTime);
   }
   return nanoseconds;
 }
@@ -60,7 +56,7 @@ std::vector<std::int64_t> brokenDown(Module& module, ArrayView times) {
 /// What is to be added to all these times, if it is the same: no leap second is among them.
 std::optional<std::int64_t> commonOffset(Module& module, std::span<const std::int64_t> values) {
   std::int64_t first = std::numeric_limits<std::int64_t>::max();
-  std::int64_t last = kFill;
+  std::int64_t last = kTt2000Fill;
   for (const std::int64_t value : values) {
     if (!isTime(value)) continue;
     first = std::min(first, value);
@@ -86,13 +82,9 @@ std::vector<std::int64_t> nanoseconds(Module* module, ArrayView times) {
 }
 
 void splitTime(std::int64_t time, std::span<double> parts) {
-  using std::chrono::days;
-  using std::chrono::floor;
-  using std::chrono::sys_time;
-  const sys_time<std::chrono::nanoseconds> point{std::chrono::nanoseconds(time)};
-  const auto day = floor<days>(point);
-  const std::chrono::year_month_day date(day);
-  const std::chrono::hh_mm_ss clock(point - day);
+  const auto [day, sinceMidnight] = divided(time, kDay);
+  const std::chrono::year_month_day date{std::chrono::sys_days(std::chrono::days(day))};
+  const std::chrono::hh_mm_ss clock{std::chrono::nanoseconds(sinceMidnight)};
   const std::int64_t fraction = clock.subseconds().count();
   const double split[] = {static_cast<double>(static_cast<int>(date.year())),
                           static_cast<double>(static_cast<unsigned>(date.month())),
@@ -107,7 +99,7 @@ void splitTime(std::int64_t time, std::span<double> parts) {
 }
 
 void fill(Array& times, std::size_t index) {
-  times.mutableData<std::int64_t>()[index] = kFill;
+  times.mutableData<std::int64_t>()[index] = kTt2000Fill;
 }
 
 Array ofNanoseconds(Module& module, std::span<const std::int64_t> times) {

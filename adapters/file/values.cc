@@ -48,7 +48,7 @@ Slab within(const Slab& slab, Slab part) {
 
 void File::requireSupported(const Variable& variable) const {
   if (variable.supported && findDatatype(variable.datatype) != nullptr) return;
-  throw FileError(path_, "unsupportedDatatype",
+  throw FileError(path(), "unsupportedDatatype",
                   "variable \"" + variable.name + "\" has the datatype " +
                       datatypeName(variable.datatype) + ", which is not supported");
 }
@@ -83,7 +83,7 @@ void File::readInto(const Variable& variable, const Slab& slab, std::span<std::b
 }
 
 FileError File::wrongSize() const {
-  return {path_, "wrongSize", "the memory for values is of another size than the values"};
+  return {path(), "wrongSize", "the memory for values is of another size than the values"};
 }
 
 void File::write(const Variable& variable, ArrayView values, std::size_t firstRecord) {
@@ -93,7 +93,7 @@ void File::write(const Variable& variable, ArrayView values, std::size_t firstRe
   const std::size_t elements = variable.recordElements();
   const std::size_t records = elements == 0 ? 0 : values.elementCount() / elements;
   if (records * elements != values.elementCount()) {
-    throw FileError(path_, "partOfRecord",
+    throw FileError(path(), "partOfRecord",
                     std::to_string(values.elementCount()) + " elements for variable \"" +
                         variable.name + "\", whose records have " + std::to_string(elements));
   }

@@ -106,7 +106,7 @@ Variable File::variable(std::string_view name) {
   const auto nameOf = [this](std::size_t number) {
     return text("getVarName", {static_cast<double>(number)});
   };
-  throw FileError(path_, "noSuchVariable",
+  throw FileError(path(), "noSuchVariable",
                   missing("variable", name, namesOf(variableCount(), nameOf)));
 }
 

@@ -1,6 +1,7 @@
 // Attributes, their entries, and the description of a whole file.
 #include <dlfcn.h>
 
+#include <cstdlib>
 #include <optional>
 #include <stdexcept>
 
@@ -117,6 +118,23 @@ TEST_F(FileAttributesTest, FindsEntriesWhoseNumbersLieFarApart) {
   EXPECT_THAT(errorOf([&] { read.entries(title); }),
               testing::StartsWith("ambrix:noScratchCopy: new: the file has entries with numbers "
                                   "far apart, and no copy can be made in scratch"));
+}
+
+TEST_F(FileAttributesTest, FindsThemWhereverTheProgramHasGone) {
+  File file = open("new", Access::kWrite);
+  file.setAttribute("Title", "x", 1200000);
+  file.close();
+  File read = open();
+  std::filesystem::create_directory("elsewhere");
+  std::filesystem::current_path("elsewhere");
+  EXPECT_EQ(read.entries(read.attribute("Title")).size(), 1);
+  std::filesystem::current_path("..");
+  const char* const before = std::getenv("TMPDIR");
+  const std::string kept = before == nullptr ? "/tmp" : before;
+  ::setenv("TMPDIR", "absent", 1);
+  EXPECT_THAT(errorOf([&] { read.entries(read.attribute("Title")); }),
+              testing::StartsWith("ambrix:noScratchCopy: new: "));
+  ::setenv("TMPDIR", kept.c_str(), 1);
 }
 
 TEST_F(FileAttributesTest, DescribesAWholeFile) {

@@ -79,6 +79,31 @@ TEST_F(FileTimesTest, CountsNanosecondsFrom1970) {
                std::invalid_argument);
 }
 
+TEST_F(FileTimesTest, ReachesAsFarAsNanosecondsDo) {
+  constexpr double kLast = 9223372036;  // whole seconds
+  EXPECT_THAT(
+      timesAsNanoseconds(Array::row({(k1970 + kLast) * 1000 + 854, (k1970 + kLast) * 1000 + 855,
+                                     (k1970 - kLast) * 1000 - 854, (k1970 - kLast) * 1000 - 855}),
+                         Datatype::kEpoch),
+      ElementsAre(9223372036854000000, kNoTime, -9223372036854000000, kNoTime));
+  EXPECT_THAT(timesAsNanoseconds(Array::row({k1970 + kLast, 854775807000.0, k1970 + kLast,
+                                             854775808000.0, k1970 - kLast - 1, 145224193000.0,
+                                             k1970 - kLast - 1, 145224191000.0}),
+                                 Datatype::kEpoch16),
+              ElementsAre(INT64_MAX, kNoTime, -INT64_MAX, kNoTime));
+  const std::vector<std::int64_t> ends = {INT64_MAX, -INT64_MAX};
+  const Array epochs16 = timesFromNanoseconds(module, ends, Datatype::kEpoch16);
+  EXPECT_EQ(timesAsNanoseconds(module, epochs16, Datatype::kEpoch16), ends);
+  const LeaksIgnored libraryTable;  // of leap seconds
+  EXPECT_EQ(errorOf([&] {
+              timesFromNanoseconds(module, std::vector<std::int64_t>{-INT64_MAX},
+                                   Datatype::kTimeTt2000);
+            }),
+            cdflib("illegalEpochValue"));
+  const Array late = of({"2262-04-11T23:47:16.854775807"}, Datatype::kTimeTt2000);
+  EXPECT_THAT(timesAsNanoseconds(module, late, Datatype::kTimeTt2000), ElementsAre(INT64_MAX));
+}
+
 TEST_F(FileTimesTest, MakesTimesOfNanoseconds) {
   const std::vector<std::int64_t> times = {0, kDays * 86400 * kSecond + 1500000, -500000, kNoTime};
   const Array epochs = timesFromNanoseconds(module, times, Datatype::kEpoch);

@@ -118,7 +118,13 @@ TEST_F(FileWritingTest, CompressesWholeFiles) {
   EXPECT_EQ(errorOf([&] {
               other.setCompression({"GZIP_COMPRESSION", "much"});
             }),
+            "ambrix:badSetting: other: \"much\" is no level of compression");
+  EXPECT_EQ(errorOf([&] { other.setCompression({"GZIP_COMPRESSION"}); }),
             "TOLVEX:ambrix:cdflib:unspecifiedGzipCompressionLevel()");
+  EXPECT_EQ(errorOf([&] { other.setChecksum("ROW_MAJOR"); }),
+            "ambrix:badSetting: other: \"ROW_MAJOR\" is no checksum");
+  EXPECT_EQ(errorOf([&] { other.setMajority("CDF_INT1"); }),
+            "ambrix:badSetting: other: \"CDF_INT1\" is no majority");
   other.setCompression({"HUFF_COMPRESSION"});
   EXPECT_EQ(other.facts().compression.parameter, "OPTIMAL_ENCODING_TREES");
 }

@@ -11,8 +11,6 @@ EPOCH, EPOCH16, TT2000 = 31, 32, 33
 
 # Leap seconds have been introduced at the beginnings of months, since 1972.
 _FIRST_YEAR, _LAST_YEAR = 1972, 2261
-_NO_TIME = np.iinfo(np.int64).min
-_LARGEST_FILL = _NO_TIME + 3  # fill and pad values lie below
 
 
 def to_datetime64(raw: npt.NDArray[Any], datatype: int) -> npt.NDArray[np.datetime64]:
@@ -31,7 +29,7 @@ def to_datetime64(raw: npt.NDArray[Any], datatype: int) -> npt.NDArray[np.dateti
 def _of_tt2000(values: npt.NDArray[np.int64]) -> npt.NDArray[np.int64]:
     begins, offsets = _leap_seconds()
     times = _core.tt2000_to_nanoseconds(values, begins, offsets)
-    early = np.flatnonzero((values < begins[0]) & (values > _LARGEST_FILL))
+    early = np.flatnonzero((values < begins[0]) & (values > _core.LARGEST_TT2000_FILL))
     if early.size:  # when UTC drifted
         times[early] = _nanoseconds(_core.tt2000_breakdown(values[early]))
     return times

@@ -5,16 +5,12 @@
 #include <variant>
 
 #include "ambrix/file_error.h"
+#include "src/numpy.h"
 
 namespace nb = nanobind;
 
 namespace ambrix::python {
 namespace {
-
-nb::object orThrow(PyObject* made) {
-  if (made == nullptr) throw nb::python_error();
-  return nb::steal(made);
-}
 
 struct ToPython {
   nb::object operator()(std::int64_t number) const { return nb::int_(number); }
@@ -65,6 +61,8 @@ void setErrorOf(const std::exception_ptr& failure) {
     PyErr_NoMemory();
   } catch (const std::exception& error) {
     PyErr_SetString(PyExc_RuntimeError, error.what());
+  } catch (...) {
+    PyErr_SetString(PyExc_RuntimeError, "an exception of an unknown type");
   }
 }
 

@@ -1,11 +1,11 @@
 #include "src/results.h"
 
-#include <algorithm>
 #include <cstring>
 #include <memory>
 #include <string>
 #include <vector>
 
+#include "ambrix/texts.h"
 #include "src/messages.h"
 #include "src/numpy.h"
 
@@ -17,14 +17,6 @@ namespace {
 using Shape = std::vector<npy_intp>;
 
 constexpr std::size_t kFewBytes = 256;  // which are copied sooner than kept
-
-/// Bytes of the units, which are bytes of the library each.
-std::string narrow(ArrayView text) {
-  std::string bytes;
-  std::ranges::transform(text.chars(), std::back_inserter(bytes),
-                         [](char16_t unit) { return static_cast<char>(unit); });
-  return bytes;
-}
 
 void freeElements(PyObject* capsule) {
   delete static_cast<OwnedElements*>(PyCapsule_GetPointer(capsule, nullptr));
@@ -87,12 +79,12 @@ nb::object withoutTrailing(Array&& result) {
   while (!shape.empty() && shape.back() == 1)
     shape.pop_back();
   const bool isChar = result.classId() == ClassId::kChar;
-  if (isChar && shape.size() <= 1) return textOf(narrow(result));
+  if (isChar && shape.size() <= 1) return textOf(bytesOf(result));
   return inShape(std::move(result), shape);
 }
 
 nb::object row(Array&& result) {
-  if (result.classId() == ClassId::kChar) return textOf(narrow(result));
+  if (result.classId() == ClassId::kChar) return textOf(bytesOf(result));
   Shape shape = sizesOf(result);
   if (shape.front() == 1) shape.erase(shape.begin());
   return inShape(std::move(result), shape);
@@ -106,7 +98,7 @@ nb::object block(Array&& result, std::size_t dimensions) {
 }
 
 nb::object number(double value) {
-  return nb::steal(PyLong_FromDouble(value));
+  return orThrow(PyLong_FromDouble(value));
 }
 
 template <typename T>
@@ -119,14 +111,14 @@ nb::object tupleOf(ArrayView result, nb::object (*convert)(T)) {
 
 nb::object parameter(ArrayView result) {
   if (result.elementCount() == 0) return nb::none();
-  if (result.classId() == ClassId::kChar) return textOf(narrow(result));
+  if (result.classId() == ClassId::kChar) return textOf(bytesOf(result));
   return number(result.data<double>().front());
 }
 
 nb::object listOfTexts(ArrayView cells) {
   nb::list items;
   for (std::size_t i = 0; i < cells.elementCount(); ++i)
-    items.append(textOf(narrow(cells.element(i))));
+    items.append(textOf(bytesOf(cells.element(i))));
   return items;
 }
 
@@ -143,7 +135,7 @@ nb::object convertResult(ResultKind kind, Array&& result, std::size_t dimensions
     case ResultKind::kNumber:
       return number(result.data<double>().front());
     case ResultKind::kText:
-      return textOf(narrow(result));
+      return textOf(bytesOf(result));
     case ResultKind::kTexts:
       return listOfTexts(result);
     case ResultKind::kFlag:

@@ -115,6 +115,7 @@ nb::object tt2000Breakdown(nb::handle values) {
 }  // namespace
 
 void bindTimes(nb::module_& module) {
+  module.attr("LARGEST_TT2000_FILL") = kLargestTt2000Fill;
   module.def("epochs_to_nanoseconds", epochsToNanoseconds, nb::arg("array"), nb::arg("datatype"));
   module.def("compute_tt2000", computeTt2000, nb::arg("components"));
   module.def("tt2000_breakdown", tt2000Breakdown, nb::arg("values"));

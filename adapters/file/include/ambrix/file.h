@@ -14,6 +14,7 @@
 #include <filesystem>
 #include <functional>
 #include <initializer_list>
+#include <memory>
 #include <optional>
 #include <span>
 #include <string>
@@ -61,7 +62,7 @@ class AMBRIX_EXPORT File {
   [[nodiscard]] bool isOpen() const noexcept { return static_cast<bool>(id_); }
   [[nodiscard]] Module& module() const noexcept { return *module_; }
   /// The name by which it was opened or created.
-  [[nodiscard]] const std::string& path() const noexcept { return path_; }
+  [[nodiscard]] const std::string& path() const noexcept { return *path_; }
   /// The file as an argument of commands; none when it is closed.
   [[nodiscard]] ArrayView id() const noexcept { return id_; }
 
@@ -174,7 +175,8 @@ class AMBRIX_EXPORT File {
   Attribute attributeFor(std::string_view name, bool global);
 
   Module* module_;
-  std::string path_;
+  std::shared_ptr<const std::string> path_;  // shared with the file that this one was moved to
+  std::filesystem::path place_;              // the same, absolute
   FileOptions options_;
   Array id_;
   int process_;

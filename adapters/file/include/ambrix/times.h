@@ -18,6 +18,10 @@ namespace ambrix {
 /// 1970 cannot hold: they reach from 1677 to 2262. It is NumPy's "not a time".
 inline constexpr std::int64_t kNoTime = std::numeric_limits<std::int64_t>::min();
 
+/// Values of `CDF_TIME_TT2000` up to this one are no times, but fill values, pad values and the
+/// like.
+inline constexpr std::int64_t kLargestTt2000Fill = std::numeric_limits<std::int64_t>::min() + 3;
+
 /// The times in an array of a datatype as ISO 8601, such as "2004-05-13T15:08:11.022": in
 /// milliseconds, those of `CDF_TIME_TT2000` in nanoseconds, and those of `CDF_EPOCH16` in
 /// picoseconds. The text is empty where the value is no time of the years 0 to 9999, as fill

@@ -78,6 +78,14 @@ def test_times_of_all_years_are_what_the_library_says():
     assert np.array_equal(to_datetime64(_core.compute_tt2000(parts), TT2000), expected)
 
 
+def test_times_end_where_nanoseconds_do():
+    values = tt2000(2262, 4, 11, 23, 47, 16, 854, 775, 807) + np.arange(2)
+    times = to_datetime64(values, TT2000)
+    assert times.astype(np.int64)[0] == np.iinfo(np.int64).max and np.isnat(times[1])
+    epochs = commands.computeEpoch(np.array([[2262, 4, 11, 23, 47, 16, 854]], float).T) + [0, 1]
+    assert np.isnat(to_datetime64(epochs, EPOCH)).tolist() == [False, True]
+
+
 def test_times_when_utc_drifted_are_what_the_library_says():
     rng = np.random.default_rng(1)
     values = np.sort(rng.integers(tt2000(1958, 1, 1), tt2000(1973, 1, 1), 300))
