@@ -82,22 +82,6 @@ TEST_F(FileAttributesTest, AnAttributeOfTheOtherScopeIsRefused) {
       "choose another name");
 }
 
-TEST_F(FileAttributesTest, TellsDamagedEntriesFromMissingOnes) {
-  File file = open("new", Access::kWrite);
-  const Variable a = file.variable("a");
-  file.setAttribute(a, "UNITS", "nT");
-  file.setAttribute(a, "FILLVAL", Datatype::kReal4, Array::scalar(-0.5F));
-  file.close();
-  changeBeforeName("new.cdf", "UNITS", kEntriesToName, kFarPlace);
-  changeBeforeName("new.cdf", "FILLVAL", kMaxEntryToName, "\xFF\xFF\xFF\xF0");
-  setValidationOff();
-  file = open("new", Access::kWrite);
-  EXPECT_EQ(file.attribute("FILLVAL").maxEntry, -1);
-  EXPECT_THAT(file.describeAttribute(file.attribute("FILLVAL").number).entries, IsEmpty());
-  EXPECT_THAT(errorOf([&] { file.attributeValue(a, "UNITS"); }),
-              testing::HasSubstr("libraryFailure"));
-}
-
 TEST_F(FileAttributesTest, FindsEntriesWhoseNumbersLieFarApart) {
   File file = open("new", Access::kWrite);
   for (const std::size_t number : {0UL, 7UL, 20000UL, 1200000UL})

@@ -93,28 +93,6 @@ TEST_F(FileLifetimeTest, RefusesValuesThatDoNotFit) {
   EXPECT_EQ(errorOf([&] { file.readInto(variable_, slab, memory); }), refusal);
 }
 
-TEST_F(FileLifetimeTest, TellsOfDatatypesThatAreNotKnown) {
-  changeBeforeName("new.cdf", "Flux", kDatatypeToName, std::string("\0\0\0\x63", 4));
-  EXPECT_EQ(errorOf([&] { open(); }), "TOLVEX:ambrix:cdflib:fileOpenError()");
-  setValidationOff();
-  File file = open();
-  const auto description = file.describe();
-  const Variable& found = description.variables.at(0).definition;
-  EXPECT_FALSE(found.supported);
-  EXPECT_EQ(found.name, "Flux");
-  EXPECT_EQ(found.datatype, Datatype{99});
-  EXPECT_FALSE(description.variables.at(0).padValue);
-  EXPECT_EQ(errorOf([&] { file.read(found); }),
-            "ambrix:unsupportedDatatype: new: variable \"Flux\" has the datatype datatype 99, "
-            "which is not supported");
-  file = open("new", Access::kWrite);
-  EXPECT_THAT(errorOf([&] { file.write(found, Slab(), rowOf<double>({1})); }),
-              testing::StartsWith("ambrix:unsupportedDatatype"));
-  const Variable unknown = {.name = "Flux", .datatype = Datatype{99}};
-  EXPECT_THAT(errorOf([&] { file.read(unknown, Slab()); }),
-              testing::StartsWith("ambrix:unsupportedDatatype"));
-}
-
 TEST_F(FileLifetimeTest, HasExtendedDatatypesWhereCommandsAreStrict) {
   File file = create("other");
   const Variable time = file.createVariable({.name = "Epoch", .datatype = Datatype::kTimeTt2000});
@@ -242,17 +220,6 @@ TEST_F(FileLifetimeTest, ClosesSilentlyWhateverItsObserverThrows) {
     module.call("close", {file.id()});
   }
   EXPECT_EQ(open().variableCount(), 1);
-}
-
-/// The place of the next variable becomes one behind the end of the file.
-TEST_F(FileLifetimeTest, TellsADamagedFileFromOneWithoutTheName) {
-  File file = open("new", Access::kWrite);
-  file.createVariable({.name = "Next", .datatype = Datatype::kInt4});
-  file.close();
-  changeBeforeName("new.cdf", "Flux", kNextToName, kFarPlace);
-  setValidationOff();
-  file = open("new", Access::kWrite);
-  EXPECT_THAT(errorOf([&] { file.variable("Next"); }), testing::HasSubstr("libraryFailure"));
 }
 
 TEST_F(FileLifetimeTest, FindsNoNamesThatThereCannotBe) {
