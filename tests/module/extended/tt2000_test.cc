@@ -6,6 +6,7 @@
 #include <cstdint>
 #include <random>
 
+#include "tests/module/support/leak_check.h"
 #include "tests/module/support/module_test.h"
 
 namespace ambrix_test {
@@ -34,6 +35,9 @@ class Tt2000Test : public ModuleTest {
     std::ranges::copy(columns.data<double>(), found.begin());
     return found;
   }
+
+ private:
+  LeaksIgnored libraryTable_;  // of leap seconds, which the library makes once and never frees
 };
 
 std::string shownTime(std::int64_t value) {
